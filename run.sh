@@ -1,0 +1,89 @@
+#!/bin/bash
+# SPDX-License-Identifier: GPL-3.0-or-later
+set -eu
+
+cd "$(dirname "${BASH_SOURCE[0]}")"
+. scripts/packages.sh
+
+program=build/release/app/orv-admin-dhcp
+title="Configure DHCP server"
+
+usage() {
+    cat <<END
+Usage: ./run.sh [OPTION]
+
+Builds the program and starts it. What the build lacks is installed first, on Debian and Ubuntu.
+
+  (no option)         on a demonstration site of its own, as any user; nothing of this machine is touched
+  --system            as the superuser, on the DHCP server of this machine
+  --screenshot FILE   on the demonstration site without a display; saves a PNG picture of the window and ends
+  -h, --help          this text
+END
+}
+
+refuse() {
+    printf 'run.sh: %s\n\n' "$1" >&2
+    usage >&2
+    exit 2
+}
+
+mode=demo
+case ${1:-} in
+"") ;;
+--system) mode=system ;;
+--screenshot)
+    mode=screenshot
+    [ $# -ge 2 ] || refuse "--screenshot needs the name of a file"
+    picture=$(cd "$OLDPWD" && realpath -- "$2")
+    shift
+    ;;
+-h | --help)
+    usage
+    exit
+    ;;
+*) refuse "unknown option $1" ;;
+esac
+[ $# -le 1 ] || refuse "unexpected argument $2"
+
+if [ "$mode" != screenshot ] && [ -z "${DISPLAY:-}${WAYLAND_DISPLAY:-}" ]; then
+    echo "run.sh: the window needs a display, and neither DISPLAY nor WAYLAND_DISPLAY is set." >&2
+    echo "run.sh: without one, ./run.sh --screenshot FILE saves a picture of the window." >&2
+    exit 1
+fi
+
+if [ "$mode" = screenshot ]; then
+    require_packages build run screenshot
+else
+    require_packages build run
+fi
+scripts/build release
+
+# The display, its key and the language, which sudo and pkexec drop.
+session_variables() {
+    local name
+    export XAUTHORITY="${XAUTHORITY:-$HOME/.Xauthority}"
+    for name in DISPLAY XAUTHORITY LANG LANGUAGE LC_ALL; do
+        [ -z "${!name:-}" ] || echo "$name=${!name}"
+    done
+}
+
+case $mode in
+demo)
+    exec scripts/demo-namespace "$program"
+    ;;
+screenshot)
+    scripts/screenshot "$picture" "$title" scripts/demo-namespace "$program"
+    ;;
+system)
+    mapfile -t session < <(session_variables)
+    if [ "$(id -u)" -eq 0 ]; then
+        exec "$program"
+    elif command -v sudo >/dev/null; then
+        exec sudo env "${session[@]}" "$PWD/$program"
+    elif command -v pkexec >/dev/null; then
+        exec pkexec env "${session[@]}" "$PWD/$program"
+    fi
+    echo "run.sh: neither sudo nor pkexec is installed; run ./run.sh --system as root." >&2
+    exit 1
+    ;;
+esac

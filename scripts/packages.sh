@@ -1,0 +1,47 @@
+# SPDX-License-Identifier: GPL-3.0-or-later
+# shellcheck shell=bash
+# The one list of Debian packages that the scripts need, by purpose, and how a missing one is installed. To be sourced.
+# None of them starts a service; programs whose packages would are fetched by scripts/fetch-tools instead.
+
+declare -A packages=(
+    [build]="cmake g++ ninja-build qtbase5-dev qttools5-dev qttools5-dev-tools"
+    [run]="breeze-icon-theme fonts-dejavu-core libqt5svg5 mount qttranslations5-l10n util-linux"
+    [screenshot]="maim xauth xdotool xvfb"
+    [test]="dpkg iproute2 procps"
+    [bench]="libbenchmark-dev python3"
+    [lint]="clang-format clang-tidy clazy git shellcheck"
+)
+
+# as_root COMMAND-LINE: has a shell of the superuser's run it, or prints it for somebody who can and fails.
+as_root() {
+    if [ "$(id -u)" -eq 0 ]; then
+        sh -c "$1"
+    elif command -v sudo >/dev/null; then
+        sudo sh -c "$1"
+    else
+        printf 'This needs the superuser, and there is no sudo. Run as root:\n    %s\n' "$1" >&2
+        return 1
+    fi
+}
+
+# missing_packages GROUP...: the packages of the groups that are not installed.
+missing_packages() {
+    local group package
+    for group; do
+        for package in ${packages[$group]}; do
+            [ "$(dpkg-query --show --showformat='${db:Status-Status}' "$package" 2>/dev/null)" = installed ] ||
+                echo "$package"
+        done
+    done
+}
+
+# require_packages GROUP...: installs what is missing of the groups; asks for no rights when nothing is.
+require_packages() {
+    local missing
+    mapfile -t missing < <(missing_packages "$@")
+    [ "${#missing[@]}" -gt 0 ] || return 0
+
+    echo "Installing for this ($*): ${missing[*]}"
+    as_root "apt-get update && DEBIAN_FRONTEND=noninteractive \
+apt-get install -y --no-install-recommends ${missing[*]}"
+}
