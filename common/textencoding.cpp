@@ -7,6 +7,7 @@
 #include <array>
 #include <cstdint>
 #include <cstring>
+#include <numeric>
 
 #include <langinfo.h>
 
@@ -86,14 +87,19 @@ bool isUtf8(const QByteArray &text)
     return true;
 }
 
-// The locale's codec, null for UTF-8 and for ASCII, of which UTF-8 is the larger.
+// The locale's codec, null for UTF-8 and for ASCII, of which UTF-8 is the larger. Null, too, for the few that give the
+// bytes of ASCII another meaning (ICU's Shift_JIS turns control characters around): statements are made of them.
 QTextCodec *localeCodec()
 {
     QTextCodec *codec{QTextCodec::codecForLocale()};
     // Debian's ICU takes every locale for a UTF-8 one; the C library knows.
     if (codec && codec->mibEnum() == utf8Mib)
         codec = QTextCodec::codecForName(nl_langinfo(CODESET));
-    return codec && codec->mibEnum() != utf8Mib && codec->mibEnum() != asciiMib ? codec : nullptr;
+    if (!codec || codec->mibEnum() == utf8Mib || codec->mibEnum() == asciiMib)
+        return nullptr;
+    QByteArray ascii{0x80, '\0'};
+    std::iota(ascii.begin(), ascii.end(), '\0');
+    return codec->toUnicode(ascii) == QString::fromLatin1(ascii.constData(), ascii.size()) ? codec : nullptr;
 }
 
 // A byte order mark is text like any other: it is neither taken away nor added.
