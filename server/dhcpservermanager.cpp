@@ -1,0 +1,121 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "server/dhcpservermanager.h"
+
+DhcpServerManager::DhcpServerManager(QObject *parent)
+    : QObject{parent}
+    , m_process{new QProcess{this}}
+{
+    qRegisterMetaType<DhcpServerManager::ServerStates>("DhcpServerManager::ServerStates");
+    connect(this, &DhcpServerManager::interfacesChanged, this, &DhcpServerManager::writeDHCPServerConfig);
+    updateInterfaces();
+}
+
+DhcpServerManager::~DhcpServerManager() = default;
+
+QString DhcpServerManager::serverStateText() const { return stateText(m_state); }
+
+QString DhcpServerManager::stateText(ServerStates state)
+{
+    switch (state) {
+    case Updating:
+        return QObject::tr("Updating DHCP-server status...");
+    case Running:
+        return QObject::tr("DHCP-server is running");
+    case Stopped:
+        return QObject::tr("DHCP-server is stopped");
+    }
+    return {};
+}
+
+bool DhcpServerManager::isServerRunning() const { return m_state == Running; }
+
+void DhcpServerManager::runServer()
+{
+    operate(QStringLiteral("start"), Running, [this] { emit information(QObject::tr("DHCP-server already running")); });
+}
+
+void DhcpServerManager::stopServer()
+{
+    operate(QStringLiteral("stop"), Stopped, [this] { emit information(QObject::tr("DHCP-server already stopped")); });
+}
+
+void DhcpServerManager::restartServer()
+{
+    operate(QStringLiteral("restart"), Stopped, [this] { runServer(); });
+}
+
+void DhcpServerManager::checkRunning()
+{
+    if (m_process->state() != QProcess::NotRunning)
+        return;
+    // The end of the query is not the end of an operation.
+    disconnect(m_process, nullptr, this, nullptr);
+    startCommand(QStringLiteral("status"));
+    m_process->waitForFinished(-1);
+
+    if (m_process->exitStatus() != QProcess::NormalExit) {
+        emit error(QObject::tr("Checking DHCP-server status failed\n%1")
+                       .arg(QString::fromUtf8(m_process->readAllStandardError())));
+        return;
+    }
+    // The exit code is deliberately not looked at: it is not 0 for a stopped service either.
+    const QString status = QString::fromUtf8(m_process->readAllStandardOutput());
+    if (status.contains(QLatin1String("Active: inactive (dead)")) || status.contains(QLatin1String("Active: failed")))
+        setState(Stopped);
+    // Deliberately no "else": of a text that has both, running is what counts.
+    if (status.contains(QLatin1String("Active: active (running)")))
+        setState(Running);
+}
+
+void DhcpServerManager::handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus)
+{
+    if (exitCode != 0 || exitStatus == QProcess::CrashExit)
+        reportFailedOperation(QString::fromUtf8(m_process->readAllStandardError()));
+    checkRunning();
+}
+
+void DhcpServerManager::setState(ServerStates state)
+{
+    m_state = state;
+    emit serverStateChanged(m_state);
+}
+
+void DhcpServerManager::startCommand(const QString &verb)
+{
+    m_process->start(QStringLiteral("systemctl"), {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
+}
+
+// Sends the service the command `verb`, unless the service turns out to be in the state `exceptIn`: then does
+// `instead`.
+void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead)
+{
+    if (m_state == Updating) {
+        emit error(QObject::tr("Some operation with DHCP-server already executes"));
+        return;
+    }
+    checkRunning();
+    if (m_state == exceptIn) {
+        instead();
+        return;
+    }
+    setState(Updating);
+    connect(m_process, qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this,
+            &DhcpServerManager::handleProcessFinished);
+    // Queued: a process that could not be started is cleaned up only after its signal, and cannot be used before.
+    connect(m_process, &QProcess::errorOccurred, this, &DhcpServerManager::handleProcessError, Qt::QueuedConnection);
+    startCommand(verb);
+}
+
+void DhcpServerManager::handleProcessError(QProcess::ProcessError processError)
+{
+    // Every other error is followed by the end of the process, which is reported then.
+    if (processError != QProcess::FailedToStart)
+        return;
+    reportFailedOperation(m_process->errorString());
+    checkRunning();
+}
+
+void DhcpServerManager::reportFailedOperation(const QString &detail)
+{
+    emit error(QObject::tr("Operation with DHCP-server failed\n%1").arg(detail));
+}

@@ -1,0 +1,99 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "common/paths.h"
+#include "common/textencoding.h"
+
+#include <QMap>
+#include <QObject>
+#include <QProcess>
+#include <QString>
+#include <QStringList>
+
+#include <functional>
+
+/// The DHCP server as a service of this machine: its state, starting and stopping it, and the interfaces it serves.
+///
+/// The service is driven through `systemctl`, one command at a time: while the state is `Updating` every further
+/// operation is refused. What the user must know leaves through error() and information().
+class DhcpServerManager final : public QObject
+{
+    Q_OBJECT
+    Q_DISABLE_COPY_MOVE(DhcpServerManager)
+
+public:
+    enum ServerStates : qint32
+    {
+        Updating = 0, ///< an operation is under way, or the last query could not be interpreted
+        Running = 1,
+        Stopped = 2,
+    };
+    Q_ENUM(ServerStates)
+
+    /// Collects the interfaces and reads the defaults file, but asks nothing about the service: until the first
+    /// checkRunning() its state is `Updating`.
+    explicit DhcpServerManager(QObject *parent = nullptr);
+    /// A `systemctl` under way is killed and nothing more is reported; what it has already asked of the service manager
+    /// goes on.
+    ~DhcpServerManager() override;
+
+    /// The state in words for the user.
+    QString serverStateText() const;
+    /// The words for `state`; the empty text for a value that is no state.
+    static QString stateText(ServerStates state);
+    bool isServerRunning() const;
+
+    /// Collects the system's interfaces and reads the defaults file again; an unsaved choice is lost.
+    void updateInterfaces();
+    /// Fills the map with the system's interfaces that have an IPv4 address, without loopback, none of them served.
+    /// When the system does not tell, the map stays empty.
+    void collectSystemInterfaces();
+    /// Reads the lines of the defaults file at `path` and marks the interfaces that it names as served; reports an
+    /// error() when it cannot be read.
+    void readInterfacesFile(const QString &path);
+    /// Interface names, each with whether it is served.
+    const QMap<QString, bool> &interfaces() const;
+    /// Takes the choice over and writes the defaults file. An empty map or an equal one changes nothing.
+    void setInterfaces(const QMap<QString, bool> &interfaces);
+
+signals:
+    /// An operation was not needed.
+    void information(const QString &message);
+    /// An operation was refused or failed, or a file could not be opened.
+    void error(const QString &message);
+    /// The state was set, also to the value that it had.
+    void serverStateChanged(const DhcpServerManager::ServerStates &state);
+    /// The served interfaces changed; the defaults file at `path` shall say so.
+    void interfacesChanged(const QString &path);
+
+public slots:
+    /// Starts the service; the outcome arrives through serverStateChanged() and error().
+    void runServer();
+    /// Stops the service, in the same way.
+    void stopServer();
+    /// Restarts the service, in the same way; a stopped one is started.
+    void restartServer();
+    /// Asks for the state of the service and waits for the answer. An answer that says neither running nor stopped
+    /// leaves the state as it is. Does nothing while an operation is under way, which ends with a query anyway.
+    void checkRunning();
+    /// The end of a start, stop or restart.
+    void handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus);
+    /// Writes the lines last read with the served interfaces of the map over the file at `path`. When that fails, the
+    /// choice is given up for what the system and the file say, and an error() reported. A file that exists but could
+    /// not be read is never written over.
+    void writeDHCPServerConfig(const QString &path = paths::serverDefaults());
+
+private:
+    void setState(ServerStates state);
+    void startCommand(const QString &verb);
+    void operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead);
+    void handleProcessError(QProcess::ProcessError processError);
+    void reportFailedOperation(const QString &detail);
+
+    QProcess *m_process;
+    ServerStates m_state{Updating};
+    QStringList m_fileLines;
+    QMap<QString, bool> m_interfaces;
+    TextEncoding m_fileEncoding;
+    bool m_fileWasRead{};
+};

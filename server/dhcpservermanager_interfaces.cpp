@@ -1,0 +1,128 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// The served interfaces: the machine's, and the line of the service's defaults file that names them.
+#include "server/dhcpservermanager.h"
+
+#include "common/fileio.h"
+
+#include <QFileInfo>
+
+#include <ifaddrs.h>
+#include <memory>
+#include <net/if.h>
+#include <sys/socket.h>
+
+namespace {
+
+const QLatin1String interfacesKey{"INTERFACESv4"};
+
+// The lines of `text` without their terminators, LF or CR LF; what follows the last terminator is a line if not empty.
+QStringList linesOf(QString text)
+{
+    text.replace(QLatin1String("\r\n"), QLatin1String("\n"));
+    QStringList lines = text.split(QLatin1Char('\n'));
+    if (lines.constLast().isEmpty())
+        lines.removeLast();
+    return lines;
+}
+
+// Replaces `pieces` by the names between the first quotes after the first equals sign of `line`. Where the line lacks
+// one of them it returns false and leaves in `pieces` what there is of the last split.
+bool splitInterfacesLine(const QString &line, QStringList &pieces)
+{
+    pieces = line.split(QLatin1Char('='));
+    if (pieces.size() < 2)
+        return false;
+    pieces = pieces.at(1).split(QLatin1Char('"'));
+    if (pieces.size() < 2)
+        return false;
+    pieces = pieces.at(1).split(QLatin1Char(' '));
+    if (pieces == QStringList{QString{}})
+        pieces.clear();
+    return true;
+}
+
+QString interfacesLine(const QMap<QString, bool> &interfaces)
+{
+    QString line = interfacesKey + QLatin1String("=\"");
+    for (auto entry = interfaces.cbegin(); entry != interfaces.cend(); ++entry) {
+        if (!entry.value())
+            continue;
+        line += entry.key();
+        // Deliberately a space after every name but the map's last, be that one served or not.
+        if (std::next(entry) != interfaces.cend())
+            line += QLatin1Char(' ');
+    }
+    return line + QLatin1Char('"');
+}
+
+} // namespace
+
+void DhcpServerManager::updateInterfaces()
+{
+    collectSystemInterfaces();
+    readInterfacesFile(paths::serverDefaults());
+}
+
+void DhcpServerManager::collectSystemInterfaces()
+{
+    m_interfaces.clear();
+    ifaddrs *first{};
+    if (getifaddrs(&first) == -1)
+        return;
+    const std::unique_ptr<ifaddrs, decltype(&freeifaddrs)> list{first, &freeifaddrs};
+    for (const ifaddrs *entry = list.get(); entry; entry = entry->ifa_next) {
+        const bool isIpv4 = entry->ifa_addr && entry->ifa_addr->sa_family == AF_INET;
+        if (isIpv4 && !(entry->ifa_flags & IFF_LOOPBACK))
+            m_interfaces.insert(QString::fromLatin1(entry->ifa_name), false);
+    }
+}
+
+void DhcpServerManager::readInterfacesFile(const QString &path)
+{
+    m_fileLines.clear();
+    const std::optional<QByteArray> content = fileio::readFile(path);
+    m_fileWasRead = content.has_value();
+    if (!content) {
+        emit error(QObject::tr("Unable to open file '%1' for read").arg(path));
+        return;
+    }
+    m_fileEncoding = TextEncoding::detect(*content);
+
+    // Deliberately one list for all lines: the last line with the key decides, even one that cannot be taken apart.
+    // Such a line is dropped, so that the next write leaves it out, but its pieces count as names.
+    QStringList served;
+    for (const QString &line : linesOf(m_fileEncoding.decode(*content))) {
+        if (!line.contains(interfacesKey) || splitInterfacesLine(line, served))
+            m_fileLines.append(line);
+    }
+    for (const QString &name : qAsConst(served))
+        m_interfaces.insert(name, true);
+}
+
+const QMap<QString, bool> &DhcpServerManager::interfaces() const { return m_interfaces; }
+
+void DhcpServerManager::setInterfaces(const QMap<QString, bool> &interfaces)
+{
+    if (interfaces.isEmpty() || interfaces == m_interfaces)
+        return;
+    m_interfaces = interfaces;
+    emit interfacesChanged(paths::serverDefaults());
+}
+
+void DhcpServerManager::writeDHCPServerConfig(const QString &path)
+{
+    // Commented lines with the key are deliberately replaced too.
+    for (QString &line : m_fileLines) {
+        if (line.contains(interfacesKey))
+            line = interfacesLine(m_interfaces);
+    }
+    QString text = m_fileLines.join(QLatin1Char('\n'));
+    if (!m_fileLines.isEmpty())
+        text += QLatin1Char('\n');
+
+    const bool wouldLoseFile = !m_fileWasRead && QFileInfo::exists(path);
+    if (wouldLoseFile || !fileio::replaceFile(path, m_fileEncoding.encode(text))) {
+        updateInterfaces();
+        emit error(QObject::tr("Unable to open file '%1' for write").arg(path));
+    }
+}
