@@ -1,0 +1,15 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "config/dhcpdconfigdeclaration.h"
+
+#include <memory>
+#include <string_view>
+
+/// The deepest nesting of blocks that a configuration may have: views and the server itself recurse into them.
+constexpr int maximumBlockDepth{500};
+
+/// Reads the text of a configuration (in UTF-8) into a new "All network" declaration, whose parent is `top` but which
+/// is not among its children yet. Any text gives a tree, syntax errors are not reported; nothing when blocks are nested
+/// deeper than maximumBlockDepth.
+std::unique_ptr<DhcpdConfigDeclaration> readConfiguration(std::string_view text, DhcpdConfigDeclaration &top);

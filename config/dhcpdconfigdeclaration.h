@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "config/dhcpdconfigparam.h"
+#include "config/dhcpdconfigstatement.h"
+
+#include <memory>
+#include <vector>
+
+/// A statement that owns others: parameters, and after them declarations.
+class DhcpdConfigDeclaration final : public DhcpdConfigStatement
+{
+public:
+    using Parameters = std::vector<std::unique_ptr<DhcpdConfigParam>>;
+    using Declarations = std::vector<std::unique_ptr<DhcpdConfigDeclaration>>;
+
+    DhcpdConfigDeclaration(const QStringList &words, DhcpdConfigDeclaration *parent);
+    DhcpdConfigDeclaration(WordList words, DhcpdConfigDeclaration *parent);
+
+    const Parameters &parameters() const;
+    const Declarations &declarations() const;
+    /// Appends a statement that was made with this declaration as its parent.
+    DhcpdConfigParam *addParam(std::unique_ptr<DhcpdConfigParam> param);
+    DhcpdConfigDeclaration *addDeclaration(std::unique_ptr<DhcpdConfigDeclaration> declaration);
+
+    void removeChild(DhcpdConfigStatement *statement) override;
+    bool removeChildren(int row, int count) override;
+    DhcpdConfigStatement *child(int row) const override;
+    int childCount() const override;
+    int row() const override;
+    bool isParam() const override { return false; }
+    bool isDeclaration() const override { return true; }
+    QString label() const override;
+    QString valueText() const override;
+
+private:
+    struct Children
+    {
+        Parameters parameters;
+        Declarations declarations;
+    };
+
+    int parameterCount() const { return static_cast<int>(parameters().size()); }
+    Children &makeChildren();
+    template<class List>
+    typename List::value_type::pointer append(List &list, typename List::value_type child);
+    template<class List>
+    static void erase(List &list, int index, int count);
+    template<class List>
+    static bool eraseFound(List &list, const DhcpdConfigStatement *statement);
+
+    std::unique_ptr<Children> m_children; // null while there were none: most declarations are ranges and addresses
+};

@@ -1,0 +1,150 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "config/dhcpdconfigmodel.h"
+
+#include "common/fileio.h"
+#include "config/configreader.h"
+#include "config/configwriter.h"
+
+namespace {
+
+QString iconName(const DhcpdConfigStatement &statement)
+{
+    if (statement.isRoot() || (statement.isDeclaration() && statement.isSharedNetwork()))
+        return QStringLiteral("network");
+    if (statement.isParam())
+        return QStringLiteral("configure");
+    if (statement.isHost())
+        return QStringLiteral("computer");
+    return QStringLiteral("preferences-system-network");
+}
+
+} // namespace
+
+DhcpdConfigModel::DhcpdConfigModel(const QStringList &headerLabels, QObject *parent)
+    : QAbstractItemModel{parent}
+    , m_topNode{std::make_unique<DhcpdConfigDeclaration>(headerLabels, nullptr)}
+{
+}
+
+QModelIndex DhcpdConfigModel::index(int row, int column, const QModelIndex &parent) const
+{
+    if (!hasIndex(row, column, parent))
+        return {};
+    DhcpdConfigStatement *const child{statementFor(parent)->child(row)};
+    return child ? createIndex(row, column, child) : QModelIndex{};
+}
+
+QModelIndex DhcpdConfigModel::parent(const QModelIndex &index) const
+{
+    DhcpdConfigDeclaration *const parentNode{statementFor(index)->parent()};
+    if (!parentNode || parentNode == m_topNode.get())
+        return {};
+    // As a statement: a pointer to it is what statementFor() takes out of the index.
+    return createIndex(parentNode->row(), 0, static_cast<DhcpdConfigStatement *>(parentNode));
+}
+
+int DhcpdConfigModel::rowCount(const QModelIndex &parent) const
+{
+    return parent.column() > 0 ? 0 : statementFor(parent)->childCount();
+}
+
+int DhcpdConfigModel::columnCount(const QModelIndex &parent) const { return statementFor(parent)->wordCount(); }
+
+QVariant DhcpdConfigModel::data(const QModelIndex &index, int role) const
+{
+    if (!index.isValid() || !index.internalPointer())
+        return {};
+    const DhcpdConfigStatement &statement{*statementFor(index)};
+    if (role == Qt::DisplayRole || role == Qt::EditRole)
+        return statement.text(index.column());
+    if (role == Qt::DecorationRole && index.column() == 0)
+        return themeIcon(iconName(statement));
+    return {};
+}
+
+QVariant DhcpdConfigModel::headerData(int section, Qt::Orientation orientation, int role) const
+{
+    if (orientation != Qt::Horizontal || role != Qt::DisplayRole)
+        return {};
+    return m_topNode->word(section);
+}
+
+bool DhcpdConfigModel::setData(const QModelIndex &index, const QVariant &value, int role)
+{
+    if (role != Qt::EditRole || index.column() < 1)
+        return false;
+    DhcpdConfigStatement *const statement{statementFor(index)};
+    const bool stored{statement->isParam()
+                          ? setParamValue(static_cast<DhcpdConfigParam *>(statement), value)
+                          : setDeclarationValue(static_cast<DhcpdConfigDeclaration *>(statement), value)};
+    if (stored)
+        setModified();
+    return stored;
+}
+
+DhcpdConfigStatement *DhcpdConfigModel::statementFor(const QModelIndex &index) const
+{
+    if (!index.isValid() || !index.internalPointer())
+        return m_topNode.get();
+    return static_cast<DhcpdConfigStatement *>(index.internalPointer());
+}
+
+bool DhcpdConfigModel::parse(const QString &text) { return parseUtf8(text.toUtf8()); }
+
+QByteArray DhcpdConfigModel::fileContent() const { return m_encoding.fromUtf8(serialize(*m_topNode)); }
+
+void DhcpdConfigModel::reload(const QString &confFile)
+{
+    removeRows(0, rowCount());
+    read(confFile);
+}
+
+void DhcpdConfigModel::read(const QString &confFile)
+{
+    const auto bytes = fileio::readFile(confFile);
+    const auto encoding = bytes ? TextEncoding::detect(*bytes) : m_encoding;
+    if (!bytes || !parseUtf8(encoding.toUtf8(*bytes))) {
+        refuse(tr("Unable to open file '%1' for read").arg(confFile));
+        return;
+    }
+    m_encoding = encoding;
+    m_modified = false;
+    emit dataChanged({}, {});
+}
+
+bool DhcpdConfigModel::write(const QString &confFile)
+{
+    // A tree without a top row was never read: nothing of it may replace a file that does hold something.
+    if (m_topNode->childCount() > 0 && fileio::replaceFile(confFile, fileContent()))
+        return true;
+    return refuse(tr("Unable to open file '%1' for write").arg(confFile));
+}
+
+bool DhcpdConfigModel::parseUtf8(const QByteArray &text)
+{
+    auto allNetwork = readConfiguration({text.constData(), static_cast<std::size_t>(text.size())}, *m_topNode);
+    if (!allNetwork)
+        return false;
+    m_topNode->addDeclaration(std::move(allNetwork));
+    return true;
+}
+
+bool DhcpdConfigModel::refuse(const QString &message)
+{
+    emit error(message);
+    return false;
+}
+
+void DhcpdConfigModel::setModified()
+{
+    m_modified = true;
+    emit dataChanged({}, {});
+}
+
+QIcon DhcpdConfigModel::themeIcon(const QString &name) const
+{
+    auto icon = m_icons.constFind(name);
+    if (icon == m_icons.constEnd())
+        icon = m_icons.insert(name, QIcon::fromTheme(name));
+    return *icon;
+}

@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "config/dhcpdconfigstatement.h"
+
+#include "config/dhcpdconfigdeclaration.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace {
+
+constexpr int topDepth{-2};
+constexpr int indentUnit{4};
+
+} // namespace
+
+DhcpdConfigStatement::DhcpdConfigStatement(WordList words, DhcpdConfigDeclaration *parent)
+    : m_words{std::move(words)}
+{
+    setParent(parent);
+}
+
+bool DhcpdConfigStatement::insertWords(int position, int count)
+{
+    if (position < 0 || position > wordCount())
+        return false;
+    if (count < 1)
+        return true;
+    WordList::Buffer words;
+    words.addEmpty(count);
+    m_words.replace(position, 0, words);
+    return true;
+}
+
+bool DhcpdConfigStatement::removeWords(int position, int count)
+{
+    if (position < 0 || qint64{position} + count > wordCount())
+        return false;
+    if (count >= 1)
+        m_words.replace(position, count, {});
+    return true;
+}
+
+bool DhcpdConfigStatement::setWord(int index, const QString &text)
+{
+    if (index < 0 || index >= wordCount())
+        return false;
+    m_words.replace(index, 1, WordList::Buffer{{text}});
+    return true;
+}
+
+QString DhcpdConfigStatement::text(int column) const
+{
+    switch (column) {
+    case 0:
+        return label();
+    case 1:
+        return valueText();
+    default:
+        return word(column);
+    }
+}
+
+bool DhcpdConfigStatement::setWordsFrom(int position, const QStringList &words)
+{
+    const int count{wordCount()};
+    if (position < 0 || position > count)
+        return false;
+    m_words.replace(position, count - position, WordList::Buffer{words});
+    return true;
+}
+
+void DhcpdConfigStatement::setParent(DhcpdConfigDeclaration *parent)
+{
+    m_parent = parent;
+    m_depth = parent ? parent->depth() + 1 : topDepth;
+}
+
+QString DhcpdConfigStatement::indent() const { return {indentWidth(), QLatin1Char{' '}}; }
+
+int DhcpdConfigStatement::indentWidth() const { return std::max(0, m_depth) * indentUnit; }
+
+QString DhcpdConfigStatement::joinedWordsFrom(int position) const
+{
+    QString text;
+    int skip{std::min(position, wordCount() - 1)};
+    bool first{true};
+    for (const std::string_view word : m_words) {
+        if (skip-- > 0)
+            continue;
+        if (!std::exchange(first, false))
+            text += QLatin1Char{' '};
+        text += decodedWord(word);
+    }
+    return text;
+}
