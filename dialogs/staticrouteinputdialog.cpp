@@ -1,0 +1,122 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "dialogs/staticrouteinputdialog.h"
+
+#include "dialogs/netmask.h"
+#include "dialogs/patterns.h"
+#include "dialogs/routemodel.h"
+#include "ui_staticrouteinputdialog.h"
+
+#include <QHostAddress>
+#include <QMessageBox>
+#include <QRegularExpression>
+#include <QScrollBar>
+
+#include <algorithm>
+
+namespace {
+
+/// A word of the option value as the table shows it. Every plain number is deliberately read as a prefix length, a
+/// network of one octet too; 0 is none.
+QString shownWord(const QString &word)
+{
+    if (const int prefixLength{word.toInt()}; prefixLength != 0)
+        return netmaskText(QHostAddress{QHostAddress::AnyIPv4}, prefixLength);
+    return QString{word}.replace(QLatin1Char{','}, QLatin1Char{'.'});
+}
+
+/// The text of a cell as a word of the option value. Every net mask is deliberately written as its prefix length, a
+/// network that looks like one (192.0.0.0) too.
+QString optionWord(const QString &cell)
+{
+    if (QString{cell}.remove(patterns::netmask()).isEmpty())
+        return QString::number(prefixLength(cell));
+    return QString{cell}.replace(QLatin1Char{'.'}, QLatin1Char{','});
+}
+
+/// Makes room for a whole address, also while it is edited, and for the title in every column, beside row numbers of up
+/// to three digits.
+void widenColumns(QTableView *table)
+{
+    const QFontMetrics metrics{table->fontMetrics()};
+    QHeaderView *header{table->horizontalHeader()};
+    int width{metrics.horizontalAdvance(QStringLiteral("  255.255.255.255  "))};
+    for (int column{0}; column < header->count(); ++column)
+        width = std::max(width, header->sectionSizeHint(column));
+    header->setMinimumSectionSize(width);
+    const int rowNumbers{table->verticalHeader()->sizeHint().width() +
+                         metrics.horizontalAdvance(QStringLiteral("999"))};
+    table->setMinimumWidth(rowNumbers + header->count() * width + table->verticalScrollBar()->sizeHint().width() +
+                           2 * table->frameWidth());
+}
+
+} // namespace
+
+StaticRouteInputDialog::StaticRouteInputDialog(QWidget *parent)
+    : QDialog{parent}
+    , m_ui{std::make_unique<Ui::StaticRouteInputDialog>()}
+    , m_model{new RouteModel{this}}
+{
+    m_ui->setupUi(this);
+    m_ui->StaticRouteTable->setModel(m_model);
+    m_ui->StaticRouteTable->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
+    widenColumns(m_ui->StaticRouteTable);
+    m_ui->addButton->setIcon(QIcon::fromTheme(QStringLiteral("list-add")));
+    m_ui->removeButton->setIcon(QIcon::fromTheme(QStringLiteral("list-remove")));
+    connect(m_ui->addButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleAddStaticRoute);
+    connect(m_ui->removeButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleRemoveStaticRoute);
+    connect(m_ui->StaticRouteTable, &QTableView::clicked, this, [this] { m_ui->removeButton->setEnabled(true); });
+}
+
+StaticRouteInputDialog::~StaticRouteInputDialog() = default;
+
+void StaticRouteInputDialog::setRoutes(const QString &text, bool ms)
+{
+    if (ms)
+        m_ui->checkBoxMS->setChecked(true);
+    QStringList words{text.split(QLatin1String{", "})};
+    std::transform(words.cbegin(), words.cend(), words.begin(), shownWord);
+    m_model->addRoutes(words);
+}
+
+QStringList StaticRouteInputDialog::routes() const
+{
+    QStringList words{cellTexts()};
+    std::transform(words.cbegin(), words.cend(), words.begin(), optionWord);
+    return words;
+}
+
+bool StaticRouteInputDialog::isMsRoute() const { return m_ui->checkBoxMS->isChecked(); }
+
+void StaticRouteInputDialog::lockMsRoute() { m_ui->checkBoxMS->setEnabled(false); }
+
+void StaticRouteInputDialog::handleAddStaticRoute()
+{
+    m_model->addRoutes({QString{}, QString{}, QString{}});
+    m_ui->StaticRouteTable->scrollToBottom();
+}
+
+void StaticRouteInputDialog::accept()
+{
+    if (cellTexts().contains(QString{})) {
+        QMessageBox::information(this, tr("Information"), tr("There is an empty cell.\nTo add, fill in the cell."));
+        return;
+    }
+    QDialog::accept();
+}
+
+void StaticRouteInputDialog::handleRemoveStaticRoute()
+{
+    m_model->removeRoute(m_ui->StaticRouteTable->currentIndex());
+    if (!m_ui->StaticRouteTable->selectionModel()->hasSelection())
+        m_ui->removeButton->setEnabled(false);
+}
+
+QStringList StaticRouteInputDialog::cellTexts() const
+{
+    QStringList texts;
+    for (int row{0}; row < m_model->rowCount(); ++row) {
+        for (int column{0}; column < m_model->columnCount(); ++column)
+            texts.append(m_model->index(row, column).data().toString());
+    }
+    return texts;
+}
