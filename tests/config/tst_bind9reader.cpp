@@ -1,0 +1,397 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "config/bind9reader.h"
+#include "tests/support/temporaryroot.h"
+
+#include <QDir>
+#include <QRandomGenerator>
+#include <QTemporaryDir>
+#include <QTest>
+
+namespace {
+
+// Words from a text that has a bar between them.
+QStringList words(const char *text)
+{
+    const auto joined = QString::fromUtf8(text);
+    return joined.isEmpty() ? QStringList{} : joined.split(QLatin1Char{'|'});
+}
+
+constexpr auto keyAndTwoZones = R"(// The keys and zones of this server.
+key "ddns-key" {
+    algorithm hmac-sha256;
+    secret "Zm9v/YmFyYmF6+w==";
+};
+zone "example.org" IN {
+    type master;
+    file "/var/lib/bind/db.example.org";
+    allow-update { key "ddns-key"; };
+};
+zone "1.168.192.in-addr.arpa" {
+    type master;
+    file "/var/lib/bind/db.192.168.1";
+    allow-update { key "ddns-key"; };
+};
+)";
+
+constexpr auto keyAndTwoZonesStatements = R"(key|"ddns-key"|algorithm|hmac-sha256|secret|"Zm9v/YmFyYmF6+w==")"
+                                          R"(|zone|example.org.|primary|127.0.0.1|key|"ddns-key")"
+                                          R"(|zone|1.168.192.in-addr.arpa.|primary|127.0.0.1|key|"ddns-key")";
+
+QStringList preparedFrom(const QTemporaryDir &folder, const char *file, const QStringList &knownKeys = {})
+{
+    return bind9::prepared(folder.filePath(QString::fromUtf8(file)), knownKeys);
+}
+
+} // namespace
+
+class TestBind9Reader final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void scansStatements_data();
+    void scansStatements();
+    void removesComments_data();
+    void removesComments();
+    void keepsZonesAndKeys_data();
+    void keepsZonesAndKeys();
+    void choosesUsable_data();
+    void choosesUsable();
+    void preparesFile_data();
+    void preparesFile();
+    void followsIncludes_data();
+    void followsIncludes();
+    void limitsDepthOfIncludes();
+    void limitsSizeOfIncludes();
+    void givesNothingForUnreadableFile();
+    void survivesAnyText();
+};
+
+void TestBind9Reader::scansStatements_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QStringList>("expected");
+
+    const auto row = [](const char *name, const char *text, const char *expected) {
+        QTest::addRow("%s", name) << QString::fromUtf8(text) << words(expected);
+    };
+    row("usual file", keyAndTwoZones, keyAndTwoZonesStatements);
+    row("empty", "", "");
+    row("comments only", "// one\n/* two */\n// three", "");
+    row("dropped statements only", "type master; file \"f\"; allow-update { };", "");
+    row("zone without updaters", "zone \"a.org\" { type master; };", "zone|a.org.|primary|127.0.0.1");
+    row("zone without quotes", "zone a.org {", "zone|a.org.|primary|127.0.0.1");
+    row("zone without block", "zone \"a.org\";", "zone|a.org.");
+    row("zone as second word", "in-view zone;", "in-view|zone.");
+    row("zone alone", "zone;", "zone|.");
+    row("zone before closing brace", "zone \"a.org\" }", "zone|a.org.");
+    row("zone in capitals", "ZONE \"a.org\" {", "ZONE|\"a.org\"");
+    row("class", "zone \"a.org\" IN {", "zone|a.org.|primary|127.0.0.1");
+    row("class in lower case", "zone \"a.org\" in {", "zone|a.org.|in|primary|127.0.0.1");
+    row("class as second word", "zone IN {", "zone|IN.|primary|127.0.0.1");
+    row("third word goes wherever the class stands", "IN a b c;", "IN|a");
+    row("one word", "options { recursion; };", "options||recursion|");
+    row("three words", "grant k zonesub;", "grant|k|zonesub");
+    row("include", "include \"/etc/bind/k\";", "include|\"/etc/bind/k\"");
+    row("dropped before semicolon", "type master;", "");
+    row("dropped before opening brace", "file {", "");
+    row("dropped before closing brace", "type master }", "type|master");
+    row("dropped as second word", "a type;", "");
+    row("dropped in capitals", "TYPE master;", "TYPE|master");
+    row("hash", "# a;", "#|a");
+    row("one slash", "a / b;\nc;", "a|c");
+    row("slash within a word", "a b/c;\nd;", "a|b|d");
+    row("slash between quotes", "a \"b/c\";", "a|\"b/c\"");
+    row("blank between quotes", "a \"b c\";", "a|\"b|c\"");
+    row("delimiter between quotes", "a \"b;c\";", "a|\"b|c\"|");
+    row("comment at the end", "a b; //", "a|b");
+    row("word at the end", "a b; c", "a|b");
+    row("statement at the end", "a b; c ", "a|b");
+    row("unbalanced quote", "a \"b; c / d;", "a|\"b|c|/|d");
+    row("carriage return", "a b;\r\nc d;", "a|b|\r|c|d");
+}
+
+void TestBind9Reader::scansStatements()
+{
+    QFETCH(QString, text);
+    QFETCH(QStringList, expected);
+    QCOMPARE(bind9::statements(text), expected);
+}
+
+void TestBind9Reader::removesComments_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("expected");
+
+    const auto row = [](const char *name, const char *text, const char *expected) {
+        QTest::addRow("%s", name) << QString::fromUtf8(text) << QString::fromUtf8(expected);
+    };
+    row("none", "a \"b\"; / * c", "a \"b\"; / * c");
+    row("slashes", "a; // b\nc;", "a;  \nc;");
+    row("hash", "a; # b\nc;", "a;  \nc;");
+    row("hash within a word", "a#b\nc", "a \nc");
+    row("block", "a /* b\nc */ d", "a   d");
+    row("block between words", "zone/**/\"a\"", "zone \"a\"");
+    row("slash that ends no block", "/*/ a */b", " b");
+    row("line comment within block", "/* // */ a", "  a");
+    row("block within line comment", "// /*\na */", " \na */");
+    row("between quotes", "\"// # /* */\" a", "\"// # /* */\" a");
+    row("quote within comment", "// \"\na // b\n", " \na  \n");
+    row("line comment to the end", "a // b", "a  ");
+    row("hash to the end", "a #", "a  ");
+    row("block to the end", "a /* b", "a  ");
+    row("slash at the end", "a /", "a /");
+    row("empty", "", "");
+}
+
+void TestBind9Reader::removesComments()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, expected);
+    QCOMPARE(bind9::withoutComments(text), expected);
+}
+
+void TestBind9Reader::keepsZonesAndKeys_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QStringList>("expected"); // as statements
+
+    const auto row = [](const char *name, const char *text, const char *expected) {
+        QTest::addRow("%s", name) << QString::fromUtf8(text) << words(expected);
+    };
+    row("options", "options { directory \"/var/cache/bind\"; listen-on { any; }; };", "");
+    row("controls", "controls { inet 127.0.0.1 port 953 allow { 127.0.0.1; } keys { \"rndc-key\"; }; };", "");
+    row("view", "view \"inside\" { match-clients { any; }; zone a { allow-update { key k; }; }; recursion no; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("key in a view", "view v { key k { algorithm a; secret s; }; };", "key|k|algorithm|a|secret|s");
+    row("class of any case", "zone a in { }; zone b In { }; zone c IN { };",
+        "zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|zone|c.|primary|127.0.0.1");
+    row("keywords of any case", "ZONE a { Allow-Update { KEY k; }; }; Key k { Algorithm a; SECRET s; };",
+        "zone|a.|primary|127.0.0.1|key|k|key|k|algorithm|a|secret|s");
+    row("dot at the end", "zone \"a.org.\" { };", "zone|a.org.|primary|127.0.0.1");
+    row("root zone", "zone \".\" { type hint; allow-update { key k; }; };", "");
+    row("heading without a name", "zone { allow-update { key k; }; }; key { algorithm a; };", "");
+    row("keys of other purposes",
+        "zone a { masters { 10.0.0.1 key m; }; allow-transfer { key t; }; allow-update { key u; }; };",
+        "zone|a.|primary|127.0.0.1|key|u");
+    row("several keys", "zone a { allow-update { 10.0.0.1; !key x; key k; key l; }; };",
+        "zone|a.|primary|127.0.0.1|key|k|key|l");
+    row("denied list", "zone a { allow-update { !{ !10.0.0.0/8; key x; }; key k; }; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("update policy", "zone a { update-policy { deny d name a.; grant k zonesub ANY; grant l self l; }; };",
+        "zone|a.|primary|127.0.0.1|key|k|key|l");
+    row("update policy without a block", "zone a { update-policy local; };", "zone|a.|primary|127.0.0.1");
+    row("updaters outside a zone", "options { allow-update { key k; }; }; allow-update { key k; };", "");
+    row("slash in a word without quotes", "key k { algorithm a; secret YS9i/Yw==; };",
+        "key|k|algorithm|a|secret|\"YS9i/Yw==\"");
+    row("delimiters between quotes", "options { version \"zone a { allow-update { key k; }; };\"; };", "");
+    row("name with a blank", "zone \"a b\" { allow-update { key k; }; }; key \"c;d\" { algorithm a; secret s; };", "");
+    row("carriage returns", "zone a {\r\nallow-update {\r\nkey k;\r\n};\r\n};\r\n", "zone|a.|primary|127.0.0.1|key|k");
+    row("surplus closing braces", "}; } key k { algorithm a; secret s; }; }", "key|k|algorithm|a|secret|s");
+    row("blocks left open", "zone a { allow-update { key k; ", "zone|a.|primary|127.0.0.1|key|k");
+    row("words before a closing brace", "key k { algorithm a; secret s }", "key|k|algorithm|a");
+    row("unbalanced quote", "zone \"a { allow-update { key k; }; };", "");
+}
+
+void TestBind9Reader::keepsZonesAndKeys()
+{
+    QFETCH(QString, text);
+    QFETCH(QStringList, expected);
+    QCOMPARE(bind9::statements(bind9::zonesAndKeys(text)), expected);
+}
+
+void TestBind9Reader::choosesUsable_data()
+{
+    QTest::addColumn<QStringList>("statements");
+    QTest::addColumn<QStringList>("knownKeys");
+    QTest::addColumn<QStringList>("expected");
+
+    const auto row = [](const char *name, const char *statements, const char *knownKeys, const char *expected) {
+        QTest::addRow("%s", name) << words(statements) << words(knownKeys) << words(expected);
+    };
+    const auto sameRow = [&row](const char *name, const char *statements, const char *knownKeys = "") {
+        row(name, statements, knownKeys, statements);
+    };
+    sameRow("nothing", "");
+    sameRow("usual", keyAndTwoZonesStatements);
+    sameRow("order that the server takes", "key|k|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k"
+                                           "|key|l|secret|s|algorithm|a|zone|b.|primary|127.0.0.1|key|l");
+    sameRow("key without a zone", "key|k|algorithm|a|secret|s");
+    row("zone before its key", "zone|a.|primary|127.0.0.1|key|k|key|o|algorithm|a|secret|s|key|k|algorithm|a|secret|s",
+        "", "key|k|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k|key|o|algorithm|a|secret|s");
+    row("key given twice", "key|k|algorithm|a|secret|s|key|\"K\"|algorithm|a|secret|s", "",
+        "key|\"K\"|algorithm|a|secret|s");
+    row("algorithm in quotes", "key|k|algorithm|\"hmac-md5\"|secret|\"s\"", "",
+        "key|k|algorithm|hmac-md5|secret|\"s\"");
+    row("algorithm in quotes behind the secret", "key|k|secret|\"s\"|algorithm|\"hmac-md5\"", "",
+        "key|k|secret|\"s\"|algorithm|hmac-md5");
+    row("zone without a key", "zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|key|k|key|k|algorithm|a|secret|s",
+        "", "key|k|algorithm|a|secret|s|zone|b.|primary|127.0.0.1|key|k");
+    row("unknown key", "zone|a.|primary|127.0.0.1|key|k", "l|m", "");
+    sameRow("key of the configuration", "zone|a.|primary|127.0.0.1|key|\"K\"", "l|k");
+    row("key of the configuration in other quotes and case", "zone|a.|primary|127.0.0.1|key|k", "\"K\"",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("dot at the end of the known name only", "zone|a.|primary|127.0.0.1|key|\"k\"", "k.",
+        "zone|a.|primary|127.0.0.1|key|k.");
+    row("dot at the end of the reference only", "key|\"k\"|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k.", "",
+        "key|\"k\"|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|\"k\"");
+    row("first key that there is", "zone|a.|primary|127.0.0.1|key|x|key|l|key|k", "k|l",
+        "zone|a.|primary|127.0.0.1|key|l");
+    row("key without a secret", "key|k|algorithm|a|zone|a.|primary|127.0.0.1|key|k", "", "");
+    row("key with an empty secret", "key|k|algorithm|a|secret|", "", "");
+    row("key without an algorithm", "key|k|secret|s|secret|s", "", "");
+    row("last key cut short", "key|k|algorithm|a|secret", "", "");
+    row("last zone cut short", "zone|a.|primary|127.0.0.1|key", "k", "");
+    row("other statements between",
+        "options||directory|\"d\"|a|b|c|key|k|algorithm|a|secret|s|recursion||zone|a.|primary|127.0.0.1|key|k|x", "",
+        "key|k|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k");
+}
+
+void TestBind9Reader::choosesUsable()
+{
+    QFETCH(QStringList, statements);
+    QFETCH(QStringList, knownKeys);
+    QFETCH(QStringList, expected);
+    QCOMPARE(bind9::usable(statements, knownKeys), expected);
+}
+
+void TestBind9Reader::preparesFile_data()
+{
+    QTest::addColumn<QByteArray>("content");
+    QTest::addColumn<QStringList>("expected");
+
+    const auto row = [](const char *name, const QByteArray &content, const char *expected) {
+        QTest::addRow("%s", name) << content << words(expected);
+    };
+    row("usual", keyAndTwoZones, keyAndTwoZonesStatements);
+    row("empty", "", "");
+    row("comments only", "// one\n# two\n/* three */", "");
+    row("type, file and allow-update only", "type master; file \"f\"; allow-update { none; };", "");
+    row("nobody may update", "zone a { type master; }; zone b { allow-update { none; }; }; zone c { type slave; };",
+        "");
+    row("comments of every style",
+        "# zone x {\nkey k { // {\n algorithm \"hmac-md5\"; /* }; \n*/ secret \"YQ==\"; # };\n};\n"
+        "zone \"a\" /* IN */ { allow-update { key k; }; }; // \"",
+        "key|k|algorithm|hmac-md5|secret|\"YQ==\"|zone|a.|primary|127.0.0.1|key|k");
+    row("zone before its key, in views",
+        "view a { zone \"a\" { type master; allow-update { key k; }; }; };\n"
+        "view b { zone \"a\" { type slave; masters { 10.0.0.1 key k; }; }; };\n"
+        "key k { secret \"YQ==\"; algorithm hmac-md5; };",
+        "key|k|secret|\"YQ==\"|algorithm|hmac-md5|zone|a.|primary|127.0.0.1|key|k");
+    row("Latin-1", "// \xFC\nkey k { algorithm a; secret \"s\"; };", "key|k|algorithm|a|secret|\"s\"");
+}
+
+void TestBind9Reader::preparesFile()
+{
+    QFETCH(QByteArray, content);
+    QFETCH(QStringList, expected);
+    const QTemporaryDir folder;
+    writeTestFile(folder.filePath(QStringLiteral("named.conf.local")), content);
+    QCOMPARE(preparedFrom(folder, "named.conf.local"), expected);
+}
+
+void TestBind9Reader::followsIncludes_data()
+{
+    QTest::addColumn<QByteArray>("local"); // named.conf.local; @ stands for the folder
+    QTest::addColumn<QByteArray>("key");   // keys/ddns.key
+    QTest::addColumn<QStringList>("expected");
+
+    const QByteArray key{"key k { algorithm a; secret \"s\"; };"};
+    const QByteArray zone{"zone a { allow-update { key k; }; };"};
+    const QStringList keyWords{words("key|k|algorithm|a|secret|\"s\"")};
+    const QStringList both{keyWords + words("zone|a.|primary|127.0.0.1|key|k")};
+    QTest::newRow("absolute") << "include \"@/keys/ddns.key\";\n" + zone << key << both;
+    QTest::newRow("relative") << "INCLUDE \"keys/ddns.key\" ;\n" + zone << key << both;
+    QTest::newRow("behind the zone") << zone + "\ninclude \"keys/ddns.key\";\n" << key << both;
+    QTest::newRow("within a zone") << "zone a { include \"keys/ddns.key\"; };" + key
+                                   << QByteArray{"allow-update { key k; };"} << both;
+    QTest::newRow("with a comment") << "include /* it */ \"keys/ddns.key\";\n" + zone << key + "// the key" << both;
+    QTest::newRow("in a comment") << "// include \"keys/ddns.key\";\n" + zone << key << QStringList{};
+    QTest::newRow("missing") << "include \"keys/other.key\";\n" + key << key << keyWords;
+    QTest::newRow("a folder") << "include \"keys\";\n" + key << key << keyWords;
+    QTest::newRow("itself") << "include \"named.conf.local\";\n" + key << key << keyWords;
+    QTest::newRow("each other") << "include \"keys/ddns.key\";\n" + zone
+                                << key + "include \"../keys/../named.conf.local\";" << both;
+    QTest::newRow("same file twice") << QByteArray{"include \"keys/ddns.key\";\n"}.repeated(2) << key << keyWords;
+}
+
+void TestBind9Reader::followsIncludes()
+{
+    QFETCH(QByteArray, local);
+    QFETCH(QByteArray, key);
+    QFETCH(QStringList, expected);
+    const QTemporaryDir folder;
+    QVERIFY(QDir{folder.path()}.mkdir(QStringLiteral("keys")));
+    writeTestFile(folder.filePath(QStringLiteral("named.conf.local")), local.replace('@', folder.path().toUtf8()));
+    writeTestFile(folder.filePath(QStringLiteral("keys/ddns.key")), key);
+    QCOMPARE(preparedFrom(folder, "named.conf.local"), expected);
+}
+
+void TestBind9Reader::limitsDepthOfIncludes()
+{
+    const QTemporaryDir folder;
+    for (int i{1}; i <= 40; ++i) {
+        const QByteArray number{QByteArray::number(i)};
+        writeTestFile(folder.filePath(QString::number(i)), "key k" + number +
+                                                               " { algorithm a; secret s; };\ninclude \"" +
+                                                               QByteArray::number(i + 1) + "\";");
+    }
+    const QStringList statements{bind9::readFile(folder.filePath(QStringLiteral("1")))};
+    QVERIFY(statements.contains(QStringLiteral("k16")));
+    QVERIFY(!statements.contains(QStringLiteral("k17")));
+}
+
+void TestBind9Reader::limitsSizeOfIncludes()
+{
+    const QTemporaryDir folder;
+    const QByteArray filler(3'000'000, ' ');
+    writeTestFile(folder.filePath(QStringLiteral("main")), QByteArray{"include \"filler\";"}.repeated(30));
+    writeTestFile(folder.filePath(QStringLiteral("filler")), "key k { algorithm a; secret s; };" + filler);
+    QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("main"))).count(QStringLiteral("k")), 5);
+}
+
+void TestBind9Reader::givesNothingForUnreadableFile()
+{
+    const QTemporaryDir folder;
+    QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("missing"))), QStringList{});
+    QCOMPARE(bind9::readFile(folder.path()), QStringList{});
+    QCOMPARE(preparedFrom(folder, "missing", {QStringLiteral("k")}), QStringList{});
+}
+
+// Whatever a text holds, the result is whole groups in an order that the server takes.
+void TestBind9Reader::survivesAnyText()
+{
+    static const QStringList pieces{
+        words("\"|;|{|}|/|//|/*|*/|#| |\n|\r\n|zone |key |algorithm |secret |allow-update {|"
+              "update-policy {|grant |view |type |file |IN |a|\"b\"|c.|k|primary|127.0.0.1|"
+              "zone a {|zone \"b\" IN { allow-update { key k; }; };|key k {|"
+              "key k { algorithm \"x\"; secret \"s\"; };|algorithm a; secret s;|key k;|include \"x\";|};")};
+    QRandomGenerator random{20240607};
+    int groups{};
+    for (int round{}; round < 5'000; ++round) {
+        QString text;
+        for (int count{random.bounded(80)}; count > 0; --count)
+            text += pieces.at(random.bounded(pieces.size()));
+
+        const QStringList knownKeys{QStringLiteral("a")};
+        for (const QStringList &statements :
+             {bind9::statements(text), bind9::statements(bind9::zonesAndKeys(bind9::withoutComments(text)))}) {
+            const QStringList result{bind9::usable(statements, knownKeys)};
+            QCOMPARE(result.size() % 6, 0);
+            QStringList keys{knownKeys};
+            for (int i{}; i < result.size(); i += 6, ++groups) {
+                const QString keyword{result.at(i)};
+                if (keyword == QLatin1String{"key"})
+                    keys += bind9::unquoted(result.at(i + 1)).toLower();
+                else if (keyword == QLatin1String{"zone"})
+                    QVERIFY(keys.contains(bind9::unquoted(result.at(i + 5)).toLower()));
+                else
+                    QFAIL(qPrintable(keyword));
+            }
+        }
+    }
+    QVERIFY(groups > 1'000);
+}
+
+QTEST_GUILESS_MAIN(TestBind9Reader)
+#include "tst_bind9reader.moc"
