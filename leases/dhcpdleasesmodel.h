@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "leases/leasereader.h"
+#include "leases/leasetable.h"
+#include "leases/leasetime.h"
+
+#include <QAbstractListModel>
+#include <QString>
+
+/// The leases of the DHCP server's lease file, a row for each address in the order of the addresses. It has six columns
+/// although it is a list: address, MAC address, host name, binding state, start and end.
+class DhcpdLeasesModel final : public QAbstractListModel
+{
+    Q_OBJECT
+
+public:
+    explicit DhcpdLeasesModel(QObject *parent = nullptr);
+
+    int rowCount(const QModelIndex &parent = {}) const override;
+    int columnCount(const QModelIndex &parent = {}) const override;
+    QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
+    QVariant headerData(int section, Qt::Orientation orientation, int role = Qt::DisplayRole) const override;
+
+signals:
+    /// The file could not be read, and the model is empty; `message` is for the user.
+    void error(const QString &message);
+
+public slots:
+    /// Replaces everything by what the file at `path` holds, in one reset.
+    void reload(const QString &path);
+
+    /// Brings the model up to date with the file at `path`. If that only grew since it was last read, just what was
+    /// appended is read, and a few new leases are announced as changed and inserted rows; else it is a reload.
+    void update(const QString &path);
+
+private:
+    void settleOneByOne();
+
+    LeaseTable m_table;
+    LeaseReader m_reader{m_table};
+    mutable LeaseTimeTexts m_timeTexts;
+};

@@ -1,0 +1,173 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/leasetable.h"
+
+#include "common/textencoding.h"
+
+#include <QHostAddress>
+
+#include <algorithm>
+#include <cstring>
+#include <limits>
+
+namespace {
+
+// A text's bytes follow their number, which takes one byte, or this one and eight more.
+constexpr char longText{'\xFF'};
+
+// The room that is made ahead, from the bytes of a usual block and of the texts in it; memory that is not needed is
+// never touched.
+constexpr qint64 bytesPerLease{256};
+constexpr qint64 bytesPerTextByte{8};
+constexpr qint64 mostBytesAhead{qint64{1} << 30};
+
+// So many pending leases are settled at once, lest a file of many blocks for few addresses take memory for them all.
+constexpr std::size_t manyPending{std::size_t{1} << 20U};
+
+// An address and a place in the list of leases in one number: sorted, the leases of an address stay in their order.
+quint64 sortKey(quint32 address, std::size_t place) { return quint64{address} << 32U | place; }
+quint32 addressOf(quint64 key) { return static_cast<quint32>(key >> 32U); }
+quint32 placeOf(quint64 key) { return static_cast<quint32>(key); }
+
+} // namespace
+
+QByteArray leaseBytes(std::string_view text)
+{
+    constexpr std::size_t mostThatQtTakes{std::size_t{1} << 29U};
+    return {text.data(), static_cast<int>(std::min(text.size(), mostThatQtTakes))};
+}
+
+QString decodeLeaseText(std::string_view text)
+{
+    const QByteArray bytes{leaseBytes(text)};
+    return TextEncoding::detect(bytes).decode(bytes);
+}
+
+void LeaseTexts::clear()
+{
+    m_bytes.assign(1, '\0'); // the empty text
+    m_bytes.shrink_to_fit();
+}
+
+LeaseTexts::Id LeaseTexts::add(std::string_view text)
+{
+    const std::size_t id{m_bytes.size()};
+    if (text.empty() || id > std::numeric_limits<Id>::max()) { // beyond 4 GiB of texts, cells stay empty
+        return {};
+    }
+    if (text.size() < static_cast<unsigned char>(longText)) {
+        m_bytes.push_back(static_cast<char>(text.size()));
+    } else {
+        const quint64 size{text.size()};
+        m_bytes.push_back(longText);
+        m_bytes.append(reinterpret_cast<const char *>(&size), sizeof size);
+    }
+    m_bytes.append(text);
+    return static_cast<Id>(id);
+}
+
+std::string_view LeaseTexts::at(Id id) const
+{
+    const char *const text{m_bytes.data() + id};
+    if (*text != longText) {
+        return {text + 1, static_cast<unsigned char>(*text)};
+    }
+    quint64 size{};
+    std::memcpy(&size, text + 1, sizeof size);
+    return {text + 1 + sizeof size, size};
+}
+
+void LeaseTable::clear() { *this = LeaseTable{}; }
+
+void LeaseTable::reserveForFile(qint64 bytes)
+{
+    const auto ahead{static_cast<std::size_t>(std::min(bytes, mostBytesAhead))};
+    m_leases.reserve(ahead / bytesPerLease);
+    m_texts.reserve(ahead / bytesPerTextByte);
+}
+
+void LeaseTable::add(const Lease &lease, const std::optional<QString> &addressText)
+{
+    if (m_leases.size() - m_rows.size() >= std::max(manyPending, m_rows.size())) {
+        settleAll();
+    }
+    m_leases.push_back(lease);
+    if (addressText) {
+        m_addressTexts.insert(lease.address, *addressText);
+    } else if (!m_addressTexts.isEmpty()) {
+        m_addressTexts.remove(lease.address);
+    }
+}
+
+void LeaseTable::settleAll()
+{
+    const std::size_t settled{m_rows.size()};
+    std::vector<quint64> keys;
+    keys.reserve(m_leases.size() - settled);
+    for (std::size_t place{settled}; place < m_leases.size(); ++place) {
+        keys.push_back(sortKey(m_leases[place].address, place));
+    }
+    std::sort(keys.begin(), keys.end());
+
+    // Merge the last lease of each address into the rows. A lease whose address has a row already moves to that one's
+    // place; `rowOf` is the row of every other, so that those without one can be told.
+    constexpr quint32 none{std::numeric_limits<quint32>::max()};
+    std::vector<quint32> rows;
+    std::vector<quint32> rowOf(keys.size(), none);
+    rows.reserve(m_leases.size());
+    auto old{m_rows.cbegin()};
+    for (auto key{keys.cbegin()}; key != keys.cend(); ++key) {
+        const quint32 address{addressOf(*key)};
+        const bool isLast{key + 1 == keys.cend() || addressOf(*(key + 1)) != address};
+        if (!isLast) {
+            continue;
+        }
+        while (old != m_rows.cend() && m_leases[*old].address < address) {
+            rows.push_back(*old++);
+        }
+        if (old != m_rows.cend() && m_leases[*old].address == address) {
+            m_leases[*old] = m_leases[placeOf(*key)];
+        } else {
+            rowOf[placeOf(*key) - settled] = static_cast<quint32>(rows.size());
+            rows.push_back(placeOf(*key));
+        }
+    }
+    rows.insert(rows.end(), old, m_rows.cend());
+
+    std::size_t end{settled};
+    for (std::size_t place{settled}; place < m_leases.size(); ++place) {
+        if (const quint32 row{rowOf[place - settled]}; row != none) {
+            m_leases[end] = m_leases[place];
+            rows[row] = static_cast<quint32>(end++);
+        }
+    }
+    m_leases.resize(end);
+    m_rows = std::move(rows);
+}
+
+LeaseTable::Place LeaseTable::placeOfNext() const
+{
+    const quint32 address{m_leases[m_rows.size()].address};
+    const auto row{std::lower_bound(m_rows.cbegin(), m_rows.cend(), address, [this](quint32 place, quint32 wanted) {
+        return m_leases[place].address < wanted;
+    })};
+    return {static_cast<int>(row - m_rows.cbegin()), row == m_rows.cend() || m_leases[*row].address != address};
+}
+
+void LeaseTable::settleNext()
+{
+    const Place place{placeOfNext()};
+    const auto row{m_rows.begin() + place.row};
+    if (place.isNew) {
+        m_rows.insert(row, static_cast<quint32>(m_rows.size()));
+    } else {
+        const auto next{m_leases.begin() + size()};
+        m_leases[*row] = *next;
+        m_leases.erase(next);
+    }
+}
+
+QString LeaseTable::addressText(quint32 address) const
+{
+    const auto text{m_addressTexts.constFind(address)};
+    return text != m_addressTexts.cend() ? *text : QHostAddress{address}.toString();
+}

@@ -1,0 +1,58 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include <QDate>
+#include <QHash>
+#include <QLocale>
+#include <QString>
+#include <QTime>
+
+#include <string_view>
+
+/// A date and a time of day as a lease file states them. It has no time zone, so that one inside a daylight saving gap
+/// of the local zone is shown like any other.
+class LeaseTime final
+{
+public:
+    /// The length of a usual "yyyy/MM/dd hh:mm:ss".
+    static constexpr std::size_t usualLength{19};
+
+    /// An invalid time.
+    LeaseTime() = default;
+
+    /// The time of a date "yyyy/MM/dd" and a time "hh:mm:ss"; invalid unless QDateTime takes both.
+    static LeaseTime parse(std::string_view date, std::string_view time);
+
+    /// Whether the usualLength bytes at `text` are digits, slashes, a space and colons in the usual places.
+    static bool hasUsualLayout(const char *text);
+    /// The time of a text of the usual layout; invalid if there is no such day or second.
+    static LeaseTime fromUsualLayout(const char *text);
+
+    bool isValid() const { return m_date != 0; }
+    QDate date() const;
+    QTime time() const;
+
+    /// Numbers that stand for the date and for the time of day, each unique among its kind.
+    quint32 dateKey() const { return m_date; }
+    quint32 timeKey() const { return m_time; }
+
+private:
+    LeaseTime(unsigned year, unsigned month, unsigned day, unsigned hour, unsigned minute, unsigned second);
+
+    quint32 m_date{}; // year, month, day in 16, 8 and 8 bits; 0 when invalid
+    quint32 m_time{}; // hour, minute, second in 8 bits each
+};
+
+/// The texts of times in the default locale: its long time, a space and its narrow date. The locale takes microseconds
+/// a text and the distinct ones are few, so they are remembered.
+class LeaseTimeTexts final
+{
+public:
+    /// The text of `time`, empty when it is invalid.
+    QString text(LeaseTime time);
+
+private:
+    QLocale m_locale;
+    QHash<quint32, QString> m_dates;
+    QHash<quint32, QString> m_times;
+};

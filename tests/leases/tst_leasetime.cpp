@@ -1,0 +1,184 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/leasetime.h"
+
+#include <QDateTime>
+#include <QRandomGenerator>
+#include <QTest>
+
+#include <ctime>
+
+namespace {
+
+LeaseTime parsed(const QByteArray &date, const QByteArray &time)
+{
+    return LeaseTime::parse({date.constData(), static_cast<std::size_t>(date.size())},
+                            {time.constData(), static_cast<std::size_t>(time.size())});
+}
+
+/// While it exists, the local time zone is another one.
+class LocalZone final
+{
+public:
+    explicit LocalZone(const QByteArray &name) { set(name); }
+    ~LocalZone() { set(m_old); }
+    Q_DISABLE_COPY_MOVE(LocalZone)
+
+private:
+    static void set(const QByteArray &name)
+    {
+        qputenv("TZ", name);
+        tzset();
+    }
+
+    QByteArray m_old{qgetenv("TZ")};
+};
+
+} // namespace
+
+class TestLeaseTime final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void cleanup();
+    void takesWhatQtTakes();
+    void knowsTheUsualLayout();
+    void isShownAsItStands_data();
+    void isShownAsItStands();
+    void isShownInTheDefaultLocale_data();
+    void isShownInTheDefaultLocale();
+    void hasNoTextIfInvalid();
+    void remembersNoWrongTexts();
+};
+
+void TestLeaseTime::cleanup() { QLocale::setDefault(QLocale::c()); }
+
+void TestLeaseTime::takesWhatQtTakes()
+{
+    const QString characters{QStringLiteral("0123456789/: -+.aT\t") + QChar{0x663} + QChar{0xA0} + QChar{0}};
+    QRandomGenerator random{4};
+    int valid{0};
+    for (int i{0}; i < 100'000; ++i) {
+        QString text{QStringLiteral("2024/02/28 11:45:30")};
+        for (int change{random.bounded(3)}; change >= 0; --change) {
+            const int place{random.bounded(text.size())};
+            const QChar character{characters[random.bounded(characters.size())]};
+            switch (random.bounded(6)) {
+            case 0:
+                text.remove(place, 1);
+                break;
+            case 1:
+                text.insert(place, character);
+                break;
+            default:
+                text[place] = character;
+            }
+        }
+        const QStringList words{text.split(QLatin1Char{' '})};
+        if (words.size() != 2) {
+            continue;
+        }
+        const QDateTime expected{QDateTime::fromString(text, QStringLiteral("yyyy/MM/dd hh:mm:ss"))};
+        const LeaseTime time{parsed(words[0].toUtf8(), words[1].toUtf8())};
+        QVERIFY2(time.isValid() == expected.isValid(), qPrintable(text));
+        if (time.isValid()) {
+            ++valid;
+            QCOMPARE(time.date(), expected.date());
+            QCOMPARE(time.time(), expected.time());
+        }
+        const QByteArray bytes{text.toUtf8()};
+        if (bytes.size() == int{LeaseTime::usualLength} && LeaseTime::hasUsualLayout(bytes.constData())) {
+            const LeaseTime usual{LeaseTime::fromUsualLayout(bytes.constData())};
+            QVERIFY2(usual.isValid() == expected.isValid(), bytes.constData());
+            QCOMPARE(usual.dateKey(), time.dateKey());
+            QCOMPARE(usual.timeKey(), time.timeKey());
+        }
+    }
+    QVERIFY(valid > 1000);
+}
+
+/// Every byte at every place of a text of the usual layout.
+void TestLeaseTime::knowsTheUsualLayout()
+{
+    const QByteArray usual{"2024/02/28 19:45:30"};
+    QCOMPARE(usual.size(), int{LeaseTime::usualLength});
+    for (int place{0}; place < usual.size(); ++place) {
+        const bool isDigit{usual[place] >= '0' && usual[place] <= '9'};
+        for (int byte{0}; byte < 256; ++byte) {
+            QByteArray text{usual};
+            text[place] = static_cast<char>(byte);
+            const bool isUsual{isDigit ? byte >= '0' && byte <= '9' : text == usual};
+            QCOMPARE(LeaseTime::hasUsualLayout(text.constData()), isUsual);
+        }
+    }
+}
+
+void TestLeaseTime::isShownAsItStands_data()
+{
+    QTest::addColumn<QByteArray>("zone");
+    QTest::addColumn<QByteArray>("date");
+    QTest::addRow("skipped in Berlin") << QByteArray{"Europe/Berlin"} << QByteArray{"2026/03/29"};
+    QTest::addRow("skipped in New York") << QByteArray{"America/New_York"} << QByteArray{"2026/03/08"};
+    QTest::addRow("twice in Berlin") << QByteArray{"Europe/Berlin"} << QByteArray{"2026/10/25"};
+    QTest::addRow("UTC") << QByteArray{"UTC"} << QByteArray{"2026/03/29"};
+}
+
+void TestLeaseTime::isShownAsItStands()
+{
+    QFETCH(const QByteArray, zone);
+    QFETCH(const QByteArray, date);
+    const LocalZone local{zone};
+    const LeaseTime usual{LeaseTime::fromUsualLayout((date + " 02:30:00").constData())};
+    for (const LeaseTime time : {parsed(date, "02:30:00"), usual}) {
+        QCOMPARE(time.date(), QDate::fromString(QString::fromLatin1(date), QStringLiteral("yyyy/MM/dd")));
+        QCOMPARE(time.time(), QTime(2, 30));
+        QVERIFY(LeaseTimeTexts{}.text(time).startsWith(QLatin1String{"02:30:00"}));
+    }
+}
+
+void TestLeaseTime::isShownInTheDefaultLocale_data()
+{
+    QTest::addColumn<QString>("locale");
+    for (const char *locale : {"C", "en_US", "en_GB", "de_DE", "ru_RU", "ar_EG", "ja_JP"}) {
+        QTest::addRow("%s", locale) << QString::fromLatin1(locale);
+    }
+}
+
+void TestLeaseTime::isShownInTheDefaultLocale()
+{
+    QFETCH(const QString, locale);
+    QLocale::setDefault(QLocale{locale});
+    const QDate date{2026, 1, 2};
+    const QTime time{13, 4, 5};
+    QCOMPARE(LeaseTimeTexts{}.text(parsed("2026/01/02", "13:04:05")),
+             QLocale{locale}.toString(time, QLocale::LongFormat) + QLatin1Char{' '} +
+                 QLocale{locale}.toString(date, QLocale::NarrowFormat));
+}
+
+void TestLeaseTime::hasNoTextIfInvalid()
+{
+    QVERIFY(!LeaseTime{}.isValid());
+    QCOMPARE(LeaseTimeTexts{}.text(LeaseTime{}), QString{});
+    QCOMPARE(LeaseTimeTexts{}.text(parsed("never", "")), QString{});
+}
+
+void TestLeaseTime::remembersNoWrongTexts()
+{
+    LeaseTimeTexts texts;
+    const LeaseTime time{parsed("2026/01/02", "13:04:05")};
+    const QString english{texts.text(time)};
+    QLocale::setDefault(QLocale{QStringLiteral("de_DE")});
+    const QString german{texts.text(time)};
+    QVERIFY(german != english);
+    QCOMPARE(german, LeaseTimeTexts{}.text(time));
+
+    // More days than are remembered.
+    for (QDate day{1990, 1, 1}; day.year() < 2030; day = day.addDays(1)) {
+        const QByteArray date{day.toString(QStringLiteral("yyyy/MM/dd")).toLatin1()};
+        QVERIFY(texts.text(parsed(date, "13:04:05")).endsWith(QLocale{}.toString(day, QLocale::NarrowFormat)));
+    }
+    QCOMPARE(texts.text(time), german);
+}
+
+QTEST_GUILESS_MAIN(TestLeaseTime)
+#include "tst_leasetime.moc"
