@@ -69,9 +69,7 @@ FileDescriptor openBackupFolder()
     if (mkdir(name.constData(), S_IRWXU) < 0 && errno == ENOENT && QDir{}.mkpath(QFileInfo{path}.path()))
         mkdir(name.constData(), S_IRWXU);
     FileDescriptor folder{posix::openAt(AT_FDCWD, name, O_RDONLY | O_DIRECTORY | O_NOFOLLOW)};
-    struct stat status
-    {
-    };
+    FileStatus status{};
     const bool safe{folder.isOpen() && fstat(folder.get(), &status) == 0 && status.st_uid == geteuid() &&
                     (status.st_mode & (S_IWGRP | S_IWOTH)) == 0};
     return safe ? std::move(folder) : FileDescriptor{};

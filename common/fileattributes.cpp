@@ -52,7 +52,7 @@ std::error_code readAttributes(int descriptor, Attributes &attributes)
     return {};
 }
 
-std::error_code copyOwner(const struct stat &from, const struct stat &to, int descriptor)
+std::error_code copyOwner(const FileStatus &from, const FileStatus &to, int descriptor)
 {
     constexpr auto same = static_cast<uid_t>(-1);
     const uid_t owner{from.st_uid == to.st_uid ? same : from.st_uid};
@@ -89,12 +89,8 @@ std::error_code copyAttributes(int from, int to)
 
 std::error_code fileattributes::copy(int from, int to)
 {
-    struct stat wanted
-    {
-    };
-    struct stat present
-    {
-    };
+    FileStatus wanted{};
+    FileStatus present{};
     if (fstat(from, &wanted) < 0 || fstat(to, &present) < 0)
         return posix::lastError();
     if (const std::error_code error{copyOwner(wanted, present, to)})

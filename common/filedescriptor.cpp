@@ -91,9 +91,7 @@ QVector<QByteArray> entries(int directory)
 
 std::error_code readAll(int descriptor, QByteArray &content)
 {
-    struct stat status
-    {
-    };
+    FileStatus status{};
     if (fstat(descriptor, &status) < 0)
         return lastError();
     if (S_ISDIR(status.st_mode))

@@ -7,6 +7,10 @@
 #include <cerrno>
 #include <system_error>
 
+#include <sys/stat.h>
+
+using FileStatus = struct stat;
+
 /// An open file, closed with its owner.
 class FileDescriptor final
 {

@@ -23,6 +23,8 @@
 
 namespace {
 
+using ExtendedStatus = struct statx;
+
 constexpr int longestLinkChain{40}; // as the kernel's
 constexpr int pipePatience{1000};   // ms that a full pipe may take to be read from
 
@@ -61,8 +63,10 @@ struct Location
 
     QString path() const
     {
-        const QString parent{QFileInfo{QFile::decodeName(directory)}.canonicalFilePath()};
-        return QDir{parent}.filePath(QFile::decodeName(name));
+        const QFileInfo parent{QFile::decodeName(directory)};
+        const QString canonical{parent.canonicalFilePath()};
+        return QDir{canonical.isEmpty() ? QDir::cleanPath(parent.absoluteFilePath()) : canonical}.filePath(
+            QFile::decodeName(name));
     }
 };
 
@@ -87,14 +91,6 @@ std::error_code locate(const QString &path, Location &location)
     return std::make_error_code(std::errc::too_many_symbolic_link_levels);
 }
 
-bool isRegular(int descriptor)
-{
-    struct stat status
-    {
-    };
-    return fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
-}
-
 void writeUnchecked(int descriptor, const QByteArray &content)
 {
     for (int done{}; done < content.size();) {
@@ -113,27 +109,9 @@ void writeUnchecked(int descriptor, const QByteArray &content)
 // Whether the file is itself a mount point. Where the kernel cannot tell, the renaming will.
 bool isMountPoint(int descriptor)
 {
-    struct statx status
-    {
-    };
+    ExtendedStatus status{};
     return statx(descriptor, "", AT_EMPTY_PATH, STATX_BASIC_STATS, &status) == 0 &&
            (status.stx_attributes & STATX_ATTR_MOUNT_ROOT) != 0;
-}
-
-bool hasSeveralNames(int descriptor)
-{
-    struct stat status
-    {
-    };
-    return fstat(descriptor, &status) == 0 && status.st_nlink > 1;
-}
-
-uid_t ownerOf(int descriptor)
-{
-    struct stat status
-    {
-    };
-    return fstat(descriptor, &status) == 0 ? status.st_uid : geteuid();
 }
 
 mode_t newFileMode()
@@ -245,12 +223,15 @@ QString replace(const QString &path, const QByteArray &content)
     const FileDescriptor old{posix::openAt(directory.get(), location.name, O_WRONLY | O_NOFOLLOW)};
     if (!old.isOpen() && errno != ENOENT)
         return text(posix::lastError());
-    if (old.isOpen() && !isRegular(old.get())) {
+    FileStatus status{};
+    if (old.isOpen() && fstat(old.get(), &status) < 0)
+        return text(posix::lastError());
+    if (old.isOpen() && !S_ISREG(status.st_mode)) {
         writeUnchecked(old.get(), content);
         return {};
     }
 
-    TemporaryFile::removeLeftOvers(directory.get(), location.name, old.isOpen() ? ownerOf(old.get()) : geteuid());
+    TemporaryFile::removeLeftOvers(directory.get(), location.name, old.isOpen() ? status.st_uid : geteuid());
     QByteArray oldContent;
     std::error_code unread;
     QString keptAs;
@@ -260,7 +241,7 @@ QString replace(const QString &path, const QByteArray &content)
         if (!unread)
             keptAs = backups::keep(location.path(), oldContent);
     }
-    if (!old.isOpen() || (!isMountPoint(old.get()) && !hasSeveralNames(old.get()))) {
+    if (!old.isOpen() || (status.st_nlink == 1 && !isMountPoint(old.get()))) {
         const Attempt attempt{replaceByRename(directory.get(), location.name, old, content)};
         if (!attempt.error)
             return {};

@@ -35,9 +35,7 @@ QByteArray randomSuffix()
 
 bool isLeftOver(const FileDescriptor &file, uid_t owner)
 {
-    struct stat status
-    {
-    };
+    FileStatus status{};
     return file.isOpen() && fstat(file.get(), &status) == 0 && S_ISREG(status.st_mode) &&
            (status.st_uid == owner || status.st_uid == geteuid()) && flock(file.get(), LOCK_EX | LOCK_NB) == 0;
 }
@@ -73,9 +71,7 @@ std::error_code TemporaryFile::openOnce()
     m_temporaryName = name;
     if (posix::retried([this] { return flock(m_file.get(), LOCK_EX); }) < 0)
         return posix::lastError();
-    struct stat status
-    {
-    };
+    FileStatus status{};
     if (fstat(m_file.get(), &status) < 0)
         return posix::lastError();
     if (status.st_nlink > 0)
