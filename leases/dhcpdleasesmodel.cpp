@@ -5,16 +5,6 @@
 
 namespace {
 
-enum Column
-{
-    Address,
-    Mac,
-    HostName,
-    State,
-    Start,
-    End
-};
-
 constexpr std::array headers{
     QT_TRANSLATE_NOOP("DhcpdLeasesModel", "IP address"),   QT_TRANSLATE_NOOP("DhcpdLeasesModel", "MAC address"),
     QT_TRANSLATE_NOOP("DhcpdLeasesModel", "Host name"),    QT_TRANSLATE_NOOP("DhcpdLeasesModel", "Binding state"),

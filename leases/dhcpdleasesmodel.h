@@ -15,6 +15,16 @@ class DhcpdLeasesModel final : public QAbstractListModel
     Q_OBJECT
 
 public:
+    enum Column
+    {
+        Address,
+        Mac,
+        HostName,
+        State,
+        Start,
+        End
+    };
+
     explicit DhcpdLeasesModel(QObject *parent = nullptr);
 
     int rowCount(const QModelIndex &parent = {}) const override;

@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/fmain.h"
+#include "platform/orvinit.h"
+#include "platform/qtsingleapplication.h"
+
+#include <QIcon>
+#include <QLibraryInfo>
+#include <QMessageBox>
+#include <QTranslator>
+
+#include <cstdlib>
+#include <unistd.h>
+
+namespace {
+
+constexpr const char *version = "2.1.6+ci1";
+constexpr const char *description = "Configure DHCP server";
+constexpr int raiseMilliseconds = 5000;
+
+void installTranslator(QTranslator *translator, const QString &name, const QString &directory)
+{
+    if (translator->load(QLocale{}, name, QStringLiteral("_"), directory))
+        QCoreApplication::installTranslator(translator);
+}
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    QtSingleApplication application{argc, argv};
+    if (application.isRunning()) {
+        application.sendMessage(QStringLiteral("raise"), raiseMilliseconds);
+        return EXIT_FAILURE;
+    }
+
+    QTranslator qtTranslator;
+    QTranslator translator;
+    installTranslator(&qtTranslator, QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+    installTranslator(&translator, QStringLiteral("orv-admin-dhcp"), QStringLiteral(":/i18n"));
+
+    orvInit(version, description);
+    if (getuid() != 0) {
+        QMessageBox::critical(nullptr, QObject::tr("Error"), QObject::tr("Must be superuser"), QMessageBox::Ok);
+        return EXIT_FAILURE;
+    }
+    QtSingleApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("orv-admin-dhcp")));
+
+    FMain window;
+    application.setActivationWindow(&window, true);
+    window.show();
+    return QtSingleApplication::exec();
+}

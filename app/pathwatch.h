@@ -1,0 +1,40 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <QTimer>
+
+class QFileSystemWatcher;
+
+/// Notices when a file is changed, replaced, removed or made, through a watcher of the file and one of its directory.
+///
+/// Notifications that arrive within 100 ms of the first one count as one. Both paths are watched anew after every
+/// notice: a path whose file was replaced while somebody holds the old one open stays on the dead file otherwise.
+class PathWatch final : public QObject
+{
+    Q_OBJECT
+    Q_DISABLE_COPY_MOVE(PathWatch)
+
+public:
+    /// Watches `file`, which need not exist, and `directory`; the watchers are children of `parent` too.
+    PathWatch(const QString &file, const QString &directory, QObject *parent);
+
+    /// Stops watching, for a change of the program's own, and watches again. A notice that was due by then is still
+    /// given.
+    void pause();
+    void resume();
+
+signals:
+    /// The file may have changed; also sent for other files of its directory.
+    void changed();
+
+private:
+    void notify();
+
+    QString m_file;
+    QString m_directory;
+    QFileSystemWatcher *m_fileWatcher{};
+    QFileSystemWatcher *m_directoryWatcher{};
+    QTimer m_burst;
+};

@@ -1,0 +1,57 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/treeexpansion.h"
+
+#include <QScrollBar>
+#include <QTreeView>
+
+TreeExpansion::TreeExpansion(QTreeView *tree)
+    : QObject{tree}
+    , m_tree{tree}
+{
+    // Connected after the view itself, so that the view has forgotten its branches by the time they are opened again.
+    connect(tree->model(), &QAbstractItemModel::modelAboutToBeReset, this, &TreeExpansion::remember);
+    connect(tree->model(), &QAbstractItemModel::modelReset, this, &TreeExpansion::restore);
+}
+
+void TreeExpansion::expandAll()
+{
+    // Setting a root, even the same, puts the layout off, and while it is put off expand() only takes note.
+    m_tree->setRootIndex(m_tree->rootIndex());
+    forEachBranch({}, [this](const QModelIndex &index) { m_tree->expand(index); });
+    m_tree->doItemsLayout();
+}
+
+void TreeExpansion::remember()
+{
+    m_open.clear();
+    m_scroll = m_tree->verticalScrollBar()->value();
+    forEachBranch({}, [this](const QModelIndex &index) {
+        if (m_tree->isExpanded(index))
+            m_open.insert(index.internalPointer());
+    });
+}
+
+void TreeExpansion::restore()
+{
+    // The view's own reset has put the layout off.
+    forEachBranch({}, [this](const QModelIndex &index) {
+        if (m_open.count(index.internalPointer()) > 0)
+            m_tree->expand(index);
+    });
+    m_tree->doItemsLayout();
+    m_tree->verticalScrollBar()->setValue(m_scroll);
+}
+
+template<typename Visit>
+void TreeExpansion::forEachBranch(const QModelIndex &parent, const Visit &visit) const
+{
+    const QAbstractItemModel *model = m_tree->model();
+    const int rows = model->rowCount(parent);
+    for (int row = 0; row < rows; ++row) {
+        const QModelIndex index = model->index(row, 0, parent);
+        if (!model->hasChildren(index))
+            continue;
+        visit(index);
+        forEachBranch(index, visit);
+    }
+}
