@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/manualpage.h"
+
+#include <QFile>
+#include <QHash>
+#include <QRegularExpression>
+
+namespace {
+
+// The text of a line: what the few escapes that the page uses stand for.
+QString plainText(QString line)
+{
+    static const QRegularExpression escape{QStringLiteral(R"(\\(-|&|f[BIR]|\(bu))")};
+    line.replace(QLatin1String{"\\-"}, QLatin1String{"-"});
+    return line.remove(escape).remove(QLatin1Char{'"'}).toHtmlEscaped();
+}
+
+} // namespace
+
+// Only the macros that the page uses: headings, paragraphs, emphasis, and tagged paragraphs, whose first line is the
+// tag.
+QString manualPageHtml()
+{
+    static const QHash<QString, QString> forms{
+        {QStringLiteral(".SH"), QStringLiteral("<h3>%1</h3>")}, {QStringLiteral(".BR"), QStringLiteral("%1 ")},
+        {QStringLiteral(".B"), QStringLiteral("<b>%1</b> ")},   {QStringLiteral(".I"), QStringLiteral("<i>%1</i> ")},
+        {QStringLiteral(".PP"), QStringLiteral("<p>%1")},       {QStringLiteral(".TP"), QStringLiteral("<p>%1")},
+    };
+    QFile page{QStringLiteral(":/orv-admin-dhcp.8")};
+    if (!page.open(QIODevice::ReadOnly))
+        return {};
+    QString html;
+    bool tagFollows{false};
+    while (!page.atEnd()) {
+        const QString line{QString::fromUtf8(page.readLine()).trimmed()};
+        const QString macro{line.section(QLatin1Char(' '), 0, 0)};
+        const bool isMacro{line.startsWith(QLatin1Char('.'))};
+        if (forms.contains(macro))
+            html += forms.value(macro).arg(plainText(line.section(QLatin1Char(' '), 1)));
+        else if (!isMacro)
+            html += plainText(line) + QLatin1Char(' ');
+        if (tagFollows)
+            html += QStringLiteral("<br>");
+        tagFollows = macro == QLatin1String(".TP");
+    }
+    return html;
+}

@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include <QMenu>
+#include <QPointer>
+
+class QDialog;
+
+/// The Help menu of the main window `parent`: the manual page, and who made the program.
+class OrvHelpMenu final : public QMenu
+{
+    Q_OBJECT
+
+public:
+    explicit OrvHelpMenu(QWidget *parent);
+    Q_DISABLE_COPY_MOVE(OrvHelpMenu)
+
+private:
+    void showManual();
+    void showAbout();
+
+    QPointer<QDialog> m_manual;
+};

@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/packagemanager.h"
+
+#include <QProcess>
+#include <QRegularExpression>
+
+namespace {
+
+constexpr int longestWait{5000}; // milliseconds
+
+// Whatever else dpkg-query takes for a package (a pattern, an option) is not the name of one.
+bool isPackageName(const QString &text)
+{
+    static const QRegularExpression name{QStringLiteral("\\A[a-z0-9][a-z0-9+.-]+\\z")};
+    return name.match(text).hasMatch();
+}
+
+} // namespace
+
+namespace OrvAdmin {
+
+QStringList PackageManager::getInstalledPackagesVersions(const QString &package)
+{
+    if (!isPackageName(package))
+        return {};
+    QProcess query;
+    query.start(QStringLiteral("dpkg-query"),
+                {QStringLiteral("--show"), QStringLiteral("--showformat=${db:Status-Status} ${Version}\\n"), package},
+                QIODevice::ReadOnly);
+    if (!query.waitForFinished(longestWait)) {
+        query.kill();
+        query.waitForFinished(longestWait);
+        return {};
+    }
+    if (query.exitStatus() != QProcess::NormalExit || query.exitCode() != 0)
+        return {};
+    // A removed package whose configuration files were left is still in the database.
+    const QString installed{QStringLiteral("installed ")};
+    QStringList versions;
+    for (const QString &line : QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char('\n'))) {
+        if (line.startsWith(installed))
+            versions.append(line.mid(installed.size()));
+    }
+    return versions;
+}
+
+} // namespace OrvAdmin

@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include <QStringList>
+
+namespace OrvAdmin {
+
+/// What the machine's package database knows.
+class PackageManager final
+{
+public:
+    /// The versions of the installed package named `package`, one for each architecture that it is installed for. Empty
+    /// when it is not installed, unknown, or the database cannot be asked.
+    static QStringList getInstalledPackagesVersions(const QString &package);
+};
+
+} // namespace OrvAdmin

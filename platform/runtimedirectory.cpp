@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/runtimedirectory.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QStandardPaths>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+bool isPrivateDirectory(const QString &path)
+{
+    struct stat status
+    {
+    };
+    // A trailing slash would make lstat() follow a symbolic link.
+    return QDir::isAbsolutePath(path) && lstat(QFile::encodeName(QDir::cleanPath(path)).constData(), &status) == 0 &&
+           S_ISDIR(status.st_mode) && status.st_uid == geteuid() && (status.st_mode & ACCESSPERMS) == S_IRWXU;
+}
+
+bool makePrivateDirectory(const QString &path)
+{
+    if (!QFileInfo::exists(path)) {
+        QDir{}.mkpath(QFileInfo{path}.path());
+        mkdir(QFile::encodeName(path).constData(), S_IRWXU);
+    }
+    return isPrivateDirectory(path);
+}
+
+QString ownRuntimeDirectory()
+{
+    const QString parent{geteuid() == 0 ? QStringLiteral("/run")
+                                        : QStandardPaths::writableLocation(QStandardPaths::GenericCacheLocation)};
+    return parent + QStringLiteral("/orv-admin-dhcp");
+}
+
+QString runtimeDirectory(const QString &own)
+{
+    const QString sessions[]{qEnvironmentVariable("XDG_RUNTIME_DIR"),
+                             QStringLiteral("/run/user/") + QString::number(geteuid())};
+    for (const QString &session : sessions) {
+        if (isPrivateDirectory(session))
+            return session;
+    }
+    return makePrivateDirectory(own) ? own : QString{};
+}

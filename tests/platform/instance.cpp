@@ -1,0 +1,70 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// A program that starts as the product does and tells on its standard output what happens to it.
+#include "platform/qtsingleapplication.h"
+
+#include <QEvent>
+#include <QThread>
+#include <QWidget>
+#include <QWindow>
+
+#include <cstdio>
+
+namespace {
+
+void tell(const QByteArray &line)
+{
+    std::puts(line.constData());
+    std::fflush(stdout);
+}
+
+/// Tells when it comes to the front, once it is watched.
+class MainWindow final : public QWidget
+{
+public:
+    void watch() { m_watched = true; }
+
+protected:
+    bool event(QEvent *event) override
+    {
+        const bool handled{QWidget::event(event)};
+        if (m_watched && event->type() == QEvent::WindowActivate)
+            tell(isMinimized() ? "in front, minimized" : "in front");
+        return handled;
+    }
+
+private:
+    bool m_watched{false};
+};
+
+} // namespace
+
+// Arguments: the milliseconds that a later instance waits for the receipt, and those that a first one is busy after it
+// has started.
+int main(int argc, char *argv[])
+{
+    QtSingleApplication application{argc, argv};
+    const QStringList arguments{QtSingleApplication::arguments()};
+    if (application.isRunning()) {
+        const bool sent{application.sendMessage(QStringLiteral("raise"), arguments.value(1).toInt())};
+        tell(sent ? "sent" : "not sent");
+        tell("windows: " + QByteArray::number(QGuiApplication::topLevelWindows().size()));
+        return EXIT_FAILURE;
+    }
+
+    MainWindow window;
+    QWidget cover;
+    window.showMinimized();
+    cover.show();
+    cover.activateWindow();
+    while (!cover.isActiveWindow())
+        QtSingleApplication::processEvents(QEventLoop::WaitForMoreEvents);
+
+    QObject::connect(&application, &QtSingleApplication::messageReceived, &application, [](const QString &message) {
+        tell("message: " + (message.size() < 100 ? message.toUtf8() : QByteArray::number(message.size())));
+    });
+    application.setActivationWindow(&window);
+    window.watch();
+    tell("first");
+    QThread::msleep(arguments.value(2).toULong());
+    return QtSingleApplication::exec();
+}

@@ -1,0 +1,129 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/orvhelpmenu.h"
+
+#include "platform/orvinit.h"
+#include "tests/support/modalboxes.h"
+
+#include <QAction>
+#include <QDialogButtonBox>
+#include <QMainWindow>
+#include <QMenuBar>
+#include <QPushButton>
+#include <QTest>
+#include <QTextBrowser>
+
+#include <memory>
+
+class TestOrvHelpMenu final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase() { orvInit("2.1.6+ci1", "Configure <DHCP> server"); }
+    void init();
+    void cleanup() { m_window.reset(); }
+
+    void entries();
+    void aboutTellsNameVersionDescriptionAndLicence();
+    void aboutQtIsShown();
+    void manualIsThePage();
+    void manualIsOpenedOnce();
+
+private:
+    QAction *entry(const QString &text) const;
+    QList<QDialog *> dialogs() const { return m_window->findChildren<QDialog *>(); }
+
+    std::unique_ptr<QMainWindow> m_window;
+    OrvHelpMenu *m_menu{nullptr};
+};
+
+void TestOrvHelpMenu::init()
+{
+    m_window = std::make_unique<QMainWindow>();
+    m_menu = new OrvHelpMenu{m_window.get()};
+    m_window->menuBar()->addMenu(m_menu);
+    m_window->show();
+}
+
+QAction *TestOrvHelpMenu::entry(const QString &text) const
+{
+    for (QAction *action : m_menu->actions()) {
+        if (action->text() == text)
+            return action;
+    }
+    qFatal("no entry %s", qPrintable(text));
+}
+
+void TestOrvHelpMenu::entries()
+{
+    QCOMPARE(m_menu->title(), QStringLiteral("&Help"));
+    QCOMPARE(m_menu->parentWidget(), m_window.get());
+    QStringList texts;
+    for (const QAction *action : m_menu->actions())
+        texts.append(action->isSeparator() ? QStringLiteral("-") : action->text());
+    QCOMPARE(texts, QStringList({QStringLiteral("Manual"), QStringLiteral("-"), QStringLiteral("About tst_orvhelpmenu"),
+                                 QStringLiteral("About Qt")}));
+}
+
+void TestOrvHelpMenu::aboutTellsNameVersionDescriptionAndLicence()
+{
+    ModalBoxes boxes;
+    boxes.expectDialog<QMessageBox>([this](QMessageBox *box) {
+        QCOMPARE(box->windowTitle(), QStringLiteral("About tst_orvhelpmenu"));
+        QCOMPARE(box->parentWidget(), m_window.get());
+        for (const char *text : {"tst_orvhelpmenu", "2.1.6+ci1", "Configure &lt;DHCP&gt; server",
+                                 "GNU General Public License, version 3 or later"})
+            QVERIFY2(box->text().contains(QLatin1String{text}), text);
+        QTest::keyClick(box, Qt::Key_Return);
+    });
+    entry(QStringLiteral("About tst_orvhelpmenu"))->trigger();
+    boxes.verify();
+}
+
+void TestOrvHelpMenu::aboutQtIsShown()
+{
+    ModalBoxes boxes;
+    boxes.expectDialog<QMessageBox>([this](QMessageBox *box) {
+        QCOMPARE(box->windowTitle(), QStringLiteral("About Qt"));
+        QCOMPARE(box->parentWidget(), m_window.get());
+        QTest::keyClick(box, Qt::Key_Return);
+    });
+    entry(QStringLiteral("About Qt"))->trigger();
+    boxes.verify();
+}
+
+void TestOrvHelpMenu::manualIsThePage()
+{
+    entry(QStringLiteral("Manual"))->trigger();
+    QCOMPARE(dialogs().size(), 1);
+    QDialog *manual{dialogs().constFirst()};
+    QVERIFY(manual->isVisible());
+    QCOMPARE(manual->windowTitle(), QStringLiteral("Manual"));
+    const auto *browser{manual->findChild<QTextBrowser *>()};
+    QVERIFY(browser->isReadOnly());
+    const QString text{browser->toPlainText().simplified()};
+    for (const char *part :
+         {"NAME orv-admin-dhcp - configure the ISC DHCP server SYNOPSIS", "The tab Topology shows the server's",
+          "FILES /etc/dhcp/dhcpd.conf The server's configuration, read and written.",
+          "1 Another instance was running already", "SEE ALSO dhcpd (8), dhcpd.conf (5),"})
+        QVERIFY2(text.contains(QLatin1String{part}), part);
+    QVERIFY2(!text.contains(QLatin1Char('\\')), "an escape was left");
+    QVERIFY2(!text.contains(QLatin1String{" ."}), "a macro was left");
+
+    QTest::mouseClick(manual->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close), Qt::LeftButton);
+    QTRY_VERIFY(dialogs().isEmpty());
+}
+
+void TestOrvHelpMenu::manualIsOpenedOnce()
+{
+    entry(QStringLiteral("Manual"))->trigger();
+    entry(QStringLiteral("Manual"))->trigger();
+    QCOMPARE(dialogs().size(), 1);
+    dialogs().constFirst()->close();
+    QTRY_VERIFY(dialogs().isEmpty());
+    entry(QStringLiteral("Manual"))->trigger();
+    QCOMPARE(dialogs().size(), 1);
+}
+
+QTEST_MAIN(TestOrvHelpMenu)
+#include "tst_orvhelpmenu.moc"

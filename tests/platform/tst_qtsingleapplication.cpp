@@ -1,0 +1,358 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/singleinstance.h"
+
+#include <QLocalSocket>
+#include <QProcess>
+#include <QSignalSpy>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QtEndian>
+
+#include <memory>
+
+#include <sys/file.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/un.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace {
+
+const QString instanceName{QStringLiteral("orv_test_instance")};
+constexpr uid_t otherUser{65534};
+
+enum StrangersFate
+{
+    Refused,
+    Dropped,
+    Answered
+};
+
+// Connects and sends `bytes` as another user would, from a process of its own.
+StrangersFate sendAsOtherUser(const QString &socketPath, const QByteArray &bytes)
+{
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    qstrncpy(address.sun_path, QFile::encodeName(socketPath).constData(), sizeof(address.sun_path));
+    const pid_t child{fork()};
+    if (child == 0) {
+        char answer{};
+        const int descriptor{socket(AF_UNIX, SOCK_STREAM, 0)};
+        if (setresuid(otherUser, otherUser, otherUser) != 0 ||
+            connect(descriptor, reinterpret_cast<const sockaddr *>(&address), sizeof(address)) != 0)
+            _exit(Refused);
+        send(descriptor, bytes.constData(), static_cast<size_t>(bytes.size()), MSG_NOSIGNAL);
+        _exit(read(descriptor, &answer, 1) > 0 ? Answered : Dropped);
+    }
+    int status{};
+    waitpid(child, &status, 0);
+    return static_cast<StrangersFate>(WEXITSTATUS(status));
+}
+
+struct Kill
+{
+    void operator()(QProcess *process) const
+    {
+        process->kill();
+        process->waitForFinished();
+        delete process;
+    }
+};
+
+using Instance = std::unique_ptr<QProcess, Kill>;
+
+QByteArray framed(const QByteArray &text, quint32 announcedSize)
+{
+    QByteArray header(sizeof(quint32), Qt::Uninitialized);
+    qToBigEndian(announcedSize, header.data());
+    return header + text;
+}
+
+QByteArray framed(const QByteArray &text) { return framed(text, static_cast<quint32>(text.size())); }
+
+} // namespace
+
+class TestQtSingleApplication final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+
+    void laterInstanceRaisesTheFirstAndEnds();
+    void lockAndSocketOfAKilledInstanceDoNotBlock();
+    void leftOverFilesOfAnyContentDoNotBlock();
+    void oneOfTwoStartedTogetherWins();
+    void instanceThatIsJustStartingIsWaitedFor();
+    void laterInstanceGivesUpSilently();
+    void busyInstanceIsGivenUpSilently();
+    void longestMessageArrivesAndALongerOneIsRefused();
+    void nonsenseIsDropped_data();
+    void nonsenseIsDropped();
+    void silentClientIsDroppedAndKeepsNobodyWaiting();
+    void clientThatLeavesEarlyDoesNoHarm();
+    void otherUsersAreKeptOut();
+    void withoutAFolderEveryInstanceIsTheFirst_data();
+    void withoutAFolderEveryInstanceIsTheFirst();
+
+private:
+    Instance start(int timeout = 30000, int busy = 0) const;
+    Instance startFirst(int busy = 0) const;
+    static QStringList outputAtEnd(QProcess &process);
+    QString path(const char *suffix) const { return m_folder->filePath(instanceName + QLatin1String{suffix}); }
+
+    std::unique_ptr<QTemporaryDir> m_folder;
+};
+
+// Waits for a whole line.
+#define EXPECT_LINE(PROCESS, LINE)                                                                                     \
+    do {                                                                                                               \
+        QTRY_VERIFY_WITH_TIMEOUT((PROCESS)->canReadLine() || (PROCESS)->state() == QProcess::NotRunning, 30000);       \
+        QCOMPARE((PROCESS)->readLine().trimmed(), QByteArray{LINE});                                                   \
+    } while (false)
+
+void TestQtSingleApplication::init()
+{
+    m_folder = std::make_unique<QTemporaryDir>();
+    QVERIFY(m_folder->isValid());
+}
+
+void TestQtSingleApplication::cleanup() { m_folder.reset(); }
+
+Instance TestQtSingleApplication::start(int timeout, int busy) const
+{
+    Instance process{new QProcess};
+    QProcessEnvironment environment{QProcessEnvironment::systemEnvironment()};
+    environment.insert(QStringLiteral("XDG_RUNTIME_DIR"), m_folder->path());
+    process->setProcessEnvironment(environment);
+    process->setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    process->start(QStringLiteral(ORV_TEST_INSTANCE), {QString::number(timeout), QString::number(busy)});
+    return process;
+}
+
+Instance TestQtSingleApplication::startFirst(int busy) const
+{
+    auto process{start(0, busy)};
+    [&process] { EXPECT_LINE(process, "first"); }();
+    return process;
+}
+
+QStringList TestQtSingleApplication::outputAtEnd(QProcess &process)
+{
+    process.waitForFinished();
+    return QString::fromUtf8(process.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+}
+
+void TestQtSingleApplication::laterInstanceRaisesTheFirstAndEnds()
+{
+    const auto first{startFirst()};
+    const auto later{start()};
+    QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("sent"), QStringLiteral("windows: 0")}));
+    QCOMPARE(later->exitCode(), 1);
+    EXPECT_LINE(first, "message: raise");
+    EXPECT_LINE(first, "in front");
+}
+
+void TestQtSingleApplication::lockAndSocketOfAKilledInstanceDoNotBlock()
+{
+    const auto killed{startFirst()};
+    killed->kill();
+    QVERIFY(killed->waitForFinished());
+    QVERIFY(QFile::exists(path(".lock")));
+    QVERIFY(QFile::exists(path(".socket")));
+
+    const auto first{startFirst()};
+    const auto later{start()};
+    QCOMPARE(outputAtEnd(*later).value(0), QStringLiteral("sent"));
+    EXPECT_LINE(first, "message: raise");
+}
+
+// Such as a lock file with the number of a living process, or one of another machine.
+void TestQtSingleApplication::leftOverFilesOfAnyContentDoNotBlock()
+{
+    for (const char *suffix : {".lock", ".socket"}) {
+        QFile file{path(suffix)};
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.write(QByteArray::number(getpid()) + "\ninit\nanother-host\n");
+    }
+    const auto first{startFirst()};
+    const auto later{start()};
+    QCOMPARE(outputAtEnd(*later).value(0), QStringLiteral("sent"));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void TestQtSingleApplication::oneOfTwoStartedTogetherWins()
+{
+    for (int round{0}; round < 5; ++round) {
+        const auto one{start()};
+        const auto two{start()};
+        QTRY_VERIFY_WITH_TIMEOUT(one->canReadLine() && two->canReadLine(), 30000);
+        QStringList lines{QString::fromUtf8(one->readLine()).trimmed(), QString::fromUtf8(two->readLine()).trimmed()};
+        const bool oneIsFirst{lines.constFirst() == QStringLiteral("first")};
+        lines.sort();
+        QCOMPARE(lines, QStringList({QStringLiteral("first"), QStringLiteral("sent")}));
+        QProcess *winner{oneIsFirst ? one.get() : two.get()};
+        QProcess *loser{oneIsFirst ? two.get() : one.get()};
+        QVERIFY(loser->state() == QProcess::NotRunning || loser->waitForFinished());
+        QCOMPARE(loser->exitCode(), 1);
+        EXPECT_LINE(winner, "message: raise");
+    }
+}
+
+void TestQtSingleApplication::instanceThatIsJustStartingIsWaitedFor()
+{
+    QFile lock{path(".lock")};
+    QVERIFY(lock.open(QIODevice::ReadWrite));
+    QCOMPARE(flock(lock.handle(), LOCK_EX), 0);
+    const auto later{start()};
+    // Long enough for it to have found nobody listening; it must not have given up.
+    QVERIFY(!later->waitForFinished(1000));
+
+    QLocalServer server;
+    QVERIFY(server.listen(path(".socket")));
+    QVERIFY(server.waitForNewConnection(30000));
+    QLocalSocket *client{server.nextPendingConnection()};
+    const QByteArray expected{framed("raise")};
+    QTRY_COMPARE_WITH_TIMEOUT(client->bytesAvailable(), qint64{expected.size()}, 30000);
+    QCOMPARE(client->readAll(), expected);
+    client->write("ack");
+    client->flush();
+    QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("sent"), QStringLiteral("windows: 0")}));
+}
+
+void TestQtSingleApplication::laterInstanceGivesUpSilently()
+{
+    QFile lock{path(".lock")};
+    QVERIFY(lock.open(QIODevice::ReadWrite));
+    QCOMPARE(flock(lock.handle(), LOCK_EX), 0);
+    const auto later{start(200)};
+    QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("not sent"), QStringLiteral("windows: 0")}));
+    QCOMPARE(later->exitCode(), 1);
+}
+
+void TestQtSingleApplication::busyInstanceIsGivenUpSilently()
+{
+    const auto first{startFirst(1000000)};
+    const auto later{start(200)};
+    QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("not sent"), QStringLiteral("windows: 0")}));
+    QCOMPARE(later->exitCode(), 1);
+}
+
+void TestQtSingleApplication::longestMessageArrivesAndALongerOneIsRefused()
+{
+    const auto first{startFirst()};
+    SingleInstance later{m_folder->path(), instanceName};
+    QVERIFY(later.isOtherRunning());
+    QVERIFY(later.send(QString{64 * 1024, QLatin1Char{'x'}}, 30000));
+    EXPECT_LINE(first, "message: 65536");
+    EXPECT_LINE(first, "in front");
+    QVERIFY(!later.send(QString{64 * 1024 + 1, QLatin1Char{'x'}}, 30000));
+    QVERIFY(later.send(QString::fromUtf8("grüße\n"), 30000));
+    EXPECT_LINE(first, "message: grüße");
+}
+
+void TestQtSingleApplication::nonsenseIsDropped_data()
+{
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::addRow("garbage") << QByteArray::fromHex("fffe00010203deadbeef");
+    QTest::addRow("text") << QByteArrayLiteral("GET / HTTP/1.0\r\n\r\n");
+    QTest::addRow("one byte too long") << framed(QByteArray(64 * 1024 + 1, 'x'));
+    QTest::addRow("many megabytes") << framed(QByteArray(32 * 1024 * 1024, 'x'));
+    QTest::addRow("the longest length") << framed({}, 0xffffffff);
+}
+
+void TestQtSingleApplication::nonsenseIsDropped()
+{
+    QFETCH(const QByteArray, bytes);
+    const auto first{startFirst()};
+    QLocalSocket client;
+    QSignalSpy disconnected{&client, &QLocalSocket::disconnected};
+    client.connectToServer(path(".socket"));
+    QVERIFY(client.waitForConnected(30000));
+    client.write(bytes);
+    QTRY_COMPARE_WITH_TIMEOUT(disconnected.count(), 1, 30000);
+    QCOMPARE(client.readAll(), QByteArray{});
+
+    SingleInstance later{m_folder->path(), instanceName};
+    QVERIFY(later.send(QStringLiteral("raise"), 30000));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void TestQtSingleApplication::silentClientIsDroppedAndKeepsNobodyWaiting()
+{
+    const auto first{startFirst()};
+    QLocalSocket silent;
+    QLocalSocket halfway;
+    QSignalSpy silentDropped{&silent, &QLocalSocket::disconnected};
+    QSignalSpy halfwayDropped{&halfway, &QLocalSocket::disconnected};
+    silent.connectToServer(path(".socket"));
+    halfway.connectToServer(path(".socket"));
+    QVERIFY(silent.waitForConnected(30000));
+    QVERIFY(halfway.waitForConnected(30000));
+    halfway.write(framed("ra", 5));
+
+    SingleInstance later{m_folder->path(), instanceName};
+    QVERIFY(later.send(QStringLiteral("raise"), 30000));
+    EXPECT_LINE(first, "message: raise");
+    EXPECT_LINE(first, "in front");
+    QTRY_COMPARE_WITH_TIMEOUT(silentDropped.count(), 1, 30000);
+    QTRY_COMPARE_WITH_TIMEOUT(halfwayDropped.count(), 1, 30000);
+    QVERIFY(!first->canReadLine());
+}
+
+void TestQtSingleApplication::clientThatLeavesEarlyDoesNoHarm()
+{
+    const auto first{startFirst()};
+    for (const QByteArray &bytes : {QByteArray{}, framed("ra", 5), framed("left")}) {
+        QLocalSocket client;
+        client.connectToServer(path(".socket"));
+        QVERIFY(client.waitForConnected(30000));
+        client.write(bytes);
+        client.flush();
+        client.abort();
+    }
+    EXPECT_LINE(first, "message: left");
+    EXPECT_LINE(first, "in front");
+    SingleInstance later{m_folder->path(), instanceName};
+    QVERIFY(later.send(QStringLiteral("raise"), 30000));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void TestQtSingleApplication::otherUsersAreKeptOut()
+{
+    if (geteuid() != 0)
+        QSKIP("only the superuser can act as another user");
+    const auto first{startFirst()};
+    QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Refused);
+
+    // With the folder and the socket open to everybody the server itself must tell users apart.
+    QCOMPARE(chmod(QFile::encodeName(m_folder->path()).constData(), 0755), 0);
+    QCOMPARE(chmod(QFile::encodeName(path(".socket")).constData(), 0777), 0);
+    QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Dropped);
+
+    SingleInstance later{m_folder->path(), instanceName};
+    QVERIFY(later.send(QStringLiteral("raise"), 30000));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void TestQtSingleApplication::withoutAFolderEveryInstanceIsTheFirst_data()
+{
+    QTest::addColumn<QString>("folder");
+    QTest::addRow("none") << QString{};
+    QTest::addRow("missing") << QStringLiteral("/nonexistent");
+}
+
+void TestQtSingleApplication::withoutAFolderEveryInstanceIsTheFirst()
+{
+    QFETCH(const QString, folder);
+    SingleInstance one{folder, instanceName};
+    SingleInstance two{folder, instanceName};
+    QVERIFY(!one.isOtherRunning());
+    QVERIFY(!two.isOtherRunning());
+    QVERIFY(!two.send(QStringLiteral("raise"), 1000));
+}
+
+QTEST_GUILESS_MAIN(TestQtSingleApplication)
+#include "tst_qtsingleapplication.moc"

@@ -1,0 +1,167 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "platform/runtimedirectory.h"
+
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include <memory>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace {
+
+constexpr uid_t otherUser{65534};
+
+} // namespace
+
+class TestRuntimeDirectory final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+
+    void sessionsDirectoryIsUsedWhenPrivate();
+    void othersAreNot_data();
+    void othersAreNot();
+    void folderOfAnotherUserIsNotPrivate();
+    void ownFolderIsMadePrivate();
+    void ownFolderMustBePrivate_data();
+    void ownFolderMustBePrivate();
+    void ownFolderIsNeverBelowTmp();
+
+private:
+    QString folder(const QString &name, mode_t mode) const;
+    // A machine may have one for this user, which then stands before the program's own.
+    QString expectedFallback() const { return isPrivateDirectory(m_ofUser) ? m_ofUser : own(); }
+    QString own() const { return m_folder->filePath(QStringLiteral("made/own")); }
+
+    const QString m_ofUser{QStringLiteral("/run/user/") + QString::number(geteuid())};
+    std::unique_ptr<QTemporaryDir> m_folder;
+};
+
+void TestRuntimeDirectory::init()
+{
+    m_folder = std::make_unique<QTemporaryDir>();
+    QVERIFY(m_folder->isValid());
+}
+
+void TestRuntimeDirectory::cleanup()
+{
+    qunsetenv("XDG_RUNTIME_DIR");
+    m_folder.reset();
+}
+
+QString TestRuntimeDirectory::folder(const QString &name, mode_t mode) const
+{
+    const QString path{m_folder->filePath(name)};
+    QDir{}.mkpath(path);
+    chmod(QFile::encodeName(path).constData(), mode);
+    return path;
+}
+
+void TestRuntimeDirectory::sessionsDirectoryIsUsedWhenPrivate()
+{
+    const QString session{folder(QStringLiteral("session"), 0700)};
+    qputenv("XDG_RUNTIME_DIR", QFile::encodeName(session));
+    QCOMPARE(runtimeDirectory(own()), session);
+    QVERIFY(!QFile::exists(own()));
+}
+
+void TestRuntimeDirectory::othersAreNot_data()
+{
+    QTest::addColumn<QString>("session"); // {} stands for the test's folder
+    QTest::addRow("unset") << QString{};
+    QTest::addRow("relative") << QStringLiteral("relative");
+    QTest::addRow("missing") << QStringLiteral("{}/missing");
+    QTest::addRow("a file") << QStringLiteral("{}/file");
+    QTest::addRow("open to everybody") << QStringLiteral("{}/open");
+    QTest::addRow("open to the group") << QStringLiteral("{}/group");
+    QTest::addRow("readable by others") << QStringLiteral("{}/readable");
+    QTest::addRow("symbolic link") << QStringLiteral("{}/link");
+    QTest::addRow("symbolic link and slash") << QStringLiteral("{}/link/");
+}
+
+void TestRuntimeDirectory::othersAreNot()
+{
+    QFETCH(QString, session);
+    const QString here{QDir::currentPath()};
+    QVERIFY(QDir::setCurrent(m_folder->path()));
+    folder(QStringLiteral("relative"), 0700);
+    folder(QStringLiteral("open"), 0777);
+    folder(QStringLiteral("group"), 0770);
+    folder(QStringLiteral("readable"), 0705);
+    QVERIFY(QFile::link(folder(QStringLiteral("session"), 0700), m_folder->filePath(QStringLiteral("link"))));
+    QFile file{m_folder->filePath(QStringLiteral("file"))};
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    QVERIFY(file.setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+
+    if (!session.isEmpty())
+        qputenv("XDG_RUNTIME_DIR", QFile::encodeName(session.replace(QStringLiteral("{}"), m_folder->path())));
+    QCOMPARE(runtimeDirectory(own()), expectedFallback());
+    QVERIFY(QDir::setCurrent(here));
+}
+
+void TestRuntimeDirectory::folderOfAnotherUserIsNotPrivate()
+{
+    if (geteuid() != 0)
+        QSKIP("only the superuser can give a folder away");
+    const QString session{folder(QStringLiteral("session"), 0700)};
+    QVERIFY(isPrivateDirectory(session));
+    QCOMPARE(chown(QFile::encodeName(session).constData(), otherUser, otherUser), 0);
+    QVERIFY(!isPrivateDirectory(session));
+    qputenv("XDG_RUNTIME_DIR", QFile::encodeName(session));
+    QCOMPARE(runtimeDirectory(own()), expectedFallback());
+}
+
+void TestRuntimeDirectory::ownFolderIsMadePrivate()
+{
+    QVERIFY(makePrivateDirectory(own()));
+    struct stat status
+    {
+    };
+    QCOMPARE(lstat(QFile::encodeName(own()).constData(), &status), 0);
+    QCOMPARE(status.st_mode, mode_t{S_IFDIR | 0700});
+    QVERIFY(makePrivateDirectory(own()));
+}
+
+void TestRuntimeDirectory::ownFolderMustBePrivate_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addRow("open to everybody") << QStringLiteral("open");
+    QTest::addRow("symbolic link") << QStringLiteral("link");
+    QTest::addRow("symbolic link to nothing") << QStringLiteral("dangling");
+    QTest::addRow("a file") << QStringLiteral("file");
+    QTest::addRow("below a file") << QStringLiteral("file/below");
+}
+
+void TestRuntimeDirectory::ownFolderMustBePrivate()
+{
+    QFETCH(const QString, name);
+    folder(QStringLiteral("open"), 0777);
+    QVERIFY(QFile::link(folder(QStringLiteral("target"), 0700), m_folder->filePath(QStringLiteral("link"))));
+    QVERIFY(QFile::link(m_folder->filePath(QStringLiteral("nothing")), m_folder->filePath(QStringLiteral("dangling"))));
+    QFile file{m_folder->filePath(QStringLiteral("file"))};
+    QVERIFY(file.open(QIODevice::WriteOnly));
+
+    QVERIFY(!makePrivateDirectory(m_folder->filePath(name)));
+    QVERIFY(!QFile::exists(m_folder->filePath(QStringLiteral("nothing"))));
+    if (!isPrivateDirectory(m_ofUser))
+        QCOMPARE(runtimeDirectory(m_folder->filePath(name)), QString{});
+}
+
+void TestRuntimeDirectory::ownFolderIsNeverBelowTmp()
+{
+    const QString own{ownRuntimeDirectory()};
+    QVERIFY(own.endsWith(QStringLiteral("/orv-admin-dhcp")));
+    if (geteuid() == 0)
+        QCOMPARE(own, QStringLiteral("/run/orv-admin-dhcp"));
+    QVERIFY(!own.startsWith(QStringLiteral("/tmp/")));
+}
+
+QTEST_GUILESS_MAIN(TestRuntimeDirectory)
+#include "tst_runtimedirectory.moc"
