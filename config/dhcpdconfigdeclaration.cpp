@@ -36,6 +36,16 @@ DhcpdConfigDeclaration *DhcpdConfigDeclaration::addDeclaration(std::unique_ptr<D
     return append(makeChildren().declarations, std::move(declaration));
 }
 
+DhcpdConfigParam *DhcpdConfigDeclaration::addParam(const QStringList &words)
+{
+    return addParam(std::make_unique<DhcpdConfigParam>(words, this));
+}
+
+DhcpdConfigDeclaration *DhcpdConfigDeclaration::addDeclaration(const QStringList &words)
+{
+    return addDeclaration(std::make_unique<DhcpdConfigDeclaration>(words, this));
+}
+
 void DhcpdConfigDeclaration::removeChild(DhcpdConfigStatement *statement)
 {
     const bool found{m_children && (eraseFound(m_children->parameters, statement) ||

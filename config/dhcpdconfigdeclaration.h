@@ -22,6 +22,9 @@ public:
     /// Appends a statement that was made with this declaration as its parent.
     DhcpdConfigParam *addParam(std::unique_ptr<DhcpdConfigParam> param);
     DhcpdConfigDeclaration *addDeclaration(std::unique_ptr<DhcpdConfigDeclaration> declaration);
+    /// Makes a statement of `words` and appends it.
+    DhcpdConfigParam *addParam(const QStringList &words);
+    DhcpdConfigDeclaration *addDeclaration(const QStringList &words);
 
     void removeChild(DhcpdConfigStatement *statement) override;
     bool removeChildren(int row, int count) override;

@@ -45,8 +45,47 @@ public:
     /// The bytes that write() puts into the file.
     QByteArray fileContent() const;
 
+    // The operations below add statements at the end of those of their sort under the statement of `parent`. What they
+    // refuse, with an error(), changes nothing. A reset tells of statements that came or went.
+
+    void addSharedNetwork(const QString &name, const QModelIndex &parent);
+    /// `mask` is a netmask, a prefix length, or empty when `address` has one.
+    void addSubnet(const QString &address, const QString &mask, const QModelIndex &parent);
+    /// The first and the last address for hosts in the subnet that the text names; both empty when it names none.
+    static QStringList defaultRange(const QString &subnet);
+    void addRange(const QString &start, const QString &end, const QModelIndex &parent);
+    /// `mac` and `address` may be empty. An invalid one does not stop the host: it becomes all zeros, or is left out.
+    void addHost(const QString &name, const QString &mac, const QString &address, const QModelIndex &parent);
+    /// Replaces the address that the host has already.
+    void addFixedAddress(const QString &address, const QModelIndex &parent);
+    /// Adds zones and keys for dynamic DNS updates: what bind9::prepared() returns.
+    bool addBind9(const QStringList &statements, const QModelIndex &parent);
+    bool addDeclaration(const QStringList &words, const QModelIndex &parent);
+    bool addParameter(const QStringList &words, const QModelIndex &parent);
+
+    // These replace the value of the first such parameter that the declaration has.
+
+    bool addLeaseTime(const QString &keyword, const QString &seconds, const QModelIndex &parent);
+    bool addDefaultLeaseTime(const QString &seconds, const QModelIndex &parent);
+    bool addMaxLeaseTime(const QString &seconds, const QModelIndex &parent);
+    /// Lists are addresses with commas between them.
+    void addRouters(const QString &list, const QModelIndex &parent);
+    void addDnsServers(const QString &list, const QModelIndex &parent);
+    void addNtpServers(const QString &list, const QModelIndex &parent);
+    /// `name` comes with its double quotes.
+    void addDomainName(const QString &name, const QModelIndex &parent);
+
+    /// Adds the value of the option for routes, and its definition unless the declaration or the one around it has it.
+    void addStaticRoutes(const QStringList &routes, bool ms, const QModelIndex &parent);
+
+    /// Puts `words` in the place of all words of a statement, without a reset; nothing is modified when it has them
+    /// already. False for the nodes above the file's statements.
+    bool replaceWords(const QModelIndex &index, const QStringList &words);
     /// Takes a statement with everything under it out of the tree.
     void removeStatement(const QModelIndex &index);
+
+    /// The names, without quotes, of the keys that the configuration declares.
+    QStringList keyNames() const;
 
 signals:
     /// A message for the user.
@@ -63,6 +102,12 @@ public slots:
 private:
     bool parseUtf8(const QByteArray &text);
     void setModified();
+    /// Runs `change`, which adds or removes statements, within a reset.
+    template<typename Change>
+    void changeTree(Change change);
+    /// The declaration of `index`; null when its statement is a parameter.
+    DhcpdConfigDeclaration *declarationFor(const QModelIndex &index) const;
+    QString keywordFor(const QModelIndex &index) const { return statementFor(index)->keyword(); }
     QIcon themeIcon(const QString &name) const;
 
     bool setParamValue(DhcpdConfigParam *param, const QVariant &value);
@@ -74,6 +119,9 @@ private:
     bool setIpValue(DhcpdConfigStatement *statement, const QString &text);
     bool setMacValue(DhcpdConfigStatement *statement, const QString &text);
     bool setRangeValue(DhcpdConfigStatement *statement, const QString &text);
+
+    struct OptionKind;
+    void addOption(const OptionKind &kind, const QString &value, const QModelIndex &parent);
     /// Emits error() and returns false.
     bool refuse(const QString &message);
 
@@ -82,3 +130,12 @@ private:
     TextEncoding m_encoding; // of the file that was read last
     mutable QHash<QString, QIcon> m_icons;
 };
+
+template<typename Change>
+void DhcpdConfigModel::changeTree(Change change)
+{
+    beginResetModel();
+    change();
+    endResetModel();
+    setModified();
+}

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-// The edit operations of the configuration model.
+// What the configuration model does to any statement.
 #include "config/dhcpdconfigmodel.h"
 
 bool DhcpdConfigModel::removeRows(int row, int count, const QModelIndex &parent)
@@ -23,8 +23,26 @@ void DhcpdConfigModel::removeStatement(const QModelIndex &index)
     DhcpdConfigDeclaration *const parentNode{statement->parent()};
     if (!parentNode)
         return;
-    beginResetModel();
-    parentNode->removeChild(statement);
-    endResetModel();
-    setModified();
+    changeTree([=] { parentNode->removeChild(statement); });
+}
+
+bool DhcpdConfigModel::replaceWords(const QModelIndex &index, const QStringList &words)
+{
+    DhcpdConfigStatement *const statement{statementFor(index)};
+    if (statement->isRoot())
+        return false;
+    QStringList oldWords;
+    for (const std::string_view word : statement->words())
+        oldWords += decodedWord(word);
+    if (words != oldWords) {
+        statement->setWordsFrom(0, words);
+        setModified();
+    }
+    return true;
+}
+
+DhcpdConfigDeclaration *DhcpdConfigModel::declarationFor(const QModelIndex &index) const
+{
+    DhcpdConfigStatement *const statement{statementFor(index)};
+    return statement->isDeclaration() ? static_cast<DhcpdConfigDeclaration *>(statement) : nullptr;
 }

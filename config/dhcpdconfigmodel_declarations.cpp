@@ -1,0 +1,192 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// The operations of the configuration model that add declarations, and statements of any words.
+#include "config/addresses.h"
+#include "config/bind9reader.h"
+#include "config/dhcpdconfigmodel.h"
+#include "config/patterns.h"
+
+#include <algorithm>
+
+namespace {
+
+constexpr int wordsOfLine{2};
+constexpr int wordsOfBlock{3 * wordsOfLine};
+
+constexpr QLatin1Char blank{' '};
+constexpr QLatin1Char quote{'"'};
+
+bool isRootOrGroup(const DhcpdConfigDeclaration *declaration)
+{
+    return declaration && (declaration->isRoot() || declaration->isGroup());
+}
+
+bool takesAnything(const DhcpdConfigDeclaration *declaration)
+{
+    return declaration && !declaration->isRange() && !declaration->isSubclass();
+}
+
+QStringList fixedAddressWords(const QHostAddress &address)
+{
+    return {QStringLiteral("fixed-address"), address.toString()};
+}
+
+void appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaration)
+{
+    if (declaration.isKeyDeclaration())
+        names += bind9::unquoted(declaration.word(1));
+    for (const auto &child : declaration.declarations())
+        appendKeyNames(names, *child);
+}
+
+} // namespace
+
+void DhcpdConfigModel::addSharedNetwork(const QString &name, const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    if (!isRootOrGroup(holder))
+        refuse(tr("Error adding shared-network. Can not add shared-network to '%1'").arg(keywordFor(parent)));
+    else
+        changeTree([&] { holder->addDeclaration({QStringLiteral("shared-network"), name}); });
+}
+
+void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, const QModelIndex &parent)
+{
+    const QString text{mask.isEmpty() ? address : address + QLatin1Char{'/'} + mask};
+    const auto subnet = addresses::parseSubnet(text);
+    auto *const holder = declarationFor(parent);
+    if (!subnet)
+        refuse(tr("Error adding subnet. Invalid subnet '%1'").arg(text));
+    else if (!isRootOrGroup(holder) && !(holder && holder->isSharedNetwork()))
+        refuse(tr("Error adding subnet. Can not add subnet to '%1'").arg(keywordFor(parent)));
+    else
+        changeTree([&] {
+            holder->addDeclaration({QStringLiteral("subnet"), subnet->ip().toString(), QStringLiteral("netmask"),
+                                    subnet->netmask().toString()});
+        });
+}
+
+QStringList DhcpdConfigModel::defaultRange(const QString &subnet)
+{
+    const auto entry = addresses::parseSubnet(subnet);
+    if (!entry)
+        return {QString{}, QString{}};
+    const quint32 base{entry->ip().toIPv4Address()};
+    const quint32 hostBits{~entry->netmask().toIPv4Address()};
+    const quint32 first{base + 1}; // deliberately also where it lies behind the last
+    const quint32 last{base + (hostBits > 1 ? hostBits - 1 : hostBits)};
+    return {QHostAddress{first}.toString(), QHostAddress{last}.toString()};
+}
+
+void DhcpdConfigModel::addRange(const QString &start, const QString &end, const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    const bool isSubnet{holder && holder->isSubnet()};
+    const auto subnet = isSubnet ? addresses::subnetOf(*holder) : std::nullopt;
+    const QHostAddress first{start};
+    const QHostAddress last{end};
+    if (holder && holder->wordCount() < 3) // before the kind of the declaration, deliberately
+        refuse(tr("Error adding range. Invalid attributes of parent subnet"));
+    else if (!isSubnet)
+        refuse(tr("Error adding range. Can not add range to '%1'").arg(keywordFor(parent)));
+    else if (!subnet)
+        refuse(tr("Error adding range. Invalid parent subnet"));
+    else if (!addresses::isUsableIn(*subnet, first))
+        refuse(tr("Error adding range. Invalid start IP '%1'").arg(start));
+    else if (!addresses::isUsableIn(*subnet, last) || last.toIPv4Address() < first.toIPv4Address())
+        refuse(tr("Error adding range. Invalid end IP '%1'").arg(end));
+    else
+        changeTree([&] { holder->addDeclaration({QStringLiteral("range"), first.toString(), last.toString()}); });
+}
+
+void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QString &address,
+                               const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    if (!isRootOrGroup(holder)) {
+        refuse(tr("Error adding host. Can not add host to '%1'").arg(keywordFor(parent)));
+        return;
+    }
+    if (name.isEmpty()) {
+        refuse(tr("Error adding host. Host name can not be empty."));
+        return;
+    }
+    const bool isOneWord{!name.contains(blank)};
+    const bool isMac{macRegExp().match(mac).hasMatch()};
+    const QHostAddress fixedAddress{address};
+    changeTree([&] {
+        auto *const host = holder->addDeclaration({QStringLiteral("host"), isOneWord ? name : quote + name + quote});
+        if (!mac.isEmpty())
+            host->addParam({QStringLiteral("hardware"), QStringLiteral("ethernet"),
+                            isMac ? mac : QStringLiteral("00:00:00:00:00:00")});
+        if (addresses::isUsable(fixedAddress))
+            host->addDeclaration(fixedAddressWords(fixedAddress));
+    });
+}
+
+void DhcpdConfigModel::addFixedAddress(const QString &address, const QModelIndex &parent)
+{
+    auto *const host = declarationFor(parent);
+    const QHostAddress fixedAddress{address};
+    if (!host || !host->isHost()) {
+        refuse(tr("Error adding fixed address. Can not add to '%1'").arg(keywordFor(parent)));
+        return;
+    }
+    if (!addresses::isUsable(fixedAddress)) {
+        refuse(tr("Error adding fixed address. Invalid IP '%1'").arg(address));
+        return;
+    }
+    const auto &children = host->declarations();
+    const auto old =
+        std::find_if(children.begin(), children.end(), [](const auto &child) { return child->isFixedAddress(); });
+    if (old == children.end()) {
+        changeTree([&] { host->addDeclaration(fixedAddressWords(fixedAddress)); });
+    } else {
+        (*old)->setWordsFrom(1, {fixedAddress.toString()});
+        setModified();
+    }
+}
+
+bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    if (!isRootOrGroup(holder))
+        return refuse(tr("Error adding bind9. Can not add bind9 to '%1'").arg(keywordFor(parent)));
+    if (statements.isEmpty())
+        return refuse(tr("Error adding bind9. bind9 can not be empty."));
+    changeTree([&] {
+        DhcpdConfigDeclaration *block{};
+        for (int i{}; i < statements.size(); i += wordsOfLine) {
+            const QStringList words{(statements.at(i) + blank + statements.value(i + 1)).split(blank)};
+            if (i % wordsOfBlock == 0)
+                block = holder->addDeclaration(words);
+            else
+                block->addParam(words);
+        }
+    });
+    return true;
+}
+
+bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    if (!takesAnything(holder))
+        return refuse(tr("Error adding declaration. Can not add declaration to '%1'").arg(keywordFor(parent)));
+    changeTree([&] { holder->addDeclaration(words); });
+    return true;
+}
+
+bool DhcpdConfigModel::addParameter(const QStringList &words, const QModelIndex &parent)
+{
+    auto *const holder = declarationFor(parent);
+    if (!takesAnything(holder))
+        return refuse(tr("Error adding parameter. Can not add parameter to '%1'").arg(keywordFor(parent)));
+    changeTree([&] { holder->addParam(words); });
+    return true;
+}
+
+QStringList DhcpdConfigModel::keyNames() const
+{
+    QStringList names;
+    appendKeyNames(names, *m_topNode);
+    return names;
+}

@@ -1,0 +1,68 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "config/dhcpdconfigmodel.h"
+
+#include <QSignalSpy>
+
+#include <functional>
+
+/// An edit of a configuration and what comes of it.
+struct EditCase
+{
+    using Edit = std::function<void(DhcpdConfigModel &model, const QModelIndex &index)>;
+
+    QString before; ///< a configuration
+    QString target; ///< the statement whose index `edit` gets, see EditedModel::find()
+    Edit edit;
+    QString after; ///< the outline that comes of it, see EditedModel::outline()
+    int resets{1};
+};
+Q_DECLARE_METATYPE(EditCase)
+
+/// An edit that is refused with a message.
+struct Refusal
+{
+    QString before;
+    QString target;
+    EditCase::Edit edit;
+    QString error;
+};
+Q_DECLARE_METATYPE(Refusal)
+
+/// A model of a configuration, with an account of its signals.
+class EditedModel final
+{
+public:
+    explicit EditedModel(const QString &configuration);
+    Q_DISABLE_COPY_MOVE(EditedModel)
+
+    DhcpdConfigModel &model() { return m_model; }
+
+    /// The first statement whose words, joined by spaces, begin with `text`; the "All network" node for an empty text,
+    /// an invalid index for "top".
+    QModelIndex find(const QString &text) const;
+
+    /// One line a statement but the "All network" node: its words with bars between them, indented by how deep it
+    /// stands, and a brace behind a declaration.
+    QString outline() const;
+
+    /// Fails the test unless the model told of one change of everything, with that many resets, and of no error.
+    void verifyChange(int resets) const;
+    /// Fails the test unless the model told of that error only.
+    void verifyRefusal(const QString &error) const;
+
+private:
+    DhcpdConfigModel m_model;
+    QSignalSpy m_errors{&m_model, &DhcpdConfigModel::error};
+    QSignalSpy m_changes{&m_model, &QAbstractItemModel::dataChanged};
+    QSignalSpy m_resets{&m_model, &QAbstractItemModel::modelReset};
+    QSignalSpy m_resetStarts{&m_model, &QAbstractItemModel::modelAboutToBeReset};
+};
+
+/// Runs an edit and compares everything about it.
+void verifyEdit(const EditCase &edit);
+void verifyRefusal(const Refusal &refusal);
+
+/// Compares the links of every statement with the place at which it stands; fails the test when one is wrong.
+void verifyLinks(const DhcpdConfigModel &model);

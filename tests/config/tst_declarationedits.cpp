@@ -1,0 +1,388 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "tests/config/editedmodel.h"
+
+#include <QTest>
+
+namespace {
+
+using Edit = EditCase::Edit;
+
+QString text(const char *utf8) { return QString::fromUtf8(utf8); }
+
+// The words from a text that has bars between them.
+QStringList words(const char *joined) { return text(joined).split(QLatin1Char{'|'}); }
+
+Edit addSharedNetwork(const char *name)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addSharedNetwork(text(name), parent); };
+}
+
+Edit addSubnet(const char *address, const char *mask)
+{
+    return
+        [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addSubnet(text(address), text(mask), parent); };
+}
+
+Edit addRange(const char *start, const char *end)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addRange(text(start), text(end), parent); };
+}
+
+Edit addHost(const char *name, const char *mac, const char *address)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) {
+        model.addHost(text(name), text(mac), text(address), parent);
+    };
+}
+
+Edit addFixedAddress(const char *address)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addFixedAddress(text(address), parent); };
+}
+
+// Those that return whether they added anything.
+using WordsOperation = bool (DhcpdConfigModel::*)(const QStringList &words, const QModelIndex &parent);
+
+Edit addWords(WordsOperation add, const QStringList &words, bool isAdded = true)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { QCOMPARE((model.*add)(words, parent), isAdded); };
+}
+
+constexpr auto subnet = "subnet 10.0.0.0 netmask 255.255.255.0 { range 10.0.0.10 10.0.0.20; }";
+
+} // namespace
+
+class TestDeclarationEdits final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void adds_data();
+    void adds();
+    void refuses_data();
+    void refuses();
+    void computesDefaultRange_data();
+    void computesDefaultRange();
+    void removesStatement();
+    void removesNothingWithoutParent();
+    void replacesWords_data();
+    void replacesWords();
+    void doesNotReplaceWordsOfRoots();
+    void doesNotModifyWhenWordsAreTheSame();
+    void namesKeys();
+};
+
+void TestDeclarationEdits::adds_data()
+{
+    QTest::addColumn<EditCase>("edit");
+
+    const auto row = [](const char *name, const char *before, const char *target, const Edit &edit, const char *after,
+                        int resets = 1) {
+        QTest::addRow("%s", name) << EditCase{text(before), text(target), edit, text(after), resets};
+    };
+
+    row("shared network: all network", "", "", addSharedNetwork("office"), "shared-network|office {\n");
+    row("shared network: top", "", "top", addSharedNetwork("office"), "shared-network|office {\n");
+    row("shared network: group", "GROUP { }", "GROUP", addSharedNetwork("office"),
+        "GROUP| {\n shared-network|office {\n");
+    row("shared network: behind the others", "authoritative; host a { } x y;", "", addSharedNetwork("office"),
+        "authoritative|\nx|y\nhost|a {\nshared-network|office {\n");
+    row("shared network: name unchecked", "", "", addSharedNetwork("my office"), "shared-network|my office {\n");
+    row("shared network: empty name", "", "", addSharedNetwork(""), "shared-network| {\n");
+
+    row("subnet: prefix length", "", "", addSubnet("10.0.0.7", "24"), "subnet|10.0.0.0|netmask|255.255.255.0 {\n");
+    row("subnet: netmask", "", "", addSubnet("10.0.0.7", "255.255.0.0"), "subnet|10.0.0.0|netmask|255.255.0.0 {\n");
+    row("subnet: no mask", "", "", addSubnet("10.1", ""), "subnet|10.1.0.0|netmask|255.255.0.0 {\n");
+    row("subnet: prefix in the address", "", "", addSubnet("10.1.2.3/30", ""),
+        "subnet|10.1.2.0|netmask|255.255.255.252 {\n");
+    row("subnet: everything", "", "", addSubnet("0.0.0.0", "0"), "subnet|0.0.0.0|netmask|0.0.0.0 {\n");
+    row("subnet: one address", "", "", addSubnet("10.0.0.1", "32"), "subnet|10.0.0.1|netmask|255.255.255.255 {\n");
+    row("subnet: top", "", "top", addSubnet("10.0.0.0", "24"), "subnet|10.0.0.0|netmask|255.255.255.0 {\n");
+    row("subnet: group", "group { }", "group", addSubnet("10.0.0.0", "24"),
+        "group| {\n subnet|10.0.0.0|netmask|255.255.255.0 {\n");
+    row("subnet: shared network", "Shared-Network a { }", "Shared-Network", addSubnet("10.0.0.0", "24"),
+        "Shared-Network|a {\n subnet|10.0.0.0|netmask|255.255.255.0 {\n");
+    row("subnet: there already", "subnet 10.0.0.0 netmask 255.0.0.0 { }", "", addSubnet("10.0.0.0", "8"),
+        "subnet|10.0.0.0|netmask|255.0.0.0 {\nsubnet|10.0.0.0|netmask|255.0.0.0 {\n");
+
+    const auto rangeRow = [&row](const char *name, const char *start, const char *end, const char *range) {
+        row(name, subnet, "subnet", addRange(start, end),
+            qPrintable(QStringLiteral("subnet|10.0.0.0|netmask|255.255.255.0 {\n range|10.0.0.10|10.0.0.20 {\n %1 {\n")
+                           .arg(text(range))));
+    };
+    rangeRow("range", "10.0.0.30", "10.0.0.40", "range|10.0.0.30|10.0.0.40");
+    rangeRow("range: one address", "10.0.0.30", "10.0.0.30", "range|10.0.0.30|10.0.0.30");
+    rangeRow("range: overlap", "10.0.0.10", "10.0.0.20", "range|10.0.0.10|10.0.0.20");
+    rangeRow("range: first and last of the subnet", "10.0.0.0", "10.0.0.255", "range|10.0.0.0|10.0.0.255");
+    rangeRow("range: normalised", "10.0.30", "10.40", "range|10.0.0.30|10.0.0.40");
+
+    row("host", "", "", addHost("pc", "00:11:22:33:44:55", "10.0.0.5"),
+        "host|pc {\n hardware|ethernet|00:11:22:33:44:55\n fixed-address|10.0.0.5 {\n");
+    row("host: top", "", "top", addHost("pc", "", ""), "host|pc {\n");
+    row("host: group", "group g { }", "group", addHost("pc", "", ""), "group|g {\n host|pc {\n");
+    row("host: name alone", "", "", addHost("pc", "", ""), "host|pc {\n");
+    row("host: name with a space", "", "", addHost("my pc", "", ""), "host|\"my pc\" {\n");
+    row("host: name of a space", "", "", addHost(" ", "", ""), "host|\" \" {\n");
+    row("host: name with a tab", "", "", addHost("my\tpc", "", ""), "host|my\tpc {\n");
+    row("host: quoted name", "", "", addHost("\"my pc\"", "", ""), "host|\"\"my pc\"\" {\n");
+    row("host: invalid MAC", "", "", addHost("pc", "zz", ""), "host|pc {\n hardware|ethernet|00:00:00:00:00:00\n");
+    row("host: loose MAC", "", "", addHost("pc", "x 0011.2233.4455", ""),
+        "host|pc {\n hardware|ethernet|x 0011.2233.4455\n");
+    row("host: normalised address", "", "", addHost("pc", "", "10.5"), "host|pc {\n fixed-address|10.0.0.5 {\n");
+    row("host: null address", "", "", addHost("pc", "", "0.0.0.0"), "host|pc {\n fixed-address|0.0.0.0 {\n");
+    for (const char *address : {"127.0.0.1", "255.255.255.255", "10.0.0.256", "a name"})
+        row(qPrintable(QStringLiteral("host: address %1").arg(text(address))), "", "", addHost("pc", "", address),
+            "host|pc {\n");
+    row("host: there already", "host pc { }", "", addHost("pc", "", ""), "host|pc {\nhost|pc {\n");
+
+    row("fixed address", "host a { }", "host", addFixedAddress("10.0.0.5"), "host|a {\n fixed-address|10.0.0.5 {\n");
+    row("fixed address: normalised", "HOST a { }", "HOST", addFixedAddress("10.5"),
+        "HOST|a {\n fixed-address|10.0.0.5 {\n");
+    row("fixed address: replaces", "host a { Fixed-Address old; }", "host", addFixedAddress("10.0.0.5"),
+        "host|a {\n Fixed-Address|10.0.0.5 {\n", 0);
+    row("fixed address: replaces the first", "host a { x { } fixed-address b, c d; fixed-address e; }", "host",
+        addFixedAddress("10.5"), "host|a {\n x| {\n fixed-address|10.0.0.5 {\n fixed-address|e {\n", 0);
+
+    row("declaration", "", "", addWords(&DhcpdConfigModel::addDeclaration, words("pool|a b||\"c")),
+        "pool|a b||\"c {\n");
+    row("declaration: top", "", "top", addWords(&DhcpdConfigModel::addDeclaration, words("pool")), "pool {\n");
+    row("declaration: subnet", "subnet a { }", "subnet", addWords(&DhcpdConfigModel::addDeclaration, words("pool|")),
+        "subnet|a {\n pool| {\n");
+    row("declaration: fixed address", "fixed-address a;", "fixed",
+        addWords(&DhcpdConfigModel::addDeclaration, words("b")), "fixed-address|a {\n b {\n");
+    row("parameter", "", "", addWords(&DhcpdConfigModel::addParameter, words("option|a b||\"c")), "option|a b||\"c\n");
+    row("parameter: before declarations", "a { } b c;", "",
+        addWords(&DhcpdConfigModel::addParameter, words("authoritative")), "b|c\nauthoritative\na| {\n");
+    row("parameter: named as a declaration", "", "", addWords(&DhcpdConfigModel::addParameter, words("range|a|b")),
+        "range|a|b\n");
+
+    row("bind9", "", "",
+        addWords(&DhcpdConfigModel::addBind9,
+                 words("key|\"k\"|algorithm|hmac-md5|secret|\"YQ==\"|zone|a.|primary|127.0.0.1|key|\"k\"")),
+        "key|\"k\" {\n algorithm|hmac-md5\n secret|\"YQ==\"\nzone|a. {\n primary|127.0.0.1\n key|\"k\"\n");
+    row("bind9: group", "group { }", "group",
+        addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary|127.0.0.1|key|k")),
+        "group| {\n zone|a. {\n  primary|127.0.0.1\n  key|k\n");
+    row("bind9: group of four words shifts the next", "", "",
+        addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|key|k")),
+        "zone|a. {\n primary|127.0.0.1\n zone|b.\nprimary|127.0.0.1 {\n key|k\n");
+    row("bind9: cut short", "", "top", addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary")),
+        "zone|a. {\n primary|\n");
+    row("bind9: words with blanks", "", "", addWords(&DhcpdConfigModel::addBind9, words("zone|a b  c|x y|")),
+        "zone|a|b||c {\n x|y|\n");
+}
+
+void TestDeclarationEdits::adds()
+{
+    QFETCH(EditCase, edit);
+    verifyEdit(edit);
+}
+
+void TestDeclarationEdits::refuses_data()
+{
+    QTest::addColumn<Refusal>("refusal");
+
+    const auto row = [](const char *before, const char *target, const Edit &edit, const char *error) {
+        QTest::addRow("%s: %s: %s", error, before, target) << Refusal{text(before), text(target), edit, text(error)};
+    };
+    // What is no place for `operation`, and the message that names it.
+    const auto holderRows = [&row](const std::vector<std::pair<const char *, const char *>> &holders, const Edit &edit,
+                                   const char *error) {
+        for (const auto &[holder, keyword] : holders)
+            row(holder, keyword, edit, qPrintable(text(error).arg(text(keyword))));
+    };
+
+    holderRows({{"host a { }", "host"}, {"Subnet a { }", "Subnet"}, {"range a b;", "range"}, {"group;", "group"}},
+               addSharedNetwork("a"), "Error adding shared-network. Can not add shared-network to '%1'");
+    row("shared-network a { }", "shared-network", addSharedNetwork("a"),
+        "Error adding shared-network. Can not add shared-network to 'shared-network'");
+
+    for (const auto &[address, mask, shown] : {
+             std::tuple{"10.0.0.0", "33", "10.0.0.0/33"},
+             std::tuple{"10.0.0.0", "255.0.255.0", "10.0.0.0/255.0.255.0"},
+             std::tuple{"10.0.0.0", "-1", "10.0.0.0/-1"},
+             std::tuple{"10.0.0.0/24", "24", "10.0.0.0/24/24"},
+             std::tuple{"abc", "", "abc"},
+             std::tuple{"", "", ""},
+         }) {
+        const QString error{QStringLiteral("Error adding subnet. Invalid subnet '%1'").arg(text(shown))};
+        row("", "", addSubnet(address, mask), qPrintable(error));
+        row("host a { }", "host", addSubnet(address, mask), qPrintable(error)); // before what is wrong with the parent
+    }
+    holderRows({{"host a { }", "host"},
+                {"subnet a { }", "subnet"},
+                {"pool { }", "pool"},
+                {"shared-network;", "shared-network"},
+                {"group;", "group"}},
+               addSubnet("10.0.0.0", "24"), "Error adding subnet. Can not add subnet to '%1'");
+
+    holderRows({{"subnet 10.0.0.0 netmask 255.0.0.0;", "subnet"},
+                {"a b;", "a"},
+                {"host a b { }", "host"},
+                {"pool a b c { }", "pool"}},
+               addRange("10.0.0.1", "10.0.0.2"), "Error adding range. Can not add range to '%1'");
+    for (const char *target : {"", "top", "shared-network", "pool", "subnet"})
+        row("shared-network a { pool { } } subnet a { }", target, addRange("", ""),
+            "Error adding range. Invalid attributes of parent subnet");
+    for (const char *words : {"a netmask 255.0.0.0", "10.0.0.0 netmask a", "10.0.0.0 netmask 255.0.255.0",
+                              "10.0.0.0 netmask", "10.0.0.0 255.0.0.0 netmask"})
+        row(qPrintable(QStringLiteral("subnet %1 { }").arg(text(words))), "subnet", addRange("", ""),
+            "Error adding range. Invalid parent subnet");
+    for (const char *start : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "::1"})
+        row(subnet, "subnet", addRange(start, "bad"),
+            qPrintable(QStringLiteral("Error adding range. Invalid start IP '%1'").arg(text(start))));
+    for (const char *end : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "10.0.0.4"})
+        row(subnet, "subnet", addRange("10.0.0.5", end),
+            qPrintable(QStringLiteral("Error adding range. Invalid end IP '%1'").arg(text(end))));
+    row("subnet 0.0.0.0 netmask 0.0.0.0 { }", "subnet", addRange("127.0.0.1", "128.0.0.1"),
+        "Error adding range. Invalid start IP '127.0.0.1'");
+    row("subnet 0.0.0.0 netmask 0.0.0.0 { }", "subnet", addRange("10.0.0.1", "255.255.255.255"),
+        "Error adding range. Invalid end IP '255.255.255.255'");
+
+    for (const char *name : {"pc", ""})
+        holderRows({{"subnet a { }", "subnet"},
+                    {"shared-network a { }", "shared-network"},
+                    {"host a { }", "host"},
+                    {"group;", "group"}},
+                   addHost(name, "", ""), "Error adding host. Can not add host to '%1'");
+    row("", "", addHost("", "zz", "10.0.0.1"), "Error adding host. Host name can not be empty.");
+
+    for (const char *address : {"10.0.0.1", "abc"})
+        holderRows({{"subnet a { }", "subnet"}, {"host a;", "host"}, {"group { }", "group"}}, addFixedAddress(address),
+                   "Error adding fixed address. Can not add to '%1'");
+    row("", "", addFixedAddress("10.0.0.1"), "Error adding fixed address. Can not add to 'All network'");
+    row("", "top", addFixedAddress("10.0.0.1"), "Error adding fixed address. Can not add to 'Topology'");
+    for (const char *address : {"", "abc", "127.0.0.1", "255.255.255.255"})
+        row("host a { fixed-address b; }", "host", addFixedAddress(address),
+            qPrintable(QStringLiteral("Error adding fixed address. Invalid IP '%1'").arg(text(address))));
+
+    for (const auto &[before, target] : {std::pair{"range a b;", "range"}, std::pair{"SubClass a b { }", "SubClass"},
+                                         std::pair{"option a b;", "option"}}) {
+        row(before, target, addWords(&DhcpdConfigModel::addDeclaration, words("a"), false),
+            qPrintable(QStringLiteral("Error adding declaration. Can not add declaration to '%1'").arg(text(target))));
+        row(before, target, addWords(&DhcpdConfigModel::addParameter, words("a"), false),
+            qPrintable(QStringLiteral("Error adding parameter. Can not add parameter to '%1'").arg(text(target))));
+    }
+
+    for (const QStringList &statements : {QStringList{}, words("zone|a")})
+        holderRows({{"subnet a { }", "subnet"}, {"shared-network a { }", "shared-network"}, {"group;", "group"}},
+                   addWords(&DhcpdConfigModel::addBind9, statements, false),
+                   "Error adding bind9. Can not add bind9 to '%1'");
+    for (const char *target : {"", "top"})
+        row("", target, addWords(&DhcpdConfigModel::addBind9, {}, false),
+            "Error adding bind9. bind9 can not be empty.");
+}
+
+void TestDeclarationEdits::refuses()
+{
+    QFETCH(Refusal, refusal);
+    verifyRefusal(refusal);
+}
+
+void TestDeclarationEdits::computesDefaultRange_data()
+{
+    QTest::addColumn<QString>("subnet");
+    QTest::addColumn<QString>("range");
+
+    for (const auto &[subnet, range] : {
+             std::pair{"192.168.1.0/24", "192.168.1.1|192.168.1.254"},
+             std::pair{"192.168.1.77/24", "192.168.1.1|192.168.1.254"},
+             std::pair{"192.168.1.0/255.255.255.0", "192.168.1.1|192.168.1.254"},
+             std::pair{"10.1", "10.1.0.1|10.1.255.254"},
+             std::pair{"10.0.0.4/30", "10.0.0.5|10.0.0.6"},
+             std::pair{"10.0.0.4/31", "10.0.0.5|10.0.0.5"},
+             std::pair{"10.0.0.4/32", "10.0.0.5|10.0.0.4"},
+             std::pair{"255.255.255.255/32", "0.0.0.0|255.255.255.255"},
+             std::pair{"255.255.255.254/31", "255.255.255.255|255.255.255.255"},
+             std::pair{"0.0.0.0/0", "0.0.0.1|255.255.255.254"},
+             std::pair{"128.0.0.0/1", "128.0.0.1|255.255.255.254"},
+             std::pair{"10.0.0.0/33", "|"},
+             std::pair{"10.0.0.0/", "|"},
+             std::pair{"/", "|"},
+             std::pair{"abc", "|"},
+             std::pair{"", "|"},
+         })
+        QTest::addRow("%s", subnet) << text(subnet) << text(range);
+}
+
+void TestDeclarationEdits::computesDefaultRange()
+{
+    QFETCH(QString, subnet);
+    QFETCH(QString, range);
+    QCOMPARE(DhcpdConfigModel::defaultRange(subnet).join(QLatin1Char{'|'}), range);
+}
+
+void TestDeclarationEdits::removesStatement()
+{
+    const auto remove = [](DhcpdConfigModel &model, const QModelIndex &index) { model.removeStatement(index); };
+    const auto before = text("a b; c { d e; f { } } g { }");
+    verifyEdit({before, text("a"), remove, text("c| {\n d|e\n f| {\ng| {\n")});
+    verifyEdit({before, text("c"), remove, text("a|b\ng| {\n")});
+    verifyEdit({before, text("d"), remove, text("a|b\nc| {\n f| {\ng| {\n")});
+    verifyEdit({before, text("f"), remove, text("a|b\nc| {\n d|e\ng| {\n")});
+    verifyEdit({before, QString{}, remove, QString{}});
+}
+
+void TestDeclarationEdits::removesNothingWithoutParent()
+{
+    EditedModel edited{text("a b;")};
+    edited.model().removeStatement({});
+    QCOMPARE(edited.outline(), text("a|b\n"));
+    QVERIFY(!edited.model().isModified());
+}
+
+void TestDeclarationEdits::replacesWords_data()
+{
+    QTest::addColumn<EditCase>("edit");
+
+    const auto row = [](const char *name, const char *before, const char *target, const char *newWords,
+                        const char *after) {
+        const auto replace = [=](DhcpdConfigModel &model, const QModelIndex &index) {
+            QVERIFY(model.replaceWords(index, words(newWords)));
+        };
+        QTest::addRow("%s", name) << EditCase{text(before), text(target), replace, text(after), 0};
+    };
+    row("parameter", "a b;", "a", "c|d e|f", "c|d e|f\n");
+    row("fewer words", "a b c;", "a", "a|b", "a|b\n");
+    row("one word split", "a b;", "a", "a b", "a b\n");
+    row("empty word behind", "a b;", "a", "a|b|", "a|b|\n");
+    row("declaration", "a { b c; d { } }", "a", "x|y", "x|y {\n b|c\n d| {\n");
+    row("group", "group { }", "group", "group|x", "group|x {\n");
+    row("letter case", "a b;", "a", "A|b", "A|b\n");
+}
+
+void TestDeclarationEdits::replacesWords()
+{
+    QFETCH(EditCase, edit);
+    verifyEdit(edit);
+}
+
+void TestDeclarationEdits::doesNotReplaceWordsOfRoots()
+{
+    EditedModel edited{text("a b;")};
+    QVERIFY(!edited.model().replaceWords(edited.find(text("top")), words("x|y")));
+    QVERIFY(!edited.model().replaceWords(edited.find({}), words("x|y")));
+    QCOMPARE(edited.model().data(edited.find({})).toString(), text("All network"));
+    QCOMPARE(edited.model().headerData(0, Qt::Horizontal).toString(), text("Topology"));
+    QVERIFY(!edited.model().isModified());
+}
+
+void TestDeclarationEdits::doesNotModifyWhenWordsAreTheSame()
+{
+    EditedModel edited{text("a b; authoritative;")};
+    QSignalSpy changes{&edited.model(), &QAbstractItemModel::dataChanged};
+    QVERIFY(edited.model().replaceWords(edited.find(text("a b")), words("a|b")));
+    QVERIFY(edited.model().replaceWords(edited.find(text("auth")), words("authoritative|")));
+    QCOMPARE(changes.size(), 0);
+    QVERIFY(!edited.model().isModified());
+}
+
+void TestDeclarationEdits::namesKeys()
+{
+    EditedModel edited{
+        text("key \"a\" { } zone z { key x; } group { KEY b. { } shared-network n { key { } } } key y;")};
+    QCOMPARE(edited.model().keyNames(), words("a|b.|"));
+}
+
+QTEST_GUILESS_MAIN(TestDeclarationEdits)
+#include "tst_declarationedits.moc"
