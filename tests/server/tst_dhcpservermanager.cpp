@@ -4,6 +4,7 @@
 #include "tests/support/fakesystemctl.h"
 #include "tests/support/temporaryroot.h"
 
+#include <QDir>
 #include <QMetaEnum>
 #include <QMetaMethod>
 #include <QRegularExpression>
@@ -73,6 +74,31 @@ struct Machine
 // The verbs given after the query with which known() begins.
 QStringList afterFirstQuery(const QStringList &verbs) { return QStringList{QStringLiteral("status")} + verbs; }
 
+// While it lives, Qt's warnings are recorded.
+class WarningRecorder final
+{
+public:
+    WarningRecorder()
+        : m_former{qInstallMessageHandler(
+              [](QtMsgType, const QMessageLogContext &, const QString &message) { messages().append(message); })}
+    {
+        messages().clear();
+    }
+    ~WarningRecorder() { qInstallMessageHandler(m_former); }
+    Q_DISABLE_COPY_MOVE(WarningRecorder)
+
+    QStringList recorded() const { return messages(); }
+
+private:
+    static QStringList &messages()
+    {
+        static QStringList messages;
+        return messages;
+    }
+
+    QtMessageHandler m_former;
+};
+
 void addOperationRows()
 {
     QTest::addColumn<Slot>("operation");
@@ -133,6 +159,7 @@ private slots:
     void reportsOperationThatCannotStart_data() { addOperationRows(); }
     void reportsOperationThatCannotStart();
     void staysUpdatingWithoutSystemctl();
+    void leavesNothingBehindAfterFailures();
     void readsMuchOutputOfOperation();
     void doesNotTakeOutputOfOperationForStatus();
     void reportsEachOfManyOperationsOnce();
@@ -609,6 +636,30 @@ void TestDhcpServerManager::staysUpdatingWithoutSystemctl()
     machine->manager->runServer();
     machine->manager->checkRunning();
     QCOMPARE(machine->events.mid(2), (QStringList{busy, stopped}));
+}
+
+void TestDhcpServerManager::leavesNothingBehindAfterFailures()
+{
+    const QDir openFiles{QStringLiteral("/proc/self/fd")};
+    const auto machine = Machine::known(FakeSystemctl::Stopped);
+    // Back for the query after the failure, which is what could meet the remains of the command.
+    connect(machine->manager.get(), &DhcpServerManager::serverStateChanged, &machine->context,
+            [&machine](DhcpServerManager::ServerStates state) {
+                if (state == DhcpServerManager::Updating)
+                    machine->systemctl.setInstalled(false);
+            });
+    connect(machine->manager.get(), &DhcpServerManager::error, &machine->context,
+            [&machine] { machine->systemctl.setInstalled(true); });
+    QVector<int> openAfterRound;
+    const WarningRecorder warnings;
+    for (int round = 0; round < 3; ++round) {
+        machine->events.clear();
+        machine->manager->runServer();
+        QTRY_COMPARE(machine->events.size(), 4);
+        openAfterRound.append(openFiles.entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System).size());
+    }
+    QCOMPARE(openAfterRound, QVector<int>(3, openAfterRound.constFirst()));
+    QCOMPARE(warnings.recorded(), QStringList{}); // about descriptors that are gone
 }
 
 void TestDhcpServerManager::readsMuchOutputOfOperation()

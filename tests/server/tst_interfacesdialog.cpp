@@ -226,7 +226,14 @@ void TestInterfacesDialog::keepsButtonsOnScreen()
         QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
     QCOMPARE(dialog.focusWidget(), last);
     QVERIFY(!last->visibleRegion().isEmpty());
-    click(last);
+    QTest::keyClick(last, Qt::Key_Tab);
+    QVERIFY(buttonBox->isAncestorOf(dialog.focusWidget()));
+    QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
+    QVERIFY(buttonBox->isAncestorOf(dialog.focusWidget()));
+    QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
+    QCOMPARE(dialog.focusWidget(), checkBoxOf(dialog, interfaces.firstKey()));
+
+    QTest::keyClick(last, Qt::Key_Space);
     press(dialog, QDialogButtonBox::Save);
     QCOMPARE(dialog.result(), int{QDialog::Accepted});
     QVERIFY(dialog.interfaces().last() != interfaces.last());
