@@ -591,6 +591,6 @@ void FMain::handleAddBind9Settings()
                                                       QFileInfo{paths::bind9LocalConfiguration()}.absolutePath());
     if (file.isEmpty())
         return;
-    addTo(parent, [&] { m_configModel->addBind9(bind9::prepared(file, m_configModel->keyNames()), parent); });
+    addTo(parent, [&] { m_configModel->addBind9(bind9::prepared(file, m_configModel->keyNames(parent)), parent); });
     m_treeExpansion->expandAll();
 }

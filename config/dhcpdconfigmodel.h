@@ -84,8 +84,9 @@ public:
     /// Takes a statement with everything under it out of the tree.
     void removeStatement(const QModelIndex &index);
 
-    /// The names, without quotes, of the keys that the configuration declares.
-    QStringList keyNames() const;
+    /// The names, without quotes, of the keys that zones added under `parent` can refer to: the server knows those that
+    /// are declared before.
+    QStringList keyNames(const QModelIndex &parent = {}) const;
 
 signals:
     /// A message for the user.

@@ -30,12 +30,16 @@ QStringList fixedAddressWords(const QHostAddress &address)
     return {QStringLiteral("fixed-address"), address.toString()};
 }
 
-void appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaration)
+// The names of keys up to the end of `last`; false when that is reached.
+bool appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaration, const DhcpdConfigStatement &last)
 {
     if (declaration.isKeyDeclaration())
         names += bind9::unquoted(declaration.word(1));
-    for (const auto &child : declaration.declarations())
-        appendKeyNames(names, *child);
+    for (const auto &child : declaration.declarations()) {
+        if (!appendKeyNames(names, *child, last))
+            return false;
+    }
+    return &declaration != &last;
 }
 
 } // namespace
@@ -184,9 +188,9 @@ bool DhcpdConfigModel::addParameter(const QStringList &words, const QModelIndex 
     return true;
 }
 
-QStringList DhcpdConfigModel::keyNames() const
+QStringList DhcpdConfigModel::keyNames(const QModelIndex &parent) const
 {
     QStringList names;
-    appendKeyNames(names, *m_topNode);
+    appendKeyNames(names, *m_topNode, *statementFor(parent));
     return names;
 }

@@ -19,6 +19,7 @@ struct EditCase
     int resets{1};
 };
 Q_DECLARE_METATYPE(EditCase)
+Q_DECLARE_METATYPE(EditCase::Edit)
 
 /// An edit that is refused with a message.
 struct Refusal

@@ -380,8 +380,14 @@ void TestDeclarationEdits::doesNotModifyWhenWordsAreTheSame()
 void TestDeclarationEdits::namesKeys()
 {
     EditedModel edited{
-        text("key \"a\" { } zone z { key x; } group { KEY b. { } shared-network n { key { } } } key y;")};
-    QCOMPARE(edited.model().keyNames(), words("a|b.|"));
+        text("key \"a\" { } zone z { key x; } group g { KEY b. { } shared-network n { key { } } key c { } }"
+             "key d { } key y;")};
+    const auto namesAt = [&](const char *target) { return edited.model().keyNames(edited.find(text(target))); };
+    QCOMPARE(namesAt("top"), words("a|b.||c|d"));
+    QCOMPARE(namesAt(""), words("a|b.||c|d"));
+    QCOMPARE(namesAt("group"), words("a|b.||c"));
+    QCOMPARE(namesAt("zone"), words("a"));
+    QCOMPARE(EditedModel{text("a { }")}.model().keyNames(), QStringList{});
 }
 
 QTEST_GUILESS_MAIN(TestDeclarationEdits)

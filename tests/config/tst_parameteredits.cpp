@@ -3,8 +3,6 @@
 
 #include <QTest>
 
-Q_DECLARE_METATYPE(EditCase::Edit)
-
 namespace {
 
 using Edit = EditCase::Edit;
