@@ -148,6 +148,7 @@ void FMain::setUpLeases()
     table->setSelectionBehavior(QAbstractItemView::SelectRows);
     table->setContextMenuPolicy(Qt::CustomContextMenu);
     table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
+    table->verticalHeader()->setDefaultSectionSize(table->verticalHeader()->minimumSectionSize());
     connect(table, &QTableView::customContextMenuRequested, this, &FMain::handleTableContextMenuRequested);
     connect(table, &QTableView::doubleClicked, this, &FMain::handleTableDoubleClicked);
 

@@ -84,7 +84,7 @@ public slots:
     void handleReserveIp();
     void handleTableDoubleClicked(QModelIndex index);
     void currentTabChanged(int index);
-    void searchLease(QString name);
+    void searchLease(const QString &name);
     void selectNextLease();
     void selectPrevLease();
 

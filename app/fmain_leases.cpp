@@ -39,7 +39,7 @@ void FMain::showLeaseMatch(const QModelIndex &match)
     m_ui->dhcpdLeaseTable->scrollTo(match);
 }
 
-void FMain::searchLease(QString name)
+void FMain::searchLease(const QString &name)
 {
     m_matchPosition = 0;
     // The filter heeds letter case, the matches among what it left do not, deliberately.

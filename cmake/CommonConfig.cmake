@@ -2,6 +2,7 @@
 # The language level, warnings, hardening and Qt defines of every target, in one interface target.
 add_library(orv_common_config INTERFACE)
 target_compile_features(orv_common_config INTERFACE cxx_std_17)
+set(CMAKE_CXX_EXTENSIONS OFF) # also names the language level on every command line, for tools with another default
 target_include_directories(orv_common_config INTERFACE ${PROJECT_SOURCE_DIR})
 
 target_compile_definitions(orv_common_config INTERFACE
