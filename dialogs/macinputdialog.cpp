@@ -14,6 +14,11 @@ MacInputDialog::MacInputDialog(QWidget *parent)
 
 MacInputDialog::~MacInputDialog() = default;
 
-void MacInputDialog::setMac(const QString &text) { m_ui->mac->setText(text); }
+void MacInputDialog::setMac(const QString &text)
+{
+    m_ui->mac->setText(text);
+    // Behind the last digit of a full mask nothing can be typed.
+    m_ui->mac->setCursorPosition(0);
+}
 
 QString MacInputDialog::mac() const { return m_ui->mac->text(); }

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/routemodel.h"
+#include "tests/support/contexttranslator.h"
 
 #include <QAbstractItemModelTester>
 #include <QMetaMethod>
@@ -32,6 +33,7 @@ private slots:
     void startsEmptyWithThreeColumns();
     void headerCountsRowsFromZero_data();
     void headerCountsRowsFromZero();
+    void titlesAreTranslatedInTheContextOfTableModels();
     void addedRoutesAreAnnouncedOneByOneAtTheEnd();
     void lastRowMayBeIncomplete_data();
     void lastRowMayBeIncomplete();
@@ -76,6 +78,13 @@ void RouteModelTest::headerCountsRowsFromZero()
     QFETCH(Qt::Orientation, orientation);
     QFETCH(int, role);
     QTEST(RouteModel{}.headerData(section, orientation, role), "expected");
+}
+
+void RouteModelTest::titlesAreTranslatedInTheContextOfTableModels()
+{
+    ContextTranslator translator;
+    QCoreApplication::installTranslator(&translator);
+    QCOMPARE(RouteModel{}.headerData(1, Qt::Horizontal).toString(), QStringLiteral("QAbstractTableModel|IP net"));
 }
 
 void RouteModelTest::addedRoutesAreAnnouncedOneByOneAtTheEnd()
