@@ -140,13 +140,15 @@ std::optional<quint32> plainAddress(std::string_view text)
     return c == end ? std::optional{address} : std::nullopt;
 }
 
-/// Whether a line is a keyword with its indentation, a weekday, a time and a semicolon. `keyword` ends with a space.
-bool isTimeLine(std::string_view line, std::string_view keyword)
+/// The time in a line of a keyword with its indentation, a weekday, a time of the usual layout and a semicolon; else
+/// null. `keyword` ends with a space.
+const char *usualTime(std::string_view line, std::string_view keyword)
 {
     const std::size_t time{keyword.size() + 2};
-    return line.size() == time + LeaseTime::usualLength + 1 && startsWith(line, keyword) && line[time - 2] >= '0' &&
-           line[time - 2] <= '9' && line[time - 1] == ' ' && LeaseTime::hasUsualLayout(line.data() + time) &&
-           line.back() == ';';
+    const bool isUsual{line.size() == time + LeaseTime::usualLength + 1 && startsWith(line, keyword) &&
+                       line[time - 2] >= '0' && line[time - 2] <= '9' && line[time - 1] == ' ' &&
+                       LeaseTime::hasUsualLayout(line.data() + time) && line.back() == ';'};
+    return isUsual ? line.data() + time : nullptr;
 }
 
 /// The state in a line of a keyword with its indentation, one of the usual states and a semicolon; else empty.
@@ -160,11 +162,27 @@ std::string_view usualState(std::string_view line, std::string_view keyword)
     return usual != usualStates.end() ? *usual : std::string_view{};
 }
 
-/// Whether a line is a keyword with its indentation, one quoted text and a semicolon. `keyword` ends with the quote.
-bool isQuotedLine(std::string_view line, std::string_view keyword)
+/// The quoted text in a line of a keyword with its indentation, that text and a semicolon; else nothing. `keyword` ends
+/// with the opening quote.
+std::optional<std::string_view> usualQuoted(std::string_view line, std::string_view keyword)
 {
-    return line.size() >= keyword.size() + 2 && startsWith(line, keyword) && line.back() == ';' &&
-           closingQuote(line, keyword.size()) == line.size() - 2;
+    if (line.size() < keyword.size() + 2 || !startsWith(line, keyword) || line.back() != ';' ||
+        closingQuote(line, keyword.size()) != line.size() - 2) {
+        return {};
+    }
+    return line.substr(keyword.size(), line.size() - 2 - keyword.size());
+}
+
+/// The address in a line of the word lease, a plain address and an opening brace; else nothing.
+std::optional<quint32> usualAddress(std::string_view line)
+{
+    constexpr auto begin{"lease "sv};
+    constexpr auto end{" {"sv};
+    if (line.size() < begin.size() + end.size() || !startsWith(line, begin) ||
+        line.substr(line.size() - end.size()) != end) {
+        return {};
+    }
+    return plainAddress(line.substr(begin.size(), line.size() - end.size() - begin.size()));
 }
 
 } // namespace
@@ -244,24 +262,15 @@ bool LeaseParser::readUsualLine(std::string_view line)
     }
     switch (line[2]) {
     case 's':
-        if (isTimeLine(line, "  starts "sv)) {
-            m_values.lease.start = LeaseTime::fromUsualLayout(line.data() + "  starts 0 "sv.size());
-            return true;
-        }
-        return false;
+        return readUsualTime(line, "  starts "sv, m_values.lease.start);
     case 'e':
-        if (isTimeLine(line, "  ends "sv)) {
-            m_values.lease.end = LeaseTime::fromUsualLayout(line.data() + "  ends 0 "sv.size());
-            return true;
-        }
-        return false;
+        return readUsualTime(line, "  ends "sv, m_values.lease.end);
     case 'c':
-        if (isQuotedLine(line, "  client-hostname \""sv)) {
-            const std::size_t name{"  client-hostname \""sv.size()};
-            m_values.lease.host = add(line.substr(name, line.size() - name - "\";"sv.size()));
+        if (const auto host{usualQuoted(line, R"(  client-hostname ")"sv)}) {
+            m_values.lease.host = add(*host);
             return true;
         }
-        return isTimeLine(line, "  cltt "sv);
+        return usualTime(line, "  cltt "sv);
     case 'b':
         if (const std::string_view state{usualState(line, "  binding state "sv)}; !state.empty()) {
             setState(state);
@@ -278,30 +287,32 @@ bool LeaseParser::readUsualLine(std::string_view line)
         }
         return false;
     case 'a':
-        if (startsWith(line, "lease "sv) && line.substr(line.size() - 2) == " {"sv) {
-            const std::size_t begin{"lease "sv.size()};
-            if (line.size() < begin + 2) {
-                return false;
-            }
-            const auto address{plainAddress(line.substr(begin, line.size() - begin - 2))};
-            if (address) {
-                m_values.lease.address = *address;
-                m_values.addressText.reset();
-            }
-            return address.has_value();
+        if (const auto address{usualAddress(line)}) {
+            m_values.lease.address = *address;
+            m_values.addressText.reset();
+            return true;
         }
-        return isTimeLine(line, "  atsfp "sv);
+        return usualTime(line, "  atsfp "sv);
     case 't':
-        return isTimeLine(line, "  tstp "sv) || isTimeLine(line, "  tsfp "sv);
+        return usualTime(line, "  tstp "sv) || usualTime(line, "  tsfp "sv);
     case 'n':
         return !usualState(line, "  next binding state "sv).empty();
     case 'r':
         return !usualState(line, "  rewind binding state "sv).empty();
     case 'u':
-        return isQuotedLine(line, "  uid \""sv);
+        return usualQuoted(line, R"(  uid ")"sv).has_value();
     default:
         return false;
     }
+}
+
+bool LeaseParser::readUsualTime(std::string_view line, std::string_view keyword, LeaseTime &time)
+{
+    const char *const text{usualTime(line, keyword)};
+    if (text) {
+        time = LeaseTime::fromUsualLayout(text);
+    }
+    return text;
 }
 
 void LeaseParser::readAnyLine(std::string_view line)

@@ -46,6 +46,7 @@ private:
     void feedLines(std::string_view bytes);
     void readLine(std::string_view line);
     bool readUsualLine(std::string_view line);
+    static bool readUsualTime(std::string_view line, std::string_view keyword, LeaseTime &time);
     void readAnyLine(std::string_view line);
 
     void startBlock(std::string_view address);

@@ -13,7 +13,7 @@
 namespace {
 
 // Small enough that a piece is still in the processor's cache when it is parsed.
-constexpr std::size_t pieceSize{256 * 1024};
+constexpr std::size_t pieceSize{std::size_t{1} << 18U};
 
 // Of what was read, so much at the beginning and at the end is compared, and a sample each so many bytes.
 constexpr int comparedAtEnds{4096};

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "oddleases.h"
+#include "tests/leases/oddleases.h"
 
 #include <QRandomGenerator>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "referencereader.h"
+#include "tests/leases/referencereader.h"
 
 #include "leases/leaseparser.h"
 #include "leases/leasetable.h"
@@ -152,7 +152,7 @@ LeaseRows rowsOf(const QAbstractItemModel &model)
     for (int row{0}; row < model.rowCount(); ++row) {
         QStringList texts;
         for (int column{0}; column < model.columnCount(); ++column) {
-            texts.append(model.index(row, column).data().toString());
+            texts.append(model.data(model.index(row, column)).toString());
         }
         rows.append(texts);
     }

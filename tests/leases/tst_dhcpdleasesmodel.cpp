@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/dhcpdleasesmodel.h"
-#include "oddleases.h"
-#include "referencereader.h"
+#include "tests/leases/oddleases.h"
+#include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QAbstractItemModelTester>

@@ -1,0 +1,108 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/leasereader.h"
+#include "leases/leasetable.h"
+#include "tests/leases/oddleases.h"
+#include "tests/leases/referencereader.h"
+#include "tests/support/temporaryroot.h"
+
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTest>
+
+/// Files that change between being opened and being read.
+class TestLeaseReader final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void readsAsMuchAsThereWasWhenOpened();
+    void endsWhereTheFileWasCut_data();
+    void endsWhereTheFileWasCut();
+    void readsTheOpenedFileAfterItWasReplaced();
+    void isNotContinuedByAnother();
+
+private:
+    std::unique_ptr<QTemporaryDir> m_folder;
+    QString m_path;
+    LeaseTable m_table;
+    LeaseReader m_reader{m_table};
+};
+
+void TestLeaseReader::init()
+{
+    m_folder = std::make_unique<QTemporaryDir>();
+    m_path = m_folder->filePath(QStringLiteral("dhcpd.leases"));
+    m_reader.clear();
+}
+
+void TestLeaseReader::readsAsMuchAsThereWasWhenOpened()
+{
+    const QByteArray before{leaseBlock(0, 1, 1)};
+    const QByteArray after{before + leaseBlock(0, 2, 2)};
+    writeTestFile(m_path, before);
+    const LeaseFile file{m_path};
+    writeTestFile(m_path, after);
+    QVERIFY(m_reader.readOn(file));
+    QCOMPARE(m_reader.position(), qint64{before.size()});
+    m_table.settleAll();
+    QCOMPARE(rowsOf(m_table), referenceRows(before));
+
+    const LeaseFile grown{m_path};
+    QVERIFY(m_reader.continues(grown));
+    QVERIFY(m_reader.readOn(grown));
+    m_table.settleAll();
+    QCOMPARE(rowsOf(m_table), referenceRows(after));
+}
+
+void TestLeaseReader::endsWhereTheFileWasCut_data()
+{
+    QTest::addColumn<int>("size");
+    for (const int size : {0, 1, 100, 270, 300}) {
+        QTest::addRow("%d bytes", size) << size;
+    }
+}
+
+void TestLeaseReader::endsWhereTheFileWasCut()
+{
+    QFETCH(const int, size);
+    const QByteArray text{leaseBlock(0, 1, 1) + leaseBlock(0, 2, 2)};
+    writeTestFile(m_path, text);
+    const LeaseFile file{m_path};
+    QVERIFY(QFile::resize(m_path, size));
+    QVERIFY(m_reader.readOn(file));
+    m_table.settleAll();
+    QCOMPARE(m_reader.position(), qint64{size});
+    QCOMPARE(rowsOf(m_table), referenceRows(text.left(size)));
+}
+
+void TestLeaseReader::readsTheOpenedFileAfterItWasReplaced()
+{
+    const QByteArray text{leaseBlock(0, 1, 1)};
+    writeTestFile(m_path, text);
+    const LeaseFile file{m_path};
+    QVERIFY(QFile::remove(m_path));
+    writeTestFile(m_path, text + leaseBlock(0, 2, 2));
+    QVERIFY(m_reader.readOn(file));
+    m_table.settleAll();
+    QCOMPARE(rowsOf(m_table), referenceRows(text));
+    QVERIFY(!m_reader.continues(LeaseFile{m_path}));
+}
+
+void TestLeaseReader::isNotContinuedByAnother()
+{
+    writeTestFile(m_path, leaseBlock(0, 1, 1));
+    QVERIFY(!m_reader.continues(LeaseFile{m_path})); // nothing was read yet
+    QVERIFY(m_reader.readOn(LeaseFile{m_path}));
+    QVERIFY(m_reader.continues(LeaseFile{m_path}));
+    QVERIFY(!m_reader.continues(LeaseFile{m_folder->filePath(QStringLiteral("none"))}));
+    const QString copy{m_folder->filePath(QStringLiteral("copy"))};
+    QVERIFY(QFile::copy(m_path, copy));
+    QVERIFY(!m_reader.continues(LeaseFile{copy}));
+    m_reader.clear();
+    QVERIFY(!m_reader.continues(LeaseFile{m_path}));
+    QCOMPARE(m_table.size(), 0);
+}
+
+QTEST_GUILESS_MAIN(TestLeaseReader)
+#include "tst_leasereader.moc"
