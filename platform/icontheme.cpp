@@ -8,7 +8,6 @@
 #include <QSet>
 
 #include <algorithm>
-#include <iterator>
 #include <optional>
 #include <tuple>
 
@@ -69,10 +68,10 @@ IconThemes installedThemes(const QStringList &searchPaths)
 
 bool hasIcon(const IconTheme &theme, const QString &name)
 {
-    const QString files[]{name + QStringLiteral(".svg"), name + QStringLiteral(".png")};
-    return std::any_of(theme.folders.cbegin(), theme.folders.cend(), [&files](const QString &folder) {
-        return std::any_of(std::cbegin(files), std::cend(files),
-                           [&folder](const QString &file) { return QFileInfo::exists(folder + file); });
+    const QString drawing{name + QStringLiteral(".svg")};
+    const QString picture{name + QStringLiteral(".png")};
+    return std::any_of(theme.folders.cbegin(), theme.folders.cend(), [&](const QString &folder) {
+        return QFileInfo::exists(folder + drawing) || QFileInfo::exists(folder + picture);
     });
 }
 

@@ -37,9 +37,8 @@ QString ownRuntimeDirectory()
 
 QString runtimeDirectory(const QString &own)
 {
-    const QString sessions[]{qEnvironmentVariable("XDG_RUNTIME_DIR"),
-                             QStringLiteral("/run/user/") + QString::number(geteuid())};
-    for (const QString &session : sessions) {
+    for (const QString &session :
+         {qEnvironmentVariable("XDG_RUNTIME_DIR"), QStringLiteral("/run/user/") + QString::number(geteuid())}) {
         if (isPrivateDirectory(session))
             return session;
     }

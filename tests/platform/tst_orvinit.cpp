@@ -10,9 +10,11 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <array>
+
 namespace {
 
-const char *const iconNames[]{
+constexpr std::array iconNames{
     "view-refresh",
     "document-save",
     "application-exit",

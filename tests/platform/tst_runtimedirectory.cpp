@@ -58,7 +58,7 @@ void TestRuntimeDirectory::cleanup()
 
 QString TestRuntimeDirectory::folder(const QString &name, mode_t mode) const
 {
-    const QString path{m_folder->filePath(name)};
+    QString path{m_folder->filePath(name)};
     QDir{}.mkpath(path);
     chmod(QFile::encodeName(path).constData(), mode);
     return path;
