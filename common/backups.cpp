@@ -98,7 +98,7 @@ public:
         TemporaryFile::removeLeftOvers(m_folder, m_name, geteuid());
         if (newestIs(content))
             return m_versions.last();
-        const QByteArray version{m_prefix + nextStamp()};
+        QByteArray version{m_prefix + nextStamp()};
         TemporaryFile file{m_folder, m_name};
         if (file.open() || posix::writeAll(file.descriptor(), content) || posix::sync(file.descriptor()) ||
             file.renameTo(version))

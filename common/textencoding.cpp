@@ -141,7 +141,7 @@ bool isPairAt(const QString &text, int at)
 // Halves what the codec cannot hold until the characters that it lacks stand alone.
 QByteArray encodedWithGaps(QTextCodec *codec, const QString &text)
 {
-    const QByteArray bytes{encoded(codec, text)};
+    QByteArray bytes{encoded(codec, text)};
     if (QTextDecoder{codec, keepMark}.toUnicode(bytes) == text)
         return bytes;
     if (text.size() == 1 || (text.size() == 2 && isPairAt(text, 0)))

@@ -58,7 +58,7 @@ struct DescriptorMessage
         header.msg_iovlen = 1;
         header.msg_control = control.data();
         header.msg_controllen = control.size();
-        cmsghdr *const rights{CMSG_FIRSTHDR(&header)};
+        auto *const rights = reinterpret_cast<cmsghdr *>(control.data());
         rights->cmsg_level = SOL_SOCKET;
         rights->cmsg_type = SCM_RIGHTS;
         rights->cmsg_len = CMSG_LEN(sizeof descriptor);
@@ -107,7 +107,7 @@ void judgeCalls(pid_t child, int listener, const syscalljudge::Judge &judge)
         }
         seccomp_notif_resp answer{};
         answer.id = call.id;
-        answer.error = -verdict;
+        answer.error = verdict == syscalljudge::pretend ? 0 : -verdict;
         answer.flags = verdict == syscalljudge::proceed ? SECCOMP_USER_NOTIF_FLAG_CONTINUE : 0;
         ioctl(listener, SECCOMP_IOCTL_NOTIF_SEND, &answer);
     }

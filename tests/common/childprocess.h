@@ -9,10 +9,12 @@
 /// can let any of them fail or end the process there.
 namespace syscalljudge {
 
-/// What becomes of a call: `proceed`, `kill` the process before it, or a positive number to fail with as errno.
+/// What becomes of a call: `proceed`, `kill` the process before it, `pretend` that it succeeded without doing it, or a
+/// positive number to fail with as errno.
 using Verdict = int;
 constexpr Verdict proceed{0};
 constexpr Verdict kill{-1};
+constexpr Verdict pretend{-2};
 
 /// Gets the number of the system call (SYS_...) and how many were judged before it.
 using Judge = std::function<Verdict(int call, int index)>;
