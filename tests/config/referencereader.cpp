@@ -3,9 +3,38 @@
 
 #include <algorithm>
 
+namespace {
+
+bool isOneOf(QChar c, const char *characters) { return QString::fromLatin1(characters).contains(c); }
+
+bool holdsAnyCase(const QStringList &words, const char *word)
+{
+    return words.contains(QString::fromLatin1(word), Qt::CaseInsensitive);
+}
+
+// Ends the statement of `words` in the innermost of the open blocks.
+void endStatement(std::vector<ConfigNode *> &open, QStringList words, QChar delimiter)
+{
+    while (words.size() == 1)
+        words += QString{};
+    ConfigNode &current{*open.back()};
+    if (!words.isEmpty() && delimiter == QLatin1Char{';'}) {
+        const bool isDeclaration{holdsAnyCase(words, "range") || holdsAnyCase(words, "subclass") ||
+                                 holdsAnyCase(words, "fixed-address")};
+        (isDeclaration ? current.declarations : current.parameters).push_back({words});
+    } else if (!words.isEmpty() && delimiter == QLatin1Char{'{'}) {
+        current.declarations.push_back({words});
+        open.push_back(&current.declarations.back());
+    } else if (delimiter == QLatin1Char{'}'} && open.size() > 1) {
+        open.pop_back();
+    }
+}
+
+} // namespace
+
 ConfigNode readByReference(const QString &text)
 {
-    ConfigNode allNetwork{{QStringLiteral("All network"), QString{}}, {}, {}};
+    ConfigNode allNetwork{{QStringLiteral("All network"), QString{}}};
     std::vector<ConfigNode *> open{&allNetwork};
     QString word;
     QStringList words;
@@ -24,32 +53,17 @@ ConfigNode readByReference(const QString &text)
                 break;
             c = text[i];
         }
-        if (!QStringLiteral("\t\n ;{}").contains(c)) {
+        if (!isOneOf(c, "\t\n ;{}")) {
             word += c;
             continue;
         }
         if (!word.isEmpty())
             words += word;
         word.clear();
-        if (QStringLiteral("\t\n ").contains(c))
-            continue;
-        if (!words.isEmpty()) {
-            while (words.size() < 2)
-                words += QString{};
-            ConfigNode &current{*open.back()};
-            if (c == QLatin1Char{';'}) {
-                const bool isDeclaration{words.contains(QStringLiteral("range"), Qt::CaseInsensitive) ||
-                                         words.contains(QStringLiteral("subclass"), Qt::CaseInsensitive) ||
-                                         words.contains(QStringLiteral("fixed-address"), Qt::CaseInsensitive)};
-                (isDeclaration ? current.declarations : current.parameters).push_back({words, {}, {}});
-            } else if (c == QLatin1Char{'{'}) {
-                current.declarations.push_back({words, {}, {}});
-                open.push_back(&current.declarations.back());
-            }
+        if (isOneOf(c, ";{}")) {
+            endStatement(open, words, c);
+            words.clear();
         }
-        if (c == QLatin1Char{'}'} && open.size() > 1)
-            open.pop_back();
-        words.clear();
     }
     return allNetwork;
 }

@@ -104,6 +104,7 @@ void ConfigReaderTest::reads_data()
     addRow("unbalanced quote takes comment signs in", "a \";# b\n c;d \" #e;\nf;",
            allNetwork({node("a|\""), node("#|b|c"), node("d|\"|f")}));
     addRow("quotes in comments do not count", "a; # \"\nb; # c;\nd;", allNetwork({node("a|"), node("b|"), node("d|")}));
+    addRow("quotes in dropped words count", "a { \"} #b c;", allNetwork({node("#b|c")}, {node("a|")}));
     addRow("no semicolon before the brace", "host a { fixed-address 10.0.0.5 }", allNetwork({}, {node("host|a")}));
     addRow("brace without words", "group { { a b; } c d; } e f;",
            allNetwork({node("c|d"), node("e|f")}, {block("group|", {node("a|b")})}));
