@@ -99,7 +99,7 @@ QTextCodec *localeCodec()
         return nullptr;
     QByteArray ascii{0x80, '\0'};
     std::iota(ascii.begin(), ascii.end(), '\0');
-    return codec->toUnicode(ascii) == QString::fromLatin1(ascii.constData(), ascii.size()) ? codec : nullptr;
+    return codec->toUnicode(ascii) == QLatin1String{ascii.constData(), ascii.size()} ? codec : nullptr;
 }
 
 // A byte order mark is text like any other: it is neither taken away nor added.

@@ -242,6 +242,7 @@ private slots:
 
     void failsWhenFull_data();
     void failsWhenFull();
+    void overwritesNothingWhenThereIsNoRoom();
     void failsInPlaceWhenFullAndRoomCannotBeReserved();
     void failsBeyondTheSizeLimit_data();
     void failsBeyondTheSizeLimit();
@@ -255,6 +256,8 @@ private slots:
     void writesInPlaceWhenTheAttributesCannotBeGiven_data();
     void writesInPlaceWhenTheAttributesCannotBeGiven();
 
+    void writesInPlaceWhereRenamingIsRefused_data();
+    void writesInPlaceWhereRenamingIsRefused();
     void cleansWhatAKilledSaveLeft();
     void leavesWhatIsNoLeftOver();
     void savesANameOfFullLength();
@@ -665,6 +668,30 @@ void FileIoTest::failsWhenFull()
     }));
 }
 
+void FileIoTest::overwritesNothingWhenThereIsNoRoom()
+{
+    QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
+        if (mount("none", local(directory()).constData(), "tmpfs", 0, "size=64k") < 0)
+            return QStringLiteral("skip: no tmpfs");
+        const QByteArray small{oldContent.left(20000)};
+        if (!put(paths::configuration(), small) ||
+            !addName(paths::configuration(), directory() + QStringLiteral("other")))
+            return QStringLiteral("cannot write");
+        syscalljudge::Outcome outcome;
+        for (int step{}; step == 0 || outcome.killed; ++step) {
+            QDir{paths::backupDirectory()}.removeRecursively();
+            outcome = saveJudged(paths::configuration(), newContent, [step](int call, int index) {
+                return index == step ? syscalljudge::kill : unlessSync(call);
+            });
+            if (!outcome.unsupported.isEmpty())
+                return QStringLiteral("skip: ") + outcome.unsupported;
+            if (contentOf(paths::configuration()) != small)
+                return QStringLiteral("damaged at step %1").arg(step);
+        }
+        return difference("saved", outcome.result, 1);
+    }));
+}
+
 void FileIoTest::failsInPlaceWhenFullAndRoomCannotBeReserved()
 {
     QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
@@ -773,29 +800,36 @@ void FileIoTest::refusesToWriteInPlaceWithoutAKeptCopy()
 
 void FileIoTest::writesABindMountedFile_data()
 {
-    QTest::addColumn<bool>("readOnlyDirectory");
-    QTest::addRow("in a directory that can be written") << false;
-    QTest::addRow("in a read-only directory") << true;
+    QTest::addColumn<QString>("options");
+    QTest::addColumn<bool>("readOnly");
+    QTest::addRow("in a directory that can be written") << QString{} << false;
+    QTest::addRow("in a read-only directory") << QStringLiteral("size=64k") << true;
+    QTest::addRow("in a directory without room") << QStringLiteral("size=4k,nr_inodes=2") << false;
 }
 
 void FileIoTest::writesABindMountedFile()
 {
-    QFETCH(bool, readOnlyDirectory);
+    QFETCH(QString, options);
+    QFETCH(bool, readOnly);
     const QString outside{m_root->path(QStringLiteral("/outside"))};
     writeTestFile(outside, oldContent);
-    writeTestFile(paths::configuration(), "hidden by the mount");
     QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
         const QByteArray folder{local(directory())};
-        if (readOnlyDirectory &&
-            (mount(folder.constData(), folder.constData(), nullptr, MS_BIND, nullptr) < 0 ||
-             mount("none", folder.constData(), nullptr, MS_BIND | MS_REMOUNT | MS_RDONLY, nullptr) < 0))
+        const QByteArray file{local(paths::configuration())};
+        if (!options.isEmpty() && mount("none", folder.constData(), "tmpfs", 0, options.toLatin1().constData()) < 0)
+            return QStringLiteral("skip: no tmpfs");
+        if (!put(paths::configuration(), {}))
+            return QStringLiteral("cannot write");
+        if (readOnly && mount("none", folder.constData(), nullptr, MS_REMOUNT | MS_RDONLY, nullptr) < 0)
             return QStringLiteral("skip: no read-only mount");
-        if (mount(local(outside).constData(), local(paths::configuration()).constData(), nullptr, MS_BIND, nullptr) < 0)
+        if (mount(local(outside).constData(), file.constData(), nullptr, MS_BIND, nullptr) < 0)
             return QStringLiteral("skip: no bind mount");
-        return problemOfSaving(paths::configuration(), newContent, true, oldContent);
+        QString problem{problemOfSaving(paths::configuration(), newContent, true, oldContent)};
+        if (umount(file.constData()) < 0)
+            problem += QStringLiteral("cannot unmount; ");
+        return problem + difference("covered content", contentOf(paths::configuration()), QByteArray{""});
     }));
     QCOMPARE(readTestFile(outside), newContent);
-    QCOMPARE(readTestFile(paths::configuration()), QByteArray{"hidden by the mount"});
 }
 
 void FileIoTest::writesInPlaceWhenTheAttributesCannotBeGiven_data()
@@ -825,6 +859,31 @@ void FileIoTest::writesInPlaceWhenTheAttributesCannotBeGiven()
     if (!refused)
         QSKIP("not the superuser, or a file system without ACLs: nothing to give");
     QCOMPARE(outcome.result, 0);
+    QCOMPARE(statusOf(path).st_ino, inode);
+}
+
+void FileIoTest::writesInPlaceWhereRenamingIsRefused_data()
+{
+    QTest::addColumn<int>("error");
+    for (const int error : {EBUSY, EPERM, EACCES, EXDEV})
+        QTest::addRow("%s", std::strerror(error)) << error;
+}
+
+void FileIoTest::writesInPlaceWhereRenamingIsRefused()
+{
+    QFETCH(int, error);
+    const QString path{standFile(Standing::Plain)};
+    const ino_t inode{statusOf(path).st_ino};
+    int renamings{};
+    const auto save = [&] { return problemOfSaving(path, newContent, true, oldContent).isEmpty() ? 0 : 1; };
+    const syscalljudge::Outcome outcome{syscalljudge::run(save, [&](int call, int) {
+        // The first renaming is that of the backup.
+        return call == SYS_renameat && renamings++ == 1 ? error : syscalljudge::proceed;
+    })};
+    if (!outcome.unsupported.isEmpty())
+        QSKIP(qPrintable(outcome.unsupported));
+    QCOMPARE(outcome.result, 0);
+    QCOMPARE(renamings, 2);
     QCOMPARE(statusOf(path).st_ino, inode);
 }
 
