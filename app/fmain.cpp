@@ -22,6 +22,7 @@
 namespace {
 
 constexpr int statusIndent = 5;
+constexpr int measuredRows = 50; // of the lease table, for the widths of its columns
 constexpr auto sizeKey = "MainWindow/Size";
 
 /// An action of the form, its theme icon, and the slot of the window that it triggers (none when another object's).
@@ -141,13 +142,14 @@ void FMain::setUpLeases()
 
     // The model's error signal is deliberately not connected: a missing lease file is an empty table, not a message.
     m_leasesModel = std::make_unique<DhcpdLeasesModel>(nullptr);
-    m_leasesModel->reload(paths::leases());
+    readLeases();
 
     QTableView *table = m_ui->dhcpdLeaseTable;
     table->setSelectionMode(QAbstractItemView::SingleSelection);
     table->setSelectionBehavior(QAbstractItemView::SelectRows);
     table->setContextMenuPolicy(Qt::CustomContextMenu);
     table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
+    table->horizontalHeader()->setResizeContentsPrecision(measuredRows);
     table->verticalHeader()->setDefaultSectionSize(table->verticalHeader()->minimumSectionSize());
     connect(table, &QTableView::customContextMenuRequested, this, &FMain::handleTableContextMenuRequested);
     connect(table, &QTableView::doubleClicked, this, &FMain::handleTableDoubleClicked);
@@ -242,5 +244,5 @@ void FMain::currentTabChanged(int index)
     for (QAction *action : {m_ui->aAddHost, m_ui->aAddSubnet, m_ui->aAddSharedNetwork})
         action->setEnabled(index == TopologyTab);
     if (index == LeasesTab)
-        leaseReload();
+        readLeases();
 }

@@ -109,6 +109,9 @@ private:
     void setUpSearch();
     void restoreSize();
 
+    /// Reads the whole lease file.
+    void readLeases();
+
     enum class SaveOutcome
     {
         Saved,
@@ -118,6 +121,8 @@ private:
     SaveOutcome saveConfiguration();
     /// Asks whether to write `content` over the configuration, and tells if the server refuses it.
     bool confirmsSave(const QByteArray &content);
+    /// Writes the model to the configuration file without noticing that as a change.
+    bool writeConfiguration();
     void reloadTopology();
     void showWholeTopology();
 

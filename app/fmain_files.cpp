@@ -2,7 +2,9 @@
 // The main window's commands on files: saving, reloading, noticing changes, closing, the served interfaces.
 #include "app/fmain.h"
 
+#include "app/busycursor.h"
 #include "app/configcheck.h"
+#include "app/leaseplace.h"
 #include "app/pathwatch.h"
 #include "app/treeexpansion.h"
 #include "common/fileio.h"
@@ -19,7 +21,7 @@
 void FMain::reload()
 {
     if (m_ui->mainTabWidget->currentIndex() == LeasesTab) {
-        leaseReload();
+        readLeases();
         return;
     }
     const auto answer =
@@ -29,10 +31,23 @@ void FMain::reload()
         reloadTopology();
 }
 
-void FMain::leaseReload() { m_leasesModel->reload(paths::leases()); }
+void FMain::leaseReload()
+{
+    QTableView &table = *m_ui->dhcpdLeaseTable;
+    const LeasePlace place{table};
+    m_leasesModel->update(paths::leases());
+    place.restoreIn(table);
+}
+
+void FMain::readLeases()
+{
+    const BusyCursor busy{paths::leases()};
+    m_leasesModel->reload(paths::leases());
+}
 
 void FMain::reloadTopology()
 {
+    const BusyCursor busy{paths::configuration()};
     m_configModel->reload();
     showWholeTopology();
 }
@@ -63,10 +78,7 @@ FMain::SaveOutcome FMain::saveConfiguration()
     if (!confirmsSave(content))
         return SaveOutcome::Declined;
 
-    m_configWatch->pause();
-    const bool written = m_configModel->write();
-    m_configWatch->resume();
-    if (!written)
+    if (!writeConfiguration())
         return SaveOutcome::Failed;
     m_ignoreNextChange = true;
     m_changedOutside = false;
@@ -77,6 +89,15 @@ FMain::SaveOutcome FMain::saveConfiguration()
         QMetaObject::invokeMethod(this, &FMain::configChanged, Qt::QueuedConnection);
     reloadTopology();
     return SaveOutcome::Saved;
+}
+
+bool FMain::writeConfiguration()
+{
+    const BusyCursor busy{paths::configuration()};
+    m_configWatch->pause();
+    const bool written = m_configModel->write();
+    m_configWatch->resume();
+    return written;
 }
 
 bool FMain::confirmsSave(const QByteArray &content)

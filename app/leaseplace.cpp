@@ -1,0 +1,64 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/leaseplace.h"
+
+#include "leases/dhcpdleasesmodel.h"
+
+#include <QHostAddress>
+#include <QScrollBar>
+#include <QTableView>
+
+namespace {
+
+/// The number by which the leases are ordered.
+quint32 addressAt(const QAbstractItemModel &leases, int row)
+{
+    return QHostAddress{leases.index(row, DhcpdLeasesModel::Address).data().toString()}.toIPv4Address();
+}
+
+std::optional<quint32> addressOf(const QModelIndex &index)
+{
+    return index.isValid() ? std::optional{addressAt(*index.model(), index.row())} : std::nullopt;
+}
+
+/// The first row whose address is not below `address`; the number of rows when there is none.
+int lowerBound(const QAbstractItemModel &leases, quint32 address)
+{
+    int first = 0;
+    int last = leases.rowCount();
+    while (first < last) {
+        const int middle = first + (last - first) / 2;
+        if (addressAt(leases, middle) < address)
+            first = middle + 1;
+        else
+            last = middle;
+    }
+    return first;
+}
+
+} // namespace
+
+LeasePlace::LeasePlace(const QTableView &table)
+    : m_current{addressOf(table.currentIndex())}
+    , m_column{table.currentIndex().column()}
+    , m_cellSelected{table.selectionModel()->selectedIndexes().size() == 1}
+    , m_top{addressOf(table.indexAt({0, 0}))}
+    , m_left{table.horizontalScrollBar()->value()}
+{
+}
+
+void LeasePlace::restoreIn(QTableView &table) const
+{
+    const QAbstractItemModel &leases = *table.model();
+    if (m_current && !table.currentIndex().isValid()) {
+        const int row = lowerBound(leases, *m_current);
+        if (row < leases.rowCount() && addressAt(leases, row) == *m_current) {
+            const auto extent = m_cellSelected ? QItemSelectionModel::NoUpdate : QItemSelectionModel::Rows;
+            table.selectionModel()->setCurrentIndex(leases.index(row, m_column),
+                                                    QItemSelectionModel::ClearAndSelect | extent);
+        }
+    }
+    if (m_top && addressOf(table.indexAt({0, 0})) != m_top) {
+        table.verticalScrollBar()->setValue(lowerBound(leases, *m_top));
+        table.horizontalScrollBar()->setValue(m_left);
+    }
+}
