@@ -39,6 +39,7 @@ public:
     Q_DISABLE_COPY_MOVE(EditedModel)
 
     DhcpdConfigModel &model() { return m_model; }
+    const DhcpdConfigModel &model() const { return m_model; }
 
     /// The first statement whose words, joined by spaces, begin with `text`; the "All network" node for an empty text,
     /// an invalid index for "top".

@@ -16,7 +16,7 @@ QString realDhcpd()
                                 {/* those of PATH */},
                                 {QStringLiteral("/usr/sbin")}};
     for (const QStringList &searched : folders) {
-        if (const QString path{QStandardPaths::findExecutable(name, searched)}; !path.isEmpty())
+        if (QString path{QStandardPaths::findExecutable(name, searched)}; !path.isEmpty())
             return path;
     }
     return {};
