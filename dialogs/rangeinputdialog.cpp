@@ -5,18 +5,17 @@
 #include "dialogs/patterns.h"
 #include "ui_rangeinputdialog.h"
 
-#include <QRegularExpressionValidator>
+#include <QLineEdit>
 
 RangeInputDialog::RangeInputDialog(QWidget *parent)
     : QDialog{parent}
     , m_ui{std::make_unique<Ui::RangeInputDialog>()}
 {
     m_ui->setupUi(this);
-    auto *validator = new QRegularExpressionValidator{patterns::strictAddress(), this};
-    for (QLineEdit *field : {m_ui->startIP, m_ui->endIP}) {
-        field->setValidator(validator);
+    fields::restrain(m_ui->startIP, patterns::strictAddress());
+    m_ui->endIP->setValidator(m_ui->startIP->validator());
+    for (QLineEdit *field : {m_ui->startIP, m_ui->endIP})
         fields::widenForAddress(field);
-    }
 }
 
 RangeInputDialog::~RangeInputDialog() = default;
