@@ -185,7 +185,7 @@ void TestBind9Reader::keepsZonesAndKeys_data()
     row("slash in a word without quotes", "key k { algorithm a; secret YS9i/Yw==; };",
         "key|k|algorithm|a|secret|\"YS9i/Yw==\"");
     row("delimiters between quotes", "options { version \"zone a { allow-update { key k; }; };\"; };", "");
-    row("name with a blank", "zone \"a b\" { allow-update { key k; }; }; key \"c;d\" { algorithm a; secret s; };", "");
+    row("name with a blank", R"(zone "a b" { allow-update { key k; }; }; key "c;d" { algorithm a; secret s; };)", "");
     row("carriage returns", "zone a {\r\nallow-update {\r\nkey k;\r\n};\r\n};\r\n", "zone|a.|primary|127.0.0.1|key|k");
     row("surplus closing braces", "}; } key k { algorithm a; secret s; }; }", "key|k|algorithm|a|secret|s");
     row("blocks left open", "zone a { allow-update { key k; ", "zone|a.|primary|127.0.0.1|key|k");
@@ -221,9 +221,8 @@ void TestBind9Reader::choosesUsable_data()
         "", "key|k|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k|key|o|algorithm|a|secret|s");
     row("key given twice", "key|k|algorithm|a|secret|s|key|\"K\"|algorithm|a|secret|s", "",
         "key|\"K\"|algorithm|a|secret|s");
-    row("algorithm in quotes", "key|k|algorithm|\"hmac-md5\"|secret|\"s\"", "",
-        "key|k|algorithm|hmac-md5|secret|\"s\"");
-    row("algorithm in quotes behind the secret", "key|k|secret|\"s\"|algorithm|\"hmac-md5\"", "",
+    row("algorithm in quotes", R"(key|k|algorithm|"hmac-md5"|secret|"s")", "", "key|k|algorithm|hmac-md5|secret|\"s\"");
+    row("algorithm in quotes behind the secret", R"(key|k|secret|"s"|algorithm|"hmac-md5")", "",
         "key|k|secret|\"s\"|algorithm|hmac-md5");
     row("zone without a key", "zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|key|k|key|k|algorithm|a|secret|s",
         "", "key|k|algorithm|a|secret|s|zone|b.|primary|127.0.0.1|key|k");
@@ -234,7 +233,7 @@ void TestBind9Reader::choosesUsable_data()
     row("dot at the end of the known name only", "zone|a.|primary|127.0.0.1|key|\"k\"", "k.",
         "zone|a.|primary|127.0.0.1|key|k.");
     row("dot at the end of the reference only", "key|\"k\"|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k.", "",
-        "key|\"k\"|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|\"k\"");
+        R"(key|"k"|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|"k")");
     row("first key that there is", "zone|a.|primary|127.0.0.1|key|x|key|l|key|k", "k|l",
         "zone|a.|primary|127.0.0.1|key|l");
     row("key without a secret", "key|k|algorithm|a|zone|a.|primary|127.0.0.1|key|k", "", "");
@@ -380,7 +379,7 @@ void TestBind9Reader::survivesAnyText()
             QCOMPARE(result.size() % 6, 0);
             QStringList keys{knownKeys};
             for (int i{}; i < result.size(); i += 6, ++groups) {
-                const QString keyword{result.at(i)};
+                const QString &keyword{result.at(i)};
                 if (keyword == QLatin1String{"key"})
                     keys += bind9::unquoted(result.at(i + 1)).toLower();
                 else if (keyword == QLatin1String{"zone"})

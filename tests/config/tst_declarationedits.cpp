@@ -158,7 +158,7 @@ void TestDeclarationEdits::adds_data()
 
     row("bind9", "", "",
         addWords(&DhcpdConfigModel::addBind9,
-                 words("key|\"k\"|algorithm|hmac-md5|secret|\"YQ==\"|zone|a.|primary|127.0.0.1|key|\"k\"")),
+                 words(R"(key|"k"|algorithm|hmac-md5|secret|"YQ=="|zone|a.|primary|127.0.0.1|key|"k")")),
         "key|\"k\" {\n algorithm|hmac-md5\n secret|\"YQ==\"\nzone|a. {\n primary|127.0.0.1\n key|\"k\"\n");
     row("bind9: group", "group { }", "group",
         addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary|127.0.0.1|key|k")),

@@ -143,7 +143,7 @@ void TestParameterEdits::changes_data()
              "option|domain-name|\"b.org\"|\n");
     replaces("domain name again", "option domain-name \"a.org\" ;", domainName("\"b.org\""),
              "option|domain-name|\"b.org\"|\n");
-    replaces("domain name of several words", "option domain-name \"a b c\"; option domain-name \"d\";",
+    replaces("domain name of several words", R"(option domain-name "a b c"; option domain-name "d";)",
              domainName("\"b.org\""), "option|domain-name|\"b.org\"|\noption|domain-name|\"d\"\n");
 
     for (const auto &[ms, name, otherName, definition] : routeOptions) {

@@ -252,7 +252,7 @@ void TestVerdict::judges_data()
         addBind9(bind9File)(model, parent);
         addBind9(bind9File)(model, parent);
     });
-    accepted("bind9 zone of a known key", "", addBind9("zone \"a.org\" { allow-update { key \"KNOWN\"; }; };"));
+    accepted("bind9 zone of a known key", "", addBind9(R"(zone "a.org" { allow-update { key "KNOWN"; }; };)"));
 
     // What the model takes, deliberately, although the server does not. The names and addresses are as the user typed
     // them; a saving user is told of the server's complaint.
