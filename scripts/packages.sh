@@ -9,6 +9,7 @@ declare -A packages=(
     [screenshot]="maim xauth xdotool xvfb"
     [test]="dpkg iproute2 procps"
     [bench]="libbenchmark-dev python3"
+    [fuzz]="clang libclang-rt-dev"
     [lint]="clang-format clang-tidy clazy git shellcheck"
 )
 
