@@ -163,15 +163,13 @@ LeaseRows parsedRows(const QByteArray &text, const QVector<int> &places)
 {
     LeaseTable table;
     LeaseParser parser{table};
+    QVector<int> ends{places};
+    ends.append(text.size());
     int begin{0};
-    const auto feedTo{[&](int end) {
+    for (const int end : qAsConst(ends)) {
         parser.feed({text.constData() + begin, static_cast<std::size_t>(end - begin)});
         begin = end;
-    }};
-    for (const int place : places) {
-        feedTo(place);
     }
-    feedTo(text.size());
     parser.finish();
     table.settleAll();
     return rowsOf(table);

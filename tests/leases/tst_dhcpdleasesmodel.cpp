@@ -63,6 +63,7 @@ private slots:
     void readsFilesLargerThanAPiece();
 
     void updatesWithWhatWasAppended();
+    void updateTakesBackAnEndThatTurnsOutToBeNone();
     void updateAnnouncesNewAndChangedRows();
     void updateAnnouncesMuchAsAReset();
     void updateOfAnUnchangedFileSaysNothing();
@@ -306,6 +307,21 @@ void TestDhcpdLeasesModel::updatesWithWhatWasAppended()
     QCOMPARE(model.rowCount(), 3);
     // Only when the brace that ended the block stood without its line feed it could still have become another line.
     QCOMPARE(resets.size(), 2);
+}
+
+void TestDhcpdLeasesModel::updateTakesBackAnEndThatTurnsOutToBeNone()
+{
+    DhcpdLeasesModel model;
+    writeTestFile(m_path, "lease 10.0.0.1 {\n}");
+    model.reload(m_path);
+    QCOMPARE(model.rowCount(), 1);
+    appendTo(m_path, " 10.0.0.2 {\n");
+    model.update(m_path);
+    QCOMPARE(model.rowCount(), 0);
+    appendTo(m_path, "}\n");
+    model.update(m_path);
+    QCOMPARE(model.rowCount(), 1);
+    QCOMPARE(model.index(0, 0).data().toString(), text("10.0.0.2"));
 }
 
 void TestDhcpdLeasesModel::updateAnnouncesNewAndChangedRows()
