@@ -12,6 +12,7 @@
 #include "platform/packagemanager.h"
 #include "ui_fmain.h"
 
+#include <QGuiApplication>
 #include <QHeaderView>
 #include <QLabel>
 #include <QMenu>
@@ -186,7 +187,13 @@ void FMain::setUpSearch()
 
 void FMain::restoreSize() { resize(QSettings{}.value(QLatin1String{sizeKey}, size()).toSize()); }
 
-void FMain::showError(const QString &text) { QMessageBox::critical(this, tr("Error"), text, QMessageBox::Ok); }
+void FMain::showError(const QString &text)
+{
+    // A failed load or save reports from under the busy cursor.
+    QGuiApplication::setOverrideCursor(QCursor{Qt::ArrowCursor});
+    QMessageBox::critical(this, tr("Error"), text, QMessageBox::Ok);
+    QGuiApplication::restoreOverrideCursor();
+}
 
 void FMain::showInformation(const QString &text)
 {
