@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// What the start of the program is compared with: the least that a program with a main window does.
+#include <QApplication>
+#include <QMainWindow>
+
+int main(int argc, char *argv[])
+{
+    const QApplication application{argc, argv};
+    QMainWindow window;
+    window.show();
+    return QApplication::exec();
+}
