@@ -29,6 +29,8 @@ int main(int argc, char *argv[])
 {
     QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
+    QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
     QtSingleApplication application{argc, argv};
     if (application.isRunning()) {
         application.sendMessage(QStringLiteral("raise"), raiseMilliseconds);
