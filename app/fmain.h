@@ -134,13 +134,20 @@ private:
 
     /// The tree's current index where it is a declaration's; else invalid.
     QModelIndex currentDeclaration() const;
+    /// What is open in the tree after an add besides the declaration that was added to.
+    enum class OpenBranches
+    {
+        AsBefore,
+        All
+    };
     /// Runs `change`, which may add children to the declaration at `parent`, and shows what was added.
     template<typename Change>
-    void addTo(const QModelIndex &parent, const Change &change);
+    void addTo(const QModelIndex &parent, const Change &change, OpenBranches open = OpenBranches::AsBefore);
     /// Asks with a `Dialog` made ready by `fill(dialog)` and, when it is accepted, calls `add(dialog, parent)` with the
-    /// current declaration. Returns whether it was accepted.
+    /// current declaration.
     template<typename Dialog, typename Fill, typename Add>
-    bool addThroughDialog(const QString &title, const Fill &fill, const Add &add);
+    void addThroughDialog(const QString &title, const Fill &fill, const Add &add,
+                          OpenBranches open = OpenBranches::AsBefore);
     /// Asks with a `Dialog` made ready by `fill(dialog, statement)` from the current statement, if that is of the kind;
     /// when it is accepted with another value than shown, calls `handOver(index, value, shown value)`.
     template<typename Dialog, typename Fill, typename Value, typename HandOver>

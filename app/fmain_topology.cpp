@@ -183,36 +183,39 @@ QModelIndex FMain::currentDeclaration() const
 }
 
 template<typename Change>
-void FMain::addTo(const QModelIndex &parent, const Change &change)
+void FMain::addTo(const QModelIndex &parent, const Change &change, OpenBranches open)
 {
     const auto &declaration = static_cast<const DhcpdConfigDeclaration &>(*m_configModel->statementFor(parent));
     const std::size_t declarationsBefore = declaration.declarations().size();
     const int childrenBefore = declaration.childCount();
     change();
+    if (open == OpenBranches::All)
+        m_treeExpansion->expandAll();
     if (declaration.childCount() == childrenBefore)
         return; // refused, or an existing statement was changed in place
 
+    // The definition of an option may have come before the declaration, which then stands in another row.
+    const QModelIndex current = parent.sibling(declaration.row(), 0);
     QTreeView *tree = m_ui->topologyTree;
-    tree->setCurrentIndex(parent);
-    tree->expand(parent);
+    tree->setCurrentIndex(current);
+    tree->expand(current);
     const bool declarationAdded = declaration.declarations().size() > declarationsBefore;
     const int rows = declarationAdded ? declaration.childCount() : static_cast<int>(declaration.parameters().size());
-    tree->scrollTo(m_configModel->index(rows - 1, 0, parent));
+    tree->scrollTo(m_configModel->index(rows - 1, 0, current));
 }
 
 template<typename Dialog, typename Fill, typename Add>
-bool FMain::addThroughDialog(const QString &title, const Fill &fill, const Add &add)
+void FMain::addThroughDialog(const QString &title, const Fill &fill, const Add &add, OpenBranches open)
 {
     const QModelIndex parent = currentDeclaration();
     if (!parent.isValid())
-        return false;
+        return;
     Dialog dialog{this};
     dialog.setWindowTitle(title);
     fill(dialog);
-    if (dialog.exec() != QDialog::Accepted)
-        return false;
-    addTo(parent, [&] { add(dialog, parent); });
-    return true;
+    if (dialog.exec() == QDialog::Accepted)
+        addTo(
+            parent, [&] { add(dialog, parent); }, open);
 }
 
 template<typename Dialog, typename Fill, typename Value, typename HandOver>
@@ -254,13 +257,12 @@ void FMain::addArbitrary(const QString &title, const QString &label,
 {
     if (!currentDeclaration().isValid() || !resumesAdvancedEditing())
         return;
-    const bool accepted = addThroughDialog<StatementInputDialog>(
+    addThroughDialog<StatementInputDialog>(
         title, [&label](StatementInputDialog &dialog) { dialog.setLabelText(label); },
         [this, add](const StatementInputDialog &dialog, const QModelIndex &parent) {
             (m_configModel->*add)(dialog.statementWords(), parent);
-        });
-    if (accepted)
-        m_treeExpansion->expandAll();
+        },
+        OpenBranches::All);
 }
 
 void FMain::editArbitrary(const QString &title, const QString &label, KindTest isKind)
@@ -591,6 +593,7 @@ void FMain::handleAddBind9Settings()
                                                       QFileInfo{paths::bind9LocalConfiguration()}.absolutePath());
     if (file.isEmpty())
         return;
-    addTo(parent, [&] { m_configModel->addBind9(bind9::prepared(file, m_configModel->keyNames(parent)), parent); });
-    m_treeExpansion->expandAll();
+    addTo(
+        parent, [&] { m_configModel->addBind9(bind9::prepared(file, m_configModel->keyNames(parent)), parent); },
+        OpenBranches::All);
 }
