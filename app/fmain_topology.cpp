@@ -98,7 +98,10 @@ const Statement *firstChild(const Statement &declaration, KindTest isKind)
 }
 
 /// The index of the word that holds the first address of `range`.
-int firstAddressOf(const Statement &range) { return range.word(1) == QLatin1String{bootpFlag} ? 2 : 1; }
+int firstAddressOf(const Statement &range)
+{
+    return range.word(1).compare(QLatin1String{bootpFlag}, Qt::CaseInsensitive) == 0 ? 2 : 1;
+}
 
 /// What the dialog of a host shows.
 struct HostFields
@@ -365,12 +368,12 @@ void FMain::handleEditRange()
         [](const RangeInputDialog &dialog) -> QString { return dialog.startIp() + QLatin1Char{' '} + dialog.endIp(); },
         [this](const QModelIndex &index, const QString &text, const QString & /*shown*/) {
             const Statement &range = *m_configModel->statementFor(index);
-            const bool hasFlag = firstAddressOf(range) > 1;
-            if (!m_configModel->setData(index, text, Qt::EditRole) || !hasFlag)
+            const QString flag = firstAddressOf(range) > 1 ? range.word(1) : QString{};
+            if (!m_configModel->setData(index, text, Qt::EditRole) || flag.isEmpty())
                 return;
             // The dialog has no field for the flag and the model keeps only the addresses, so it is put back.
             QStringList words = wordsFrom(range, 0);
-            words.insert(1, QLatin1String{bootpFlag});
+            words.insert(1, flag);
             m_configModel->replaceWords(index, words);
         });
 }
