@@ -134,6 +134,8 @@ private:
 
     /// The tree's current index where it is a declaration's; else invalid.
     QModelIndex currentDeclaration() const;
+    /// The tree's current index where it is that of a statement of the kind, as the file has it; else invalid.
+    QModelIndex currentOfKind(KindTest isKind) const;
     /// What is open in the tree after an add besides the declaration that was added to.
     enum class OpenBranches
     {

@@ -185,6 +185,13 @@ QModelIndex FMain::currentDeclaration() const
                                                                                   : QModelIndex{};
 }
 
+QModelIndex FMain::currentOfKind(KindTest isKind) const
+{
+    const QModelIndex index = m_ui->topologyTree->currentIndex();
+    const Statement &statement = *m_configModel->statementFor(index);
+    return statement.isRoot() || !isKind(statement) ? QModelIndex{} : index;
+}
+
 template<typename Change>
 void FMain::addTo(const QModelIndex &parent, const Change &change, OpenBranches open)
 {
@@ -225,13 +232,12 @@ template<typename Dialog, typename Fill, typename Value, typename HandOver>
 void FMain::editThroughDialog(const QString &title, KindTest isKind, const Fill &fill, const Value &value,
                               const HandOver &handOver)
 {
-    const QModelIndex current = m_ui->topologyTree->currentIndex();
-    const Statement &statement = *m_configModel->statementFor(current);
-    if (!current.isValid() || statement.isRoot() || !isKind(statement))
+    const QModelIndex current = currentOfKind(isKind);
+    if (!current.isValid())
         return;
     Dialog dialog{this};
     dialog.setWindowTitle(title);
-    fill(dialog, statement);
+    fill(dialog, *m_configModel->statementFor(current));
     const auto shown = value(dialog);
     if (dialog.exec() == QDialog::Accepted && value(dialog) != shown)
         handOver(current.siblingAtColumn(1), value(dialog), shown);
@@ -270,8 +276,7 @@ void FMain::addArbitrary(const QString &title, const QString &label,
 
 void FMain::editArbitrary(const QString &title, const QString &label, KindTest isKind)
 {
-    const QModelIndex current = m_ui->topologyTree->currentIndex();
-    if (!current.isValid() || !isKind(*m_configModel->statementFor(current)) || !resumesAdvancedEditing())
+    if (!currentOfKind(isKind).isValid() || !resumesAdvancedEditing())
         return;
     editThroughDialog<StatementInputDialog>(
         title, isKind,
