@@ -111,6 +111,7 @@ void ModalBoxes::expectFileDialog(const QString &path)
     expectDialog<QFileDialog>([path](QFileDialog *dialog) {
         auto *name = dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
         QVERIFY(name);
+        name->setCompleter(nullptr); // its list would stay open behind the dialog
         name->clear();
         QTest::keyClicks(name, path);
         auto *buttons = dialog->findChild<QDialogButtonBox *>(QStringLiteral("buttonBox"));
