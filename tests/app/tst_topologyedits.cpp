@@ -1,0 +1,507 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// The commands of the topology tree that edit statements.
+#include "config/dhcpdconfigmodel.h"
+#include "tests/app/topologywindow.h"
+#include "tests/dialogs/dialogdriver.h"
+
+#include <QAction>
+#include <QDialog>
+#include <QTest>
+#include <QTreeView>
+
+namespace {
+
+QString text(const char *utf8) { return QString::fromUtf8(utf8); }
+
+QStringList list(const char *bars) { return text(bars).split(text(" | ")); }
+
+// Much of it as only a hand writes it.
+constexpr auto configuration = R"(default-lease-time 600;
+max-lease-time 40000000;
+min-lease-time -1;
+option domain-name "a.org";
+option domain-name-servers 10.0.0.1,
+    10.0.0.2 , 10.0.0.3;
+option routers 10.0.0.1,10.0.0.2;
+option routers gate.a.org, 10.0.0.1;
+option ntp-servers;
+option classless-static-routes code 121 = array of unsigned integer 8;
+option classless-static-routes 24, 192,168,1,0, 10,0,0,1;
+option ms-classless-static-routes 24, 192,168,2,0,
+    10,0,0,2;
+option time-offset 3600;
+authoritative;
+subnet 10.0.0.0 netmask 255.255.255.0 {
+    range 10.0.0.100 10.0.0.110;
+    range dynamic-bootp 10.0.0.10 10.0.0.20;
+    range DYNAMIC-BOOTP 10.0.0.40 10.0.0.50;
+    range 10.0.0.30;
+}
+subnet 10.3.0.0 {
+}
+subnet 10.4.0.0 netmask 255.255.255.0 {
+}
+shared-network lab {
+}
+shared-network "my office" {
+}
+group servers {
+}
+class "phones" {
+}
+subclass "phones" 1:00:11:22:33:44:55;
+host full {
+    hardware ethernet 00:11:22:33:44:55;
+    fixed-address 10.0.0.5;
+}
+host bare {
+}
+host hard {
+    hardware ethernet 00:11:22:33:44:66;
+}
+host fixed {
+    fixed-address 10.0.0.6;
+}
+host "my pc" {
+    hardware ethernet 0011.2233.4455;
+    fixed-address 10.0.0.7,
+        10.0.0.8;
+}
+)";
+
+/// An edit through a dialog.
+struct Edit
+{
+    QString statement;
+    Input input;
+    QStringList changes{};
+};
+
+Input addresses(const char *title, const char *label, const char *shown)
+{
+    return {text(title), {text(label), text(shown)}};
+}
+
+Input time(const char *title, const char *shown)
+{
+    QStringList all{text("Mounth:"), QString{}, text("Days:"), QString{}, QString{},
+                    text(":"),       QString{}, text(":"),     QString{}};
+    const QStringList fields = list(shown);
+    const int places[] = {1, 3, 4, 6, 8};
+    for (int i = 0; i < fields.size(); ++i)
+        all[places[i]] = fields.at(i);
+    return {text(title), all};
+}
+
+Input subnet(const char *address, const char *mask)
+{
+    return {text("Edit subnet"), {text("Address:"), text(address), text("Netmask:"), text(mask)}};
+}
+
+Input range(const char *start, const char *end)
+{
+    return {text("Edit range"), {text("Start IP:"), text(start), text("End IP:"), text(end)}};
+}
+
+Input host(const char *name, const char *mac, const char *ip)
+{
+    return {text("Edit host"),
+            {text("Name:"), text(name), text("MAC address:"), text(mac), text("Fixed IP:"), text(ip)}};
+}
+
+Input routes(const char *cells, const char *box)
+{
+    return {text("Edit static route"), {text("Static routes"), text(cells), text(box)}};
+}
+
+Input named(const char *title, const char *label, const char *value)
+{
+    return {text(title), {text(label), text(value)}};
+}
+
+Input parameter(const char *words) { return named("Edit arbitrary parameter", "Parameter:", words); }
+Input declaration(const char *words) { return named("Edit arbitrary declaration", "Declaration:", words); }
+Input definition(const char *words) { return named("Edit static route", "Parameter:", words); }
+
+Input with(Input input, const Fill &fill)
+{
+    input.fill = fill;
+    return input;
+}
+
+/// Whether the warning comes before the dialog.
+bool isAdvanced(const Input &input)
+{
+    return input.shown.first() == text("Parameter:") || input.shown.first() == text("Declaration:");
+}
+
+/// Opens the editor with a double click and saves it.
+void edit(const TopologyWindow &window, const QString &statement, const Input &input, const QString &error = {})
+{
+    ModalBoxes boxes;
+    if (isAdvanced(input))
+        boxes.expectBox(advancedBox(), QMessageBox::Yes);
+    expectSaved(boxes, input, error);
+    window.doubleClick(statement);
+    boxes.verify();
+}
+
+} // namespace
+
+Q_DECLARE_METATYPE(Edit)
+
+using Slot = void (FMain::*)();
+Q_DECLARE_METATYPE(Slot)
+
+class TestTopologyEdits final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void unchangedEditChangesNothing_data();
+    void unchangedEditChangesNothing();
+    void changedFieldReachesTheStatement_data() { changeCases(); }
+    void changedFieldReachesTheStatement();
+    void cancelledEditChangesNothing_data() { changeCases(); }
+    void cancelledEditChangesNothing();
+    void refusedEditSaysWhy_data();
+    void refusedEditSaysWhy();
+    void addressOfABareHostIsAdded();
+    void nameWithASpaceIsQuoted();
+    void editNeedsItsKindOfStatement_data();
+    void editNeedsItsKindOfStatement();
+
+private:
+    static void changeCases();
+};
+
+void TestTopologyEdits::unchangedEditChangesNothing_data()
+{
+    QTest::addColumn<Edit>("unchanged");
+    const auto row = [](const char *statement, const Input &input) {
+        QTest::addRow("%s", statement) << Edit{text(statement), input};
+    };
+
+    row("default-lease-time", time("Edit default lease time", "0 | 0 | 0 h | 10 m | 0 s"));
+    row("max-lease-time", time("Edit max lease time", "12 | 12 | 23 h | 6 m | 40 s"));
+    row("min-lease-time", time("Edit time", "0 | 0 | 0 h | 0 m | 0 s"));
+    row("option domain-name \"", named("Edit domain name", "Domain name:", "a.org"));
+    row("option domain-name-servers", addresses("Edit DNS servers", "DNS servers:", "10.0.0.1, 10.0.0.2, 10.0.0.3"));
+    row("option routers 10", addresses("Edit gateways", "Gateways:", "10.0.0.1, 10.0.0.2"));
+    row("option routers gate", addresses("Edit gateways", "Gateways:", "10.0.0.1"));
+    row("option classless-static-routes code",
+        definition("option classless-static-routes code 121 = array of unsigned integer 8"));
+    row("option classless-static-routes 24",
+        routes("255.255.255.0, 192.168.1.0, 10.0.0.1", "[ ]* Route for MS systems"));
+    row("option ms-classless", routes("255.255.255.0, 192.168.2.0, 10.0.0.2", "[x]* Route for MS systems"));
+    row("option time-offset", parameter("option time-offset 3600"));
+    row("authoritative", parameter("authoritative "));
+    row("subnet 10.0", subnet("10.0.0.0", "255.255.255.0"));
+    row("subnet 10.3", subnet("10.3.0.0", ""));
+    row("range 10.0.0.100", range("10.0.0.100", "10.0.0.110"));
+    row("range dynamic", range("10.0.0.10", "10.0.0.20"));
+    row("range DYNAMIC", range("10.0.0.40", "10.0.0.50"));
+    row("range 10.0.0.30", range("10.0.0.30", ""));
+    row("shared-network lab", named("Edit shared network", "Name:", "lab"));
+    row("shared-network \"", named("Edit shared network", "Name:", "\"my office\""));
+    row("group", declaration("group servers"));
+    row("subclass", declaration("subclass \"phones\" 1:00:11:22:33:44:55"));
+    row("host full", host("full", "00:11:22:33:44:55", "10.0.0.5"));
+    row("host bare", host("bare", "00:00:00:00:00:00", ""));
+    row("host hard", host("hard", "00:11:22:33:44:66", ""));
+    row("host fixed", host("fixed", "00:00:00:00:00:00", "10.0.0.6"));
+    row("host \"", host("\"my pc\"", "00:11:22:33:44:55", "10.0.0.7, 10.0.0.8"));
+    row("fixed-address 10.0.0.5", named("Edit fixed address", "IP:", "10.0.0.5"));
+    row("fixed-address 10.0.0.7", named("Edit fixed address", "IP:", "10.0.0.7, 10.0.0.8"));
+    row("hardware ethernet 00:11", named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"));
+    row("hardware ethernet 0011", named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"));
+}
+
+void TestTopologyEdits::unchangedEditChangesNothing()
+{
+    QFETCH(Edit, unchanged);
+    const TopologyWindow window{configuration};
+    window.tree().collapse(window.find(text("host bare")));
+    const QStringList open = window.openBranches();
+    edit(window, unchanged.statement, unchanged.input);
+    QCOMPARE(window.changes(), QStringList{});
+    QCOMPARE(window.notices(), 0);
+    QVERIFY(!window.offersSave());
+    QCOMPARE(window.openBranches(), open);
+}
+
+void TestTopologyEdits::changeCases()
+{
+    QTest::addColumn<Edit>("change");
+    const auto row = [](const char *name, const char *statement, const Input &input, const char *changes) {
+        QTest::addRow("%s", name) << Edit{text(statement), input, *changes ? list(changes) : QStringList{}};
+    };
+    const QString same{};
+
+    row("default lease time", "default-lease-time",
+        with(time("Edit default lease time", "0 | 0 | 0 h | 10 m | 0 s"), type({same, same, text("1")})),
+        "-default-lease-time 600; | +default-lease-time 4200;");
+    row("max lease time", "max-lease-time",
+        with(time("Edit max lease time", "12 | 12 | 23 h | 6 m | 40 s"), type(list("1 | 0 | 0 | 0 | 0"))),
+        "-max-lease-time 40000000; | +max-lease-time 2592000;");
+    row("other lease time", "min-lease-time",
+        with(time("Edit time", "0 | 0 | 0 h | 0 m | 0 s"), type({same, same, same, same, text("60")})),
+        "-min-lease-time -1; | +min-lease-time 60;");
+    row("domain name", "option domain-name \"",
+        with(named("Edit domain name", "Domain name:", "a.org"), type(list("b.example.net"))),
+        "-option domain-name \"a.org\"; | +option domain-name \"b.example.net\";");
+    row("DNS servers", "option domain-name-servers",
+        with(addresses("Edit DNS servers", "DNS servers:", "10.0.0.1, 10.0.0.2, 10.0.0.3"),
+             addAddresses(list("10.0.0.4"))),
+        "-option domain-name-servers 10.0.0.1, 10.0.0.2 , 10.0.0.3; | "
+        "+option domain-name-servers 10.0.0.1, 10.0.0.2, 10.0.0.3, 10.0.0.4;");
+    row("gateways", "option routers 10",
+        with(addresses("Edit gateways", "Gateways:", "10.0.0.1, 10.0.0.2"), addAddresses(list("10.0.0.3"))),
+        "-option routers 10.0.0.1,10.0.0.2; | +option routers 10.0.0.1, 10.0.0.2, 10.0.0.3;");
+    row("static route", "option classless-static-routes 24",
+        with(routes("255.255.255.0, 192.168.1.0, 10.0.0.1", "[ ]* Route for MS systems"),
+             typeInCell(0, 2, text("10.0.0.9"))),
+        "-option classless-static-routes 24, 192,168,1,0, 10,0,0,1; | "
+        "+option classless-static-routes 24, 192,168,1,0, 10,0,0,9;");
+    row("static route for MS systems", "option ms-classless",
+        with(routes("255.255.255.0, 192.168.2.0, 10.0.0.2", "[x]* Route for MS systems"),
+             typeInCell(0, 0, text("255.255.0.0"))),
+        "-option ms-classless-static-routes 24, 192,168,2,0, 10,0,0,2; | "
+        "+option ms-classless-static-routes 16, 192,168,2,0, 10,0,0,2;");
+    row("definition of the option", "option classless-static-routes code",
+        with(definition("option classless-static-routes code 121 = array of unsigned integer 8"),
+             type(list("option classless-static-routes code 121 = array of integer 8"))),
+        "-option classless-static-routes code 121 = array of unsigned integer 8; | "
+        "+option classless-static-routes code 121 = array of integer 8;");
+    row("parameter", "option time-offset", with(parameter("option time-offset 3600"), type(list("ping-check true"))),
+        "-option time-offset 3600; | +ping-check true;");
+    row("parameter of one word", "authoritative", with(parameter("authoritative "), type(list("ping-check true"))),
+        "-authoritative ; | +ping-check true;");
+    row("group", "group", with(declaration("group servers"), type(list("group printers"))),
+        "-group servers | +group printers");
+    row("keyword of a group", "group", with(declaration("group servers"), type(list("class \"pc\""))),
+        "-group servers | +class \"pc\"");
+    row("subclass", "subclass",
+        with(declaration("subclass \"phones\" 1:00:11:22:33:44:55"),
+             type(list("subclass \"phones\" 1:00:11:22:33:44:66"))),
+        "-subclass \"phones\" 1:00:11:22:33:44:55; | +subclass \"phones\" 1:00:11:22:33:44:66;");
+    row("address of a subnet", "subnet 10.4", with(subnet("10.4.0.0", "255.255.255.0"), type(list("10.5.0.0/16"))),
+        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.5.0.0 netmask 255.255.0.0");
+    row("netmask of a subnet", "subnet 10.4",
+        with(subnet("10.4.0.0", "255.255.255.0"), type({same, text("255.255.0.0")})),
+        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.4.0.0 netmask 255.255.0.0");
+    row("netmask that was missing", "subnet 10.3", with(subnet("10.3.0.0", ""), type({same, text("255.255.0.0")})),
+        "-subnet 10.3.0.0 | +subnet 10.3.0.0 netmask 255.255.0.0");
+    row("range", "range 10.0.0.100", with(range("10.0.0.100", "10.0.0.110"), type(list("10.0.0.101 | 10.0.0.101"))),
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.100 10.0.0.110; | "
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.101 10.0.0.101;");
+    row("range for BOOTP", "range dynamic", with(range("10.0.0.10", "10.0.0.20"), type({same, text("10.0.0.25")})),
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range dynamic-bootp 10.0.0.10 10.0.0.20; | "
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range dynamic-bootp 10.0.0.10 10.0.0.25;");
+    row("range for BOOTP in capitals", "range DYNAMIC",
+        with(range("10.0.0.40", "10.0.0.50"), type({same, text("10.0.0.55")})),
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range DYNAMIC-BOOTP 10.0.0.40 10.0.0.50; | "
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range DYNAMIC-BOOTP 10.0.0.40 10.0.0.55;");
+    row("range of one address", "range 10.0.0.30", with(range("10.0.0.30", ""), type({same, text("10.0.0.35")})),
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30; | "
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30 10.0.0.35;");
+    row("shared network", "shared-network \"",
+        with(named("Edit shared network", "Name:", "\"my office\""), type(list("attic"))),
+        "-shared-network \"my office\" | +shared-network attic");
+    row("shared network with a space", "shared-network lab",
+        with(named("Edit shared network", "Name:", "lab"), type(list("big lab"))),
+        "-shared-network lab | +shared-network \"big lab\"");
+    row("fixed address", "fixed-address 10.0.0.7",
+        with(named("Edit fixed address", "IP:", "10.0.0.7, 10.0.0.8"), type(list("10.0.0.9"))),
+        "-host \"my pc\" > fixed-address 10.0.0.7, 10.0.0.8; | +host \"my pc\" > fixed-address 10.0.0.9;");
+    row("MAC address", "hardware ethernet 0011",
+        with(named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"), type(list("aabbccddeeff"))),
+        "-host \"my pc\" > hardware ethernet 0011.2233.4455; | +host \"my pc\" > hardware ethernet aa:bb:cc:dd:ee:ff;");
+
+    const Input full = host("full", "00:11:22:33:44:55", "10.0.0.5");
+    row("host, all", "host full", with(full, type(list("a.lan | 001122334477 | 10.0.0.9"))),
+        "-host full | -host full > hardware ethernet 00:11:22:33:44:55; | -host full > fixed-address 10.0.0.5; | "
+        "+host a.lan | +host a.lan > hardware ethernet 00:11:22:33:44:77; | +host a.lan > fixed-address 10.0.0.9;");
+    row("host, name", "host bare", with(host("bare", "00:00:00:00:00:00", ""), type(list("a.lan"))),
+        "-host bare | +host a.lan");
+    row("host, MAC", "host full", with(full, type({same, text("001122334477")})),
+        "-host full > hardware ethernet 00:11:22:33:44:55; | +host full > hardware ethernet 00:11:22:33:44:77;");
+    row("host, address", "host full", with(full, type({same, same, text("10.0.0.9")})),
+        "-host full > fixed-address 10.0.0.5; | +host full > fixed-address 10.0.0.9;");
+    row("host, MAC of one without", "host fixed",
+        with(host("fixed", "00:00:00:00:00:00", "10.0.0.6"), type({same, text("001122334477")})), "");
+    row("host, MAC of a bare one", "host bare",
+        with(host("bare", "00:00:00:00:00:00", ""), type({same, text("001122334477")})), "");
+    row("host, address of one without hardware", "host fixed",
+        with(host("fixed", "00:00:00:00:00:00", "10.0.0.6"), type({same, same, text("10.0.0.9")})),
+        "-host fixed > fixed-address 10.0.0.6; | +host fixed > fixed-address 10.0.0.9;");
+    row("host, address of one without", "host hard",
+        with(host("hard", "00:11:22:33:44:66", ""), type({same, same, text("10.0.0.9")})),
+        "+host hard > fixed-address 10.0.0.9;");
+    row("host in quotes, MAC", "host \"",
+        with(host("\"my pc\"", "00:11:22:33:44:55", "10.0.0.7, 10.0.0.8"), type({same, text("001122334477")})),
+        "-host \"my pc\" > hardware ethernet 0011.2233.4455; | +host \"my pc\" > hardware ethernet 00:11:22:33:44:77;");
+}
+
+void TestTopologyEdits::changedFieldReachesTheStatement()
+{
+    QFETCH(Edit, change);
+    const TopologyWindow window{configuration};
+    window.tree().collapse(window.find(text("host hard")));
+    const QStringList open = window.openBranches();
+    edit(window, change.statement, change.input);
+    QCOMPARE(window.changes(), change.changes);
+    QCOMPARE(window.offersSave(), !change.changes.isEmpty());
+    QCOMPARE(window.notices() > 0, !change.changes.isEmpty());
+    const bool isAdded = change.changes.size() == 1;
+    QCOMPARE(window.resets(), isAdded ? 1 : 0);
+    if (!isAdded)
+        QCOMPARE(window.openBranches().size(), open.size()); // the words of some are others now
+    QVERIFY(window.tree().currentIndex().isValid());
+}
+
+void TestTopologyEdits::cancelledEditChangesNothing()
+{
+    QFETCH(Edit, change);
+    const TopologyWindow window{configuration};
+    ModalBoxes boxes;
+    if (isAdvanced(change.input))
+        boxes.expectBox(advancedBox(), QMessageBox::Yes);
+    expectCancelled(boxes, change.input);
+    window.doubleClick(change.statement);
+    boxes.verify();
+    QCOMPARE(window.changes(), QStringList{});
+    QCOMPARE(window.notices(), 0);
+    QVERIFY(!window.offersSave());
+}
+
+void TestTopologyEdits::refusedEditSaysWhy_data()
+{
+    QTest::addColumn<Edit>("refused");
+    QTest::addColumn<QString>("error");
+    const auto row = [](const char *name, const char *statement, const Input &input, const char *error) {
+        QTest::addRow("%s", name) << Edit{text(statement), input} << text(error);
+    };
+    const QString same{};
+
+    row("no time", "default-lease-time",
+        with(time("Edit default lease time", "0 | 0 | 0 h | 10 m | 0 s"), type(list("0 | 0 | 0 | 0 | 0"))),
+        "Invalid time in seconds '0");
+    row("domain name", "option domain-name \"",
+        with(named("Edit domain name", "Domain name:", "a.org"), type(list("local"))),
+        "Invalid domain name '\"local\"'");
+    row("subnet", "subnet 10.4", with(subnet("10.4.0.0", "255.255.255.0"), type(list("999.4.0.0"))),
+        "Error editing subnet. Invalid subnet '999.4.0.0/255.255.255.0'");
+    row("subnet without an address", "subnet 10.3", with(subnet("10.3.0.0", ""), type({text("")})),
+        "Error editing subnet. Invalid subnet ''");
+    row("range outside", "range 10.0.0.100", with(range("10.0.0.100", "10.0.0.110"), type(list("10.0.1.1"))),
+        "Error editing range. Invalid start IP '10.0.1.1'");
+    row("range backwards", "range dynamic", with(range("10.0.0.10", "10.0.0.20"), type({same, text("10.0.0.9")})),
+        "Error editing range. Invalid end IP '10.0.0.9'");
+    row("range in a bare subnet", "range 10.0.0.30", with(range("10.0.0.30", ""), type(list("10.0.0.31"))),
+        "Error editing range. Invalid end IP ''");
+    row("fixed address", "fixed-address 10.0.0.5",
+        with(named("Edit fixed address", "IP:", "10.0.0.5"), type(list("127.0.0.1"))), "Invalid IP '127.0.0.1'");
+    row("MAC address", "hardware ethernet 00:11:22:33:44:55",
+        with(named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"), type(list("0011"))),
+        "Invalid MAC '00:11::::'");
+    row("host's address taken away", "host full",
+        with(host("full", "00:11:22:33:44:55", "10.0.0.5"), type({same, same, text("")})), "Invalid IP ''");
+    row("address of a bare host", "host bare",
+        with(host("bare", "00:00:00:00:00:00", ""), type({same, same, text("127.0.0.1")})),
+        "Error adding fixed address. Invalid IP '127.0.0.1'");
+    row("host's MAC", "host full", with(host("full", "00:11:22:33:44:55", "10.0.0.5"), type({same, text("00")})),
+        "Invalid MAC '00:::::'");
+}
+
+void TestTopologyEdits::refusedEditSaysWhy()
+{
+    QFETCH(Edit, refused);
+    QFETCH(QString, error);
+    const TopologyWindow window{configuration};
+    edit(window, refused.statement, refused.input, error);
+    QCOMPARE(window.changes(), QStringList{});
+    QCOMPARE(window.notices(), 0);
+    QVERIFY(!window.offersSave());
+}
+
+void TestTopologyEdits::addressOfABareHostIsAdded()
+{
+    const TopologyWindow window{configuration};
+    edit(window, text("host bare"),
+         with(host("bare", "00:00:00:00:00:00", ""), type({QString{}, QString{}, text("10.0.0.9")})));
+    QCOMPARE(window.changes(), list("+host bare > fixed-address 10.0.0.9;"));
+    QCOMPARE(window.tree().currentIndex(), window.find(text("host bare")));
+    QVERIFY(window.isInView(window.find(text("fixed-address 10.0.0.9"))));
+}
+
+void TestTopologyEdits::nameWithASpaceIsQuoted()
+{
+    const TopologyWindow window{configuration};
+    const auto takeQuotesOff = [](ModalBoxes & /*boxes*/, QDialog * /*dialog*/) {
+        for (const Qt::Key key : {Qt::Key_Home, Qt::Key_Delete, Qt::Key_End, Qt::Key_Backspace, Qt::Key_Backspace})
+            driver::press(key);
+    };
+    edit(window, text("host \""), with(host("\"my pc\"", "00:11:22:33:44:55", "10.0.0.7, 10.0.0.8"), takeQuotesOff));
+    QCOMPARE(window.changes().filter(text(" >")).size(), 4);
+    QCOMPARE(window.changes().mid(0, 1), list("-host \"my pc\""));
+    QCOMPARE(window.changes().mid(3, 1), list("+host \"my p\""));
+}
+
+void TestTopologyEdits::editNeedsItsKindOfStatement_data()
+{
+    QTest::addColumn<Slot>("command");
+    QTest::addColumn<QStringList>("fitting");
+    const auto row = [](const char *name, Slot command, const char *fitting) {
+        QTest::addRow("%s", name) << command << list(fitting);
+    };
+    row("shared network", &FMain::handleEditSharedNetwork, "shared-network lab");
+    row("subnet", &FMain::handleEditSubnet, "subnet 10.0");
+    row("range", &FMain::handleEditRange, "range 10.0.0.100");
+    row("host", &FMain::handleEditHost, "host full");
+    row("fixed address", &FMain::handleEditFixedAddress, "fixed-address");
+    row("gateways", &FMain::handleEditRouters, "option routers");
+    row("DNS servers", &FMain::handleEditDns, "option domain-name-servers");
+    row("NTP servers", &FMain::handleEditNtp, "option ntp-servers");
+    row("domain name", &FMain::handleEditDomainName, "option domain-name ");
+    row("MAC address", &FMain::handleEditMacAddress, "hardware");
+    row("default lease time", &FMain::handleEditDefaultLeaseTime, "default-lease-time");
+    row("max lease time", &FMain::handleEditMaxLeaseTime, "max-lease-time");
+    row("static route", &FMain::handleEditStaticRoute,
+        "option classless-static-routes code | option classless-static-routes 24 | option ms-classless");
+    row("declaration", &FMain::handleEditArbitraryDeclaration,
+        "shared-network lab | subnet 10.0 | range 10.0.0.100 | host full | fixed-address | group | subclass");
+    row("parameter", &FMain::handleEditArbitraryParam,
+        "option routers | option domain-name-servers | option ntp-servers | option domain-name  | hardware | "
+        "default-lease-time | max-lease-time | min-lease-time | option classless-static-routes code | "
+        "option classless-static-routes 24 | option ms-classless | authoritative");
+}
+
+void TestTopologyEdits::editNeedsItsKindOfStatement()
+{
+    QFETCH(Slot, command);
+    QFETCH(QStringList, fitting);
+    const TopologyWindow window{configuration};
+    const ModalBoxes boxes; // fails the test when anything opens
+    const QStringList all = list(" | shared-network lab | subnet 10.0 | range 10.0.0.100 | host full | fixed-address | "
+                                 "option routers | option domain-name-servers | option ntp-servers | "
+                                 "option domain-name  | hardware | default-lease-time | max-lease-time | "
+                                 "min-lease-time | option classless-static-routes code | "
+                                 "option classless-static-routes 24 | option ms-classless | group | subclass | "
+                                 "authoritative");
+    int tried{};
+    for (const QString &statement : all) {
+        if (fitting.contains(statement))
+            continue;
+        ++tried;
+        window.select(statement);
+        (window.window().*command)();
+    }
+    QCOMPARE(tried, all.size() - fitting.size());
+    window.tree().setCurrentIndex({});
+    (window.window().*command)();
+    QCOMPARE(window.notices(), 0);
+}
+
+QTEST_MAIN(TestTopologyEdits)
+#include "tst_topologyedits.moc"

@@ -1,0 +1,233 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/treeexpansion.h"
+
+#include <QScrollBar>
+#include <QTest>
+#include <QTreeView>
+
+#include <algorithm>
+#include <memory>
+#include <vector>
+
+namespace {
+
+QString text(const char *latin1) { return QString::fromLatin1(latin1); }
+
+/// A tree whose nodes are changed within a reset; an index's internal pointer is its node.
+class NodeModel final : public QAbstractItemModel
+{
+public:
+    struct Node
+    {
+        QString name;
+        Node *parent{};
+        std::vector<std::unique_ptr<Node>> children{};
+
+        Node &add(const QString &childName)
+        {
+            children.push_back(std::make_unique<Node>(Node{childName, this}));
+            return *children.back();
+        }
+    };
+
+    Node &top() { return m_top; }
+
+    template<typename Change>
+    void reset(const Change &change)
+    {
+        beginResetModel();
+        change();
+        endResetModel();
+    }
+
+    QModelIndex index(int row, int column, const QModelIndex &parent = {}) const override
+    {
+        return hasIndex(row, column, parent)
+                   ? createIndex(row, column, nodeOf(parent).children.at(static_cast<std::size_t>(row)).get())
+                   : QModelIndex{};
+    }
+    QModelIndex parent(const QModelIndex &index) const override
+    {
+        Node *parent = nodeOf(index).parent;
+        if (!parent || parent == &m_top)
+            return {};
+        int row = 0;
+        while (parent->parent->children.at(static_cast<std::size_t>(row)).get() != parent)
+            ++row;
+        return createIndex(row, 0, parent);
+    }
+    int rowCount(const QModelIndex &parent = {}) const override
+    {
+        return static_cast<int>(nodeOf(parent).children.size());
+    }
+    int columnCount(const QModelIndex & /*parent*/ = {}) const override { return 1; }
+    QVariant data(const QModelIndex &index, int role) const override
+    {
+        return role == Qt::DisplayRole ? nodeOf(index).name : QVariant{};
+    }
+
+private:
+    const Node &nodeOf(const QModelIndex &index) const
+    {
+        return index.isValid() ? *static_cast<const Node *>(index.internalPointer()) : m_top;
+    }
+
+    mutable Node m_top{text("top")};
+};
+
+} // namespace
+
+class TestTreeExpansion final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void everyBranchOpens();
+    void noLeafIsMarkedAsOpen();
+    void everyBranchOpensAgain();
+    void openBranchesStayOverAReset();
+    void openBranchWithinAClosedOneStays();
+    void scrollPositionStaysOverAReset();
+    void currentRowIsNotKept();
+    void emptyModelIsNothing();
+
+private:
+    QModelIndex find(const QString &name, const QModelIndex &parent = {}) const;
+    QStringList open() const;
+
+    // Destroyed from the bottom up.
+    std::unique_ptr<NodeModel> m_model;
+    std::unique_ptr<QTreeView> m_tree;
+    TreeExpansion *m_expansion{};
+};
+
+// a { b { c d } e { } f }, g { h }, and many leaves
+void TestTreeExpansion::init()
+{
+    m_tree.reset();
+    m_model = std::make_unique<NodeModel>();
+    NodeModel::Node &a = m_model->top().add(text("a"));
+    NodeModel::Node &b = a.add(text("b"));
+    b.add(text("c"));
+    b.add(text("d")).add(text("i"));
+    a.add(text("e"));
+    m_model->top().add(text("g")).add(text("h"));
+    for (int i = 0; i < 200; ++i)
+        m_model->top().add(QString::number(i));
+
+    m_tree = std::make_unique<QTreeView>();
+    m_tree->setModel(m_model.get());
+    m_expansion = new TreeExpansion{m_tree.get()};
+    m_tree->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
+}
+
+QModelIndex TestTreeExpansion::find(const QString &name, const QModelIndex &parent) const
+{
+    for (int row = 0; row < m_model->rowCount(parent); ++row) {
+        const QModelIndex index = m_model->index(row, 0, parent);
+        if (index.data().toString() == name)
+            return index;
+        if (const QModelIndex found = find(name, index); found.isValid())
+            return found;
+    }
+    return {};
+}
+
+QStringList TestTreeExpansion::open() const
+{
+    QStringList names;
+    for (const char *name : {"a", "b", "c", "d", "e", "g", "h", "i", "new", "7"}) {
+        if (const QModelIndex index = find(text(name)); index.isValid() && m_tree->isExpanded(index))
+            names.append(text(name));
+    }
+    return names;
+}
+
+void TestTreeExpansion::everyBranchOpens()
+{
+    m_expansion->expandAll();
+    QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
+    QVERIFY(!m_tree->visualRect(find(text("h"))).isEmpty());
+    QCOMPARE(m_tree->indexBelow(find(text("i"))), find(text("e")));
+}
+
+void TestTreeExpansion::noLeafIsMarkedAsOpen()
+{
+    m_expansion->expandAll();
+    QCOMPARE(open(), text("a b d g").split(QLatin1Char{' '}));
+}
+
+void TestTreeExpansion::everyBranchOpensAgain()
+{
+    m_expansion->expandAll();
+    m_tree->collapse(find(text("b")));
+    m_tree->collapse(find(text("g")));
+    m_expansion->expandAll();
+    QCOMPARE(open(), text("a b d g").split(QLatin1Char{' '}));
+    QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
+}
+
+void TestTreeExpansion::openBranchesStayOverAReset()
+{
+    m_tree->expand(find(text("a")));
+    m_tree->expand(find(text("b")));
+    m_model->reset([this] {
+        auto &nodes = m_model->top().children;
+        nodes.erase(nodes.begin() + 1); // g
+        m_model->top().add(text("new")).add(text("newer"));
+        std::rotate(nodes.begin(), nodes.begin() + 1, nodes.end()); // a comes last
+    });
+    QCOMPARE(open(), text("a b").split(QLatin1Char{' '}));
+    m_tree->scrollTo(find(text("c")));
+    QVERIFY(!m_tree->visualRect(find(text("c"))).isEmpty());
+    QVERIFY(m_tree->visualRect(find(text("i"))).isEmpty());
+
+    m_model->reset([] {});
+    QCOMPARE(open(), text("a b").split(QLatin1Char{' '}));
+}
+
+void TestTreeExpansion::openBranchWithinAClosedOneStays()
+{
+    m_expansion->expandAll();
+    m_tree->collapse(find(text("a")));
+    m_model->reset([] {});
+    QCOMPARE(open(), text("b d g").split(QLatin1Char{' '}));
+    m_tree->expand(find(text("a")));
+    QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
+}
+
+void TestTreeExpansion::scrollPositionStaysOverAReset()
+{
+    m_expansion->expandAll();
+    QScrollBar *bar = m_tree->verticalScrollBar();
+    QVERIFY(bar->maximum() > 60);
+    bar->setValue(50);
+    const QModelIndex first = m_tree->indexAt({1, 1});
+    const void *node = first.internalPointer();
+    m_model->reset([this] { m_model->top().add(text("new")); });
+    QCOMPARE(bar->value(), 50);
+    QCOMPARE(m_tree->indexAt({1, 1}).internalPointer(), node);
+}
+
+// Which row is current after a reset is for the command to say.
+void TestTreeExpansion::currentRowIsNotKept()
+{
+    m_tree->setCurrentIndex(find(text("g")));
+    m_model->reset([] {});
+    QVERIFY(!m_tree->currentIndex().isValid());
+}
+
+void TestTreeExpansion::emptyModelIsNothing()
+{
+    m_expansion->expandAll();
+    m_model->reset([this] { m_model->top().children.clear(); });
+    m_expansion->expandAll();
+    QCOMPARE(open(), QStringList{});
+    m_model->reset([this] { m_model->top().add(text("a")).add(text("h")); });
+    QCOMPARE(open(), QStringList{});
+}
+
+QTEST_MAIN(TestTreeExpansion)
+#include "tst_treeexpansion.moc"
