@@ -45,7 +45,3 @@ std::unique_ptr<FMain> TestMachine::openWindow() const
         QTest::qFail("the main window never became active", __FILE__, __LINE__);
     return window;
 }
-
-FakePrograms &TestMachine::programs() { return m_programs; }
-
-FakeSystemctl &TestMachine::systemctl() { return m_systemctl; }

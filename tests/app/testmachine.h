@@ -43,8 +43,9 @@ public:
     /// Makes the main window, shows it and waits until it is active.
     std::unique_ptr<FMain> openWindow() const;
 
-    FakePrograms &programs();
-    FakeSystemctl &systemctl();
+    FakePrograms &programs() { return m_programs; }
+    const FakePrograms &programs() const { return m_programs; }
+    FakeSystemctl &systemctl() { return m_systemctl; }
 
 private:
     TemporaryRoot m_root;
