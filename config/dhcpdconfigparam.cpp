@@ -5,14 +5,15 @@
 
 namespace {
 
+// Without digit separators: lupdate takes them for quotes and misses the texts between them.
 constexpr struct
 {
     qint64 seconds;
     const char *text;
 } timeUnits[]{
-    {2'592'000, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " mounth ")},
-    {86'400, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " days ")},
-    {3'600, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " hours ")},
+    {2592000, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " mounth ")},
+    {86400, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " days ")},
+    {3600, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " hours ")},
     {60, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " minutes ")},
     {1, QT_TRANSLATE_NOOP("DhcpdConfigStatement", " seconds ")},
 };

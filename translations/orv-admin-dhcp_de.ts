@@ -1,1058 +1,945 @@
 <?xml version="1.0" encoding="utf-8"?>
 <!DOCTYPE TS>
-<TS version="2.1" language="de_DE">
+<TS version="2.1" language="de">
 <context>
     <name>ConfigCheck</name>
     <message>
-        <location filename="../app/configcheck.cpp" line="73"/>
         <source>line %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeile %1</translation>
     </message>
 </context>
 <context>
     <name>DhcpdConfigModel</name>
     <message>
-        <location filename="../config/dhcpdconfigmodel.cpp" line="107"/>
         <source>Unable to open file &apos;%1&apos; for read</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei „%1“ kann nicht zum Lesen geöffnet werden</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel.cpp" line="120"/>
         <source>Unable to open file &apos;%1&apos; for write</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei „%1“ kann nicht zum Schreiben geöffnet werden</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="15"/>
         <source>Invalid time in seconds &apos;%1</source>
-        <translation type="unfinished"></translation>
+        <translation>Ungültige Zeit in Sekunden „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="37"/>
         <source>Invalid one or more IP in list &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Mindestens eine IP-Adresse in der Liste „%1“ ist ungültig</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="39"/>
         <source>Invalid domain name &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Ungültiger Domänenname „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="47"/>
         <source>Error editing subnet. Invalid subnet &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Subnetzes. Ungültiges Subnetz „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="56"/>
         <source>Invalid IP &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Ungültige IP-Adresse „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="63"/>
         <source>Invalid MAC &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Ungültige MAC-Adresse „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="74"/>
         <source>Error editing range. Can not edit range in &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Adressbereichs. In „%1“ kann kein Adressbereich bearbeitet werden</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="76"/>
         <source>Error editing range. Invalid attributes of parent subnet</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Adressbereichs. Die Angaben des übergeordneten Subnetzes sind ungültig</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="79"/>
         <source>Error editing range. Invalid parent subnet</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Adressbereichs. Das übergeordnete Subnetz ist ungültig</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="84"/>
         <source>Error editing range. Invalid start IP &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Adressbereichs. Ungültige erste IP-Adresse „%1“</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigmodel_checks.cpp" line="87"/>
         <source>Error editing range. Invalid end IP &apos;%1&apos;</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler beim Bearbeiten des Adressbereichs. Ungültige letzte IP-Adresse „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding shared-network. Can not add shared-network to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des gemeinsamen Netzwerks. Zu „%1“ kann kein gemeinsames Netzwerk hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding subnet. Invalid subnet &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Subnetzes. Ungültiges Subnetz „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding subnet. Can not add subnet to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Subnetzes. Zu „%1“ kann kein Subnetz hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding range. Invalid attributes of parent subnet</source>
+        <translation>Fehler beim Hinzufügen des Adressbereichs. Die Angaben des übergeordneten Subnetzes sind ungültig</translation>
+    </message>
+    <message>
+        <source>Error adding range. Can not add range to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Adressbereichs. Zu „%1“ kann kein Adressbereich hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding range. Invalid parent subnet</source>
+        <translation>Fehler beim Hinzufügen des Adressbereichs. Das übergeordnete Subnetz ist ungültig</translation>
+    </message>
+    <message>
+        <source>Error adding range. Invalid start IP &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Adressbereichs. Ungültige erste IP-Adresse „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding range. Invalid end IP &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Adressbereichs. Ungültige letzte IP-Adresse „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding host. Can not add host to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Hosts. Zu „%1“ kann kein Host hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding host. Host name can not be empty.</source>
+        <translation>Fehler beim Hinzufügen des Hosts. Der Hostname darf nicht leer sein.</translation>
+    </message>
+    <message>
+        <source>Error adding fixed address. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der festen Adresse. Zu „%1“ kann keine feste Adresse hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding fixed address. Invalid IP &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der festen Adresse. Ungültige IP-Adresse „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding bind9. Can not add bind9 to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der bind9-Einstellungen. Zu „%1“ können keine bind9-Einstellungen hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding bind9. bind9 can not be empty.</source>
+        <translation>Fehler beim Hinzufügen der bind9-Einstellungen. Die bind9-Einstellungen dürfen nicht leer sein.</translation>
+    </message>
+    <message>
+        <source>Error adding declaration. Can not add declaration to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der Deklaration. Zu „%1“ kann keine Deklaration hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding parameter. Can not add parameter to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Parameters. Zu „%1“ kann kein Parameter hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding lease time. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der Lease-Dauer. Zu „%1“ kann keine Lease-Dauer hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Invalid time in seconds &apos;%1&apos;</source>
+        <translation>Ungültige Zeit in Sekunden „%1“</translation>
+    </message>
+    <message>
+        <source>Error adding gateways. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der Gateways. Zu „%1“ können keine Gateways hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding DNS servers. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der DNS-Server. Zu „%1“ können keine DNS-Server hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding NTP servers address. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der NTP-Server-Adressen. Zu „%1“ können keine NTP-Server-Adressen hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding domain name. Can not add to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen des Domänennamens. Zu „%1“ kann kein Domänenname hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding static route. Can not add static rout to &apos;%1&apos;</source>
+        <translation>Fehler beim Hinzufügen der statischen Route. Zu „%1“ kann keine statische Route hinzugefügt werden</translation>
+    </message>
+    <message>
+        <source>Error adding static route. Static route parametrs can not be empty.</source>
+        <translation>Fehler beim Hinzufügen der statischen Route. Die Angaben zur statischen Route dürfen nicht leer sein.</translation>
     </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>
     <message>
-        <location filename="../config/configreader.cpp" line="69"/>
         <source>All network</source>
-        <translation type="unfinished"></translation>
+        <translation>Gesamtes Netzwerk</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="78"/>
         <source>Subnet</source>
-        <translation type="unfinished"></translation>
+        <translation>Subnetz</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="79"/>
         <source>Shared network</source>
-        <translation type="unfinished"></translation>
+        <translation>Gemeinsames Netzwerk</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="80"/>
         <source>Host</source>
-        <translation type="unfinished"></translation>
+        <translation>Host</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="81"/>
         <source>Range</source>
-        <translation type="unfinished"></translation>
+        <translation>Adressbereich</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="82"/>
         <source>Fixed address</source>
-        <translation type="unfinished"></translation>
+        <translation>Feste Adresse</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="83"/>
         <source>Key information</source>
-        <translation type="unfinished"></translation>
+        <translation>Schlüsselangaben</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="84"/>
         <source>Zone served by DNS server</source>
-        <translation type="unfinished"></translation>
+        <translation>Vom DNS-Server bediente Zone</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigdeclaration.cpp" line="85"/>
         <source>Group</source>
-        <translation type="unfinished"></translation>
+        <translation>Gruppe</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="13"/>
         <source> mounth </source>
-        <translation type="unfinished"></translation>
+        <translation> Monat(e) </translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="16"/>
         <source> minutes </source>
-        <translation type="unfinished"></translation>
+        <translation> Min. </translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="17"/>
         <source> seconds </source>
-        <translation type="unfinished"></translation>
+        <translation> Sek. </translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="54"/>
         <source>Gateways</source>
-        <translation type="unfinished"></translation>
+        <translation>Gateways</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="55"/>
         <source>DNS servers</source>
-        <translation type="unfinished"></translation>
+        <translation>DNS-Server</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="56"/>
         <source>Domain name</source>
-        <translation type="unfinished"></translation>
+        <translation>Domänenname</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="57"/>
         <source>NTP servers</source>
-        <translation type="unfinished"></translation>
+        <translation>NTP-Server</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="58"/>
         <source>Static route MS</source>
-        <translation type="unfinished"></translation>
+        <translation>Statische Route (MS)</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="59"/>
         <source>Static route</source>
-        <translation type="unfinished"></translation>
+        <translation>Statische Route</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="62"/>
         <source>MAC address</source>
-        <translation type="unfinished"></translation>
+        <translation>MAC-Adresse</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="63"/>
         <source>Max lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Maximale Lease-Dauer</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="64"/>
         <source>Default lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Standard-Lease-Dauer</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="65"/>
         <source>Key</source>
-        <translation type="unfinished"></translation>
+        <translation>Schlüssel</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="66"/>
         <source>Key generation algorithm</source>
-        <translation type="unfinished"></translation>
+        <translation>Schlüsselalgorithmus</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="67"/>
         <source>Generated secret</source>
-        <translation type="unfinished"></translation>
+        <translation>Erzeugtes Geheimnis</translation>
     </message>
     <message>
-        <location filename="../config/dhcpdconfigparam.cpp" line="68"/>
         <source>Master DNS Server</source>
-        <translation type="unfinished"></translation>
+        <translation>Primärer DNS-Server</translation>
+    </message>
+    <message>
+        <source> days </source>
+        <translation> Tag(e) </translation>
+    </message>
+    <message>
+        <source> hours </source>
+        <translation> Std. </translation>
     </message>
 </context>
 <context>
     <name>DhcpdLeasesModel</name>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="19"/>
         <source>IP address</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Adresse</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="19"/>
         <source>MAC address</source>
-        <translation type="unfinished"></translation>
+        <translation>MAC-Adresse</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="20"/>
         <source>Host name</source>
-        <translation type="unfinished"></translation>
+        <translation>Hostname</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="20"/>
         <source>Binding state</source>
-        <translation type="unfinished"></translation>
+        <translation>Bindungsstatus</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="21"/>
         <source>Rental start</source>
-        <translation type="unfinished"></translation>
+        <translation>Lease-Beginn</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="21"/>
         <source>Rental end</source>
-        <translation type="unfinished"></translation>
+        <translation>Lease-Ende</translation>
     </message>
     <message>
-        <location filename="../leases/dhcpdleasesmodel.cpp" line="86"/>
         <source>Unable to open file &apos;%1&apos; for read</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei „%1“ kann nicht zum Lesen geöffnet werden</translation>
     </message>
 </context>
 <context>
     <name>DomainInputDialog</name>
     <message>
-        <location filename="../dialogs/domaininputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/domaininputdialog.ui" line="17"/>
         <source>Domain name:</source>
-        <translation type="unfinished"></translation>
+        <translation>Domänenname:</translation>
     </message>
 </context>
 <context>
     <name>FMain</name>
     <message>
-        <location filename="../app/fmain.ui" line="15"/>
         <source>Configure DHCP server</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server konfigurieren</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="45"/>
-        <location filename="../app/fmain.ui" line="51"/>
-        <location filename="../app/fmain.cpp" line="115"/>
         <source>Topology</source>
-        <translation type="unfinished"></translation>
+        <translation>Topologie</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="65"/>
-        <location filename="../app/fmain.ui" line="117"/>
         <source>Leases</source>
-        <translation type="unfinished"></translation>
+        <translation>Leases</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="77"/>
-        <location filename="../app/fmain.ui" line="80"/>
         <source>Search</source>
-        <translation type="unfinished"></translation>
+        <translation>Suchen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="87"/>
-        <location filename="../app/fmain.ui" line="90"/>
         <source>Previous match</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorheriger Treffer</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="93"/>
-        <location filename="../app/fmain.ui" line="106"/>
         <source>...</source>
-        <translation type="unfinished"></translation>
+        <translation>...</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="100"/>
-        <location filename="../app/fmain.ui" line="103"/>
         <source>Next match</source>
-        <translation type="unfinished"></translation>
+        <translation>Nächster Treffer</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="139"/>
         <source>&amp;File</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Datei</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="148"/>
         <source>Server</source>
-        <translation type="unfinished"></translation>
+        <translation>Server</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="161"/>
         <source>toolBar</source>
-        <translation type="unfinished"></translation>
+        <translation>Werkzeugleiste</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="181"/>
         <source>Reload</source>
-        <translation type="unfinished"></translation>
+        <translation>Neu laden</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="184"/>
         <source>F5</source>
-        <translation type="unfinished"></translation>
+        <translation>F5</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="192"/>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="195"/>
         <source>Ctrl+S</source>
-        <translation type="unfinished"></translation>
+        <translation>Ctrl+S</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="200"/>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation>Beenden</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="205"/>
         <source>Restart DHCP-server</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server neu starten</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="210"/>
         <source>Select interfaces</source>
-        <translation type="unfinished"></translation>
+        <translation>Schnittstellen auswählen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="215"/>
-        <location filename="../app/fmain.cpp" line="217"/>
         <source>Start DHCP-server</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server starten</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="218"/>
         <source>Start or stop DHCP-server</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server starten oder anhalten</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="221"/>
         <source>Ctrl+R</source>
-        <translation type="unfinished"></translation>
+        <translation>Ctrl+R</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="226"/>
-        <location filename="../app/fmain.ui" line="229"/>
-        <location filename="../app/fmain_topology.cpp" line="322"/>
         <source>Add subnet</source>
-        <translation type="unfinished"></translation>
+        <translation>Subnetz hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="234"/>
-        <location filename="../app/fmain.ui" line="237"/>
-        <location filename="../app/fmain_topology.cpp" line="305"/>
         <source>Add shared network</source>
-        <translation type="unfinished"></translation>
+        <translation>Gemeinsames Netzwerk hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="242"/>
-        <location filename="../app/fmain.ui" line="245"/>
-        <location filename="../app/fmain_topology.cpp" line="378"/>
         <source>Add host</source>
-        <translation type="unfinished"></translation>
+        <translation>Host hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="250"/>
-        <location filename="../app/fmain.ui" line="253"/>
-        <location filename="../app/fmain_topology.cpp" line="342"/>
         <source>Add range</source>
-        <translation type="unfinished"></translation>
+        <translation>Adressbereich hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="258"/>
-        <location filename="../app/fmain.ui" line="261"/>
-        <location filename="../app/fmain_topology.cpp" line="294"/>
         <source>Add arbitrary parameter</source>
-        <translation type="unfinished"></translation>
+        <translation>Beliebigen Parameter hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="266"/>
-        <location filename="../app/fmain.ui" line="269"/>
-        <location filename="../app/fmain_topology.cpp" line="284"/>
         <source>Add arbitrary declaration</source>
-        <translation type="unfinished"></translation>
+        <translation>Beliebige Deklaration hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="274"/>
-        <location filename="../app/fmain.ui" line="277"/>
         <source>Edit</source>
-        <translation type="unfinished"></translation>
+        <translation>Bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="282"/>
-        <location filename="../app/fmain.ui" line="285"/>
         <source>Remove</source>
-        <translation type="unfinished"></translation>
+        <translation>Entfernen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="290"/>
-        <location filename="../app/fmain.ui" line="293"/>
         <source>Add fixed IP</source>
-        <translation type="unfinished"></translation>
+        <translation>Feste IP-Adresse hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="298"/>
-        <location filename="../app/fmain.ui" line="301"/>
-        <location filename="../app/fmain_topology.cpp" line="472"/>
         <source>Add DNS servers</source>
-        <translation type="unfinished"></translation>
+        <translation>DNS-Server hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="306"/>
-        <location filename="../app/fmain.ui" line="309"/>
-        <location filename="../app/fmain_topology.cpp" line="493"/>
         <source>Add domain name</source>
-        <translation type="unfinished"></translation>
+        <translation>Domänennamen hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="314"/>
-        <location filename="../app/fmain.ui" line="317"/>
-        <location filename="../app/fmain_topology.cpp" line="463"/>
         <source>Add gateways</source>
-        <translation type="unfinished"></translation>
+        <translation>Gateways hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="322"/>
-        <location filename="../app/fmain.ui" line="325"/>
-        <location filename="../app/fmain_topology.cpp" line="482"/>
         <source>Add NTP servers</source>
-        <translation type="unfinished"></translation>
+        <translation>NTP-Server hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="330"/>
-        <location filename="../app/fmain.ui" line="333"/>
-        <location filename="../app/fmain_topology.cpp" line="532"/>
         <source>Add default lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Standard-Lease-Dauer hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="338"/>
-        <location filename="../app/fmain.ui" line="341"/>
-        <location filename="../app/fmain_topology.cpp" line="523"/>
         <source>Add max lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Maximale Lease-Dauer hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="346"/>
-        <location filename="../app/fmain_leases.cpp" line="92"/>
         <source>Reserve an IP address</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Adresse reservieren</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="351"/>
-        <location filename="../app/fmain_topology.cpp" line="553"/>
         <source>Add static route</source>
-        <translation type="unfinished"></translation>
+        <translation>Statische Route hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.ui" line="356"/>
-        <location filename="../app/fmain.ui" line="359"/>
         <source>Add DHCP dynamic zone update</source>
-        <translation type="unfinished"></translation>
+        <translation>Dynamische Zonenaktualisierung durch DHCP hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.cpp" line="115"/>
         <source>Value</source>
-        <translation type="unfinished"></translation>
+        <translation>Wert</translation>
     </message>
     <message>
-        <location filename="../app/fmain.cpp" line="154"/>
-        <location filename="../app/topologymenus.cpp" line="31"/>
         <source>Actions</source>
-        <translation type="unfinished"></translation>
+        <translation>Aktionen</translation>
     </message>
     <message>
-        <location filename="../app/fmain.cpp" line="186"/>
         <source>Error</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler</translation>
     </message>
     <message>
-        <location filename="../app/fmain.cpp" line="190"/>
-        <location filename="../app/fmain_files.cpp" line="25"/>
-        <location filename="../app/fmain_files.cpp" line="86"/>
-        <location filename="../app/fmain_files.cpp" line="119"/>
-        <location filename="../app/fmain_leases.cpp" line="103"/>
-        <location filename="../app/fmain_topology.cpp" line="585"/>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Information</translation>
     </message>
     <message>
-        <location filename="../app/fmain.cpp" line="214"/>
         <source>Stop DHCP-server</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server anhalten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="25"/>
         <source>Do you want to reload configuration from file?</source>
-        <translation type="unfinished"></translation>
+        <translation>Möchten Sie die Konfiguration neu aus der Datei laden?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="84"/>
         <source>The configuration has been changed.
 Do you want to overwrite the configuration?</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Konfiguration wurde von außen geändert.
+Möchten Sie die Konfiguration überschreiben?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="85"/>
-        <location filename="../app/fmain_files.cpp" line="119"/>
         <source>Current configuration in file will be rewrited.
 Do you want to save changes?</source>
-        <translation type="unfinished"></translation>
+        <translation>Die aktuelle Konfiguration in der Datei wird überschrieben.
+Möchten Sie die Änderungen speichern?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="91"/>
         <source>The DHCP server refuses this configuration:
 %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Der DHCP-Server lehnt diese Konfiguration ab:
+%1</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="104"/>
         <source>Confirmation</source>
-        <translation type="unfinished"></translation>
+        <translation>Bestätigung</translation>
     </message>
     <message>
-        <location filename="../app/fmain_files.cpp" line="104"/>
         <source>There are unsaved changes, save?</source>
-        <translation type="unfinished"></translation>
+        <translation>Es gibt ungespeicherte Änderungen. Speichern?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_leases.cpp" line="103"/>
         <source>The IP address is reserved.
 Go to topology?</source>
-        <translation type="unfinished"></translation>
+        <translation>Die IP-Adresse ist reserviert.
+Zur Topologie wechseln?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="244"/>
         <source>Warning!</source>
-        <translation type="unfinished"></translation>
+        <translation>Warnung!</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="245"/>
         <source>This editing mode for advanced users.
 After applying this changes configuration may be incorrect.
 Do you want to resume?</source>
-        <translation type="unfinished"></translation>
+        <translation>Dieser Bearbeitungsmodus ist für erfahrene Benutzer gedacht.
+Nach dem Übernehmen der Änderungen kann die Konfiguration fehlerhaft sein.
+Möchten Sie fortfahren?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="284"/>
-        <location filename="../app/fmain_topology.cpp" line="289"/>
         <source>Declaration:</source>
-        <translation type="unfinished"></translation>
+        <translation>Deklaration:</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="289"/>
         <source>Edit arbitrary declaration</source>
-        <translation type="unfinished"></translation>
+        <translation>Beliebige Deklaration bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="294"/>
-        <location filename="../app/fmain_topology.cpp" line="299"/>
-        <location filename="../app/fmain_topology.cpp" line="567"/>
         <source>Parameter:</source>
-        <translation type="unfinished"></translation>
+        <translation>Parameter:</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="299"/>
         <source>Edit arbitrary parameter</source>
-        <translation type="unfinished"></translation>
+        <translation>Beliebigen Parameter bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="314"/>
         <source>Edit shared network</source>
-        <translation type="unfinished"></translation>
+        <translation>Gemeinsames Netzwerk bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="331"/>
         <source>Edit subnet</source>
-        <translation type="unfinished"></translation>
+        <translation>Subnetz bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="357"/>
         <source>Edit range</source>
-        <translation type="unfinished"></translation>
+        <translation>Adressbereich bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="395"/>
         <source>Edit host</source>
-        <translation type="unfinished"></translation>
+        <translation>Host bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="428"/>
         <source>Add fixed address</source>
-        <translation type="unfinished"></translation>
+        <translation>Feste Adresse hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="437"/>
         <source>Edit fixed address</source>
-        <translation type="unfinished"></translation>
+        <translation>Feste Adresse bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="463"/>
-        <location filename="../app/fmain_topology.cpp" line="467"/>
         <source>Gateways:</source>
-        <translation type="unfinished"></translation>
+        <translation>Gateways:</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="467"/>
         <source>Edit gateways</source>
-        <translation type="unfinished"></translation>
+        <translation>Gateways bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="472"/>
-        <location filename="../app/fmain_topology.cpp" line="477"/>
         <source>DNS servers:</source>
-        <translation type="unfinished"></translation>
+        <translation>DNS-Server:</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="477"/>
         <source>Edit DNS servers</source>
-        <translation type="unfinished"></translation>
+        <translation>DNS-Server bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="482"/>
-        <location filename="../app/fmain_topology.cpp" line="487"/>
         <source>NTP servers:</source>
-        <translation type="unfinished"></translation>
+        <translation>NTP-Server:</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="487"/>
         <source>Edit NTP servers</source>
-        <translation type="unfinished"></translation>
+        <translation>NTP-Server bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="502"/>
         <source>Edit domain name</source>
-        <translation type="unfinished"></translation>
+        <translation>Domänennamen bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="527"/>
         <source>Edit max lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Maximale Lease-Dauer bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="537"/>
         <source>Edit default lease time</source>
-        <translation type="unfinished"></translation>
+        <translation>Standard-Lease-Dauer bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="540"/>
         <source>Edit time</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeit bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="545"/>
         <source>Edit MAC address</source>
-        <translation type="unfinished"></translation>
+        <translation>MAC-Adresse bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="567"/>
-        <location filename="../app/fmain_topology.cpp" line="571"/>
         <source>Edit static route</source>
-        <translation type="unfinished"></translation>
+        <translation>Statische Route bearbeiten</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="585"/>
         <source>Add configuration to automatically configure binding with bind9 DNS server?</source>
-        <translation type="unfinished"></translation>
+        <translation>Konfiguration für die automatische Anbindung an den DNS-Server bind9 hinzufügen?</translation>
     </message>
     <message>
-        <location filename="../app/fmain_topology.cpp" line="589"/>
         <source>Choose the bind9 configuration with the update key</source>
-        <translation type="unfinished"></translation>
+        <translation>bind9-Konfiguration mit dem Aktualisierungsschlüssel auswählen</translation>
     </message>
     <message>
-        <location filename="../app/topologymenus.cpp" line="35"/>
         <source>Add option</source>
-        <translation type="unfinished"></translation>
+        <translation>Option hinzufügen</translation>
     </message>
     <message>
-        <location filename="../app/topologymenus.cpp" line="38"/>
         <source>Add parameter</source>
-        <translation type="unfinished"></translation>
+        <translation>Parameter hinzufügen</translation>
     </message>
 </context>
 <context>
     <name>HostInputDialog</name>
     <message>
-        <location filename="../dialogs/hostinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/hostinputdialog.ui" line="17"/>
         <source>Name:</source>
-        <translation type="unfinished"></translation>
+        <translation>Name:</translation>
     </message>
     <message>
-        <location filename="../dialogs/hostinputdialog.ui" line="30"/>
         <source>MAC address:</source>
-        <translation type="unfinished"></translation>
+        <translation>MAC-Adresse:</translation>
     </message>
     <message>
-        <location filename="../dialogs/hostinputdialog.ui" line="43"/>
         <source>Fixed IP:</source>
-        <translation type="unfinished"></translation>
+        <translation>Feste IP-Adresse:</translation>
     </message>
 </context>
 <context>
     <name>IpInputDialog</name>
     <message>
-        <location filename="../dialogs/ipinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/ipinputdialog.ui" line="17"/>
         <source>IP:</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Adresse:</translation>
     </message>
 </context>
 <context>
     <name>MacInputDialog</name>
     <message>
-        <location filename="../dialogs/macinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/macinputdialog.ui" line="17"/>
         <source>MAC address:</source>
-        <translation type="unfinished"></translation>
+        <translation>MAC-Adresse:</translation>
     </message>
 </context>
 <context>
     <name>MultipleIpInputDialog</name>
     <message>
-        <location filename="../dialogs/multipleipinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/multipleipinputdialog.ui" line="17"/>
         <source>IP addresses</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Adressen</translation>
     </message>
     <message>
-        <location filename="../dialogs/multipleipinputdialog.ui" line="32"/>
         <source>Add</source>
-        <translation type="unfinished"></translation>
+        <translation>Hinzufügen</translation>
     </message>
     <message>
-        <location filename="../dialogs/multipleipinputdialog.ui" line="45"/>
         <source>Remove</source>
-        <translation type="unfinished"></translation>
+        <translation>Entfernen</translation>
     </message>
     <message>
-        <location filename="../dialogs/multipleipinputdialog.cpp" line="54"/>
         <source>Add IP</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Adresse hinzufügen</translation>
     </message>
 </context>
 <context>
     <name>OrvHelpMenu</name>
     <message>
-        <location filename="../platform/orvhelpmenu.cpp" line="15"/>
         <source>&amp;Help</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Hilfe</translation>
     </message>
     <message>
-        <location filename="../platform/orvhelpmenu.cpp" line="17"/>
-        <location filename="../platform/orvhelpmenu.cpp" line="28"/>
         <source>Manual</source>
-        <translation type="unfinished"></translation>
+        <translation>Handbuch</translation>
     </message>
     <message>
-        <location filename="../platform/orvhelpmenu.cpp" line="19"/>
-        <location filename="../platform/orvhelpmenu.cpp" line="49"/>
         <source>About %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Über %1</translation>
     </message>
     <message>
-        <location filename="../platform/orvhelpmenu.cpp" line="20"/>
         <source>About Qt</source>
-        <translation type="unfinished"></translation>
+        <translation>Über Qt</translation>
     </message>
     <message>
-        <location filename="../platform/orvhelpmenu.cpp" line="46"/>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
-        <translation type="unfinished"></translation>
+        <translation>Freie Software unter der GNU General Public License, Version 3 oder neuer. Es besteht keinerlei Gewährleistung, soweit gesetzlich zulässig.</translation>
+    </message>
+    <message>
+        <source>Configure DHCP server</source>
+        <translation>DHCP-Server konfigurieren</translation>
     </message>
 </context>
 <context>
     <name>QAbstractTableModel</name>
     <message>
-        <location filename="../dialogs/routemodel.cpp" line="16"/>
         <source>Net mask</source>
-        <translation type="unfinished"></translation>
+        <translation>Netzmaske</translation>
     </message>
     <message>
-        <location filename="../dialogs/routemodel.cpp" line="18"/>
         <source>IP net</source>
-        <translation type="unfinished"></translation>
+        <translation>IP-Netz</translation>
     </message>
     <message>
-        <location filename="../dialogs/routemodel.cpp" line="20"/>
         <source>Gateway</source>
-        <translation type="unfinished"></translation>
+        <translation>Gateway</translation>
     </message>
 </context>
 <context>
     <name>QDialog</name>
     <message>
-        <location filename="../server/interfacesdialog.cpp" line="17"/>
         <source>Available interfaces</source>
-        <translation type="unfinished"></translation>
+        <translation>Verfügbare Schnittstellen</translation>
     </message>
     <message>
-        <location filename="../server/interfacesdialog.cpp" line="20"/>
         <source>Select interfaces</source>
-        <translation type="unfinished"></translation>
+        <translation>Schnittstellen auswählen</translation>
     </message>
     <message>
-        <location filename="../server/interfacesdialog.cpp" line="46"/>
         <source>Available interfaces are not found!</source>
-        <translation type="unfinished"></translation>
+        <translation>Keine verfügbaren Schnittstellen gefunden!</translation>
     </message>
 </context>
 <context>
     <name>QObject</name>
     <message>
-        <location filename="../app/main.cpp" line="45"/>
         <source>Error</source>
-        <translation type="unfinished"></translation>
+        <translation>Fehler</translation>
     </message>
     <message>
-        <location filename="../app/main.cpp" line="45"/>
         <source>Must be superuser</source>
-        <translation type="unfinished"></translation>
+        <translation>Dieses Programm muss als Superuser ausgeführt werden</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="21"/>
         <source>Updating DHCP-server status...</source>
-        <translation type="unfinished"></translation>
+        <translation>Status des DHCP-Servers wird abgefragt …</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="23"/>
         <source>DHCP-server is running</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server läuft</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="25"/>
         <source>DHCP-server is stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP-Server ist angehalten</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="34"/>
         <source>DHCP-server already running</source>
-        <translation type="unfinished"></translation>
+        <translation>Der DHCP-Server läuft bereits</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="39"/>
         <source>DHCP-server already stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>Der DHCP-Server ist bereits angehalten</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="57"/>
         <source>Checking DHCP-server status failed
 %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Abfrage des DHCP-Server-Status ist fehlgeschlagen
+%1</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="93"/>
         <source>Some operation with DHCP-server already executes</source>
-        <translation type="unfinished"></translation>
+        <translation>Am DHCP-Server läuft bereits ein anderer Vorgang</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager.cpp" line="120"/>
         <source>Operation with DHCP-server failed
 %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Vorgang am DHCP-Server ist fehlgeschlagen
+%1</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager_interfaces.cpp" line="86"/>
         <source>Unable to open file &apos;%1&apos; for read</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei „%1“ kann nicht zum Lesen geöffnet werden</translation>
     </message>
     <message>
-        <location filename="../server/dhcpservermanager_interfaces.cpp" line="126"/>
         <source>Unable to open file &apos;%1&apos; for write</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei „%1“ kann nicht zum Schreiben geöffnet werden</translation>
     </message>
 </context>
 <context>
     <name>RangeInputDialog</name>
     <message>
-        <location filename="../dialogs/rangeinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/rangeinputdialog.ui" line="17"/>
         <source>Start IP:</source>
-        <translation type="unfinished"></translation>
+        <translation>Erste IP-Adresse:</translation>
     </message>
     <message>
-        <location filename="../dialogs/rangeinputdialog.ui" line="30"/>
         <source>End IP:</source>
-        <translation type="unfinished"></translation>
+        <translation>Letzte IP-Adresse:</translation>
     </message>
 </context>
 <context>
     <name>SharedNetworkInputDialog</name>
     <message>
-        <location filename="../dialogs/sharednetworkinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/sharednetworkinputdialog.ui" line="17"/>
         <source>Name:</source>
-        <translation type="unfinished"></translation>
+        <translation>Name:</translation>
     </message>
 </context>
 <context>
     <name>StatementInputDialog</name>
     <message>
-        <location filename="../dialogs/statementinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/statementinputdialog.ui" line="24"/>
         <source>Attributes:</source>
-        <translation type="unfinished"></translation>
+        <translation>Attribute:</translation>
     </message>
 </context>
 <context>
     <name>StaticRouteInputDialog</name>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.ui" line="13"/>
         <source>Static routes</source>
-        <translation type="unfinished"></translation>
+        <translation>Statische Routen</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.ui" line="36"/>
         <source>Add</source>
-        <translation type="unfinished"></translation>
+        <translation>Hinzufügen</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.ui" line="49"/>
         <source>Remove</source>
-        <translation type="unfinished"></translation>
+        <translation>Entfernen</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.ui" line="74"/>
         <source>Route for MS systems</source>
-        <translation type="unfinished"></translation>
+        <translation>Route für MS-Systeme</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.cpp" line="97"/>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Information</translation>
     </message>
     <message>
-        <location filename="../dialogs/staticrouteinputdialog.cpp" line="97"/>
         <source>There is an empty cell.
 To add, fill in the cell.</source>
-        <translation type="unfinished"></translation>
+        <translation>Es gibt eine leere Zelle.
+Füllen Sie sie aus, um eine weitere hinzuzufügen.</translation>
     </message>
 </context>
 <context>
     <name>SubnetInputDialog</name>
     <message>
-        <location filename="../dialogs/subnetinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/subnetinputdialog.ui" line="17"/>
         <source>Address:</source>
-        <translation type="unfinished"></translation>
+        <translation>Adresse:</translation>
     </message>
     <message>
-        <location filename="../dialogs/subnetinputdialog.ui" line="30"/>
         <source>Netmask:</source>
-        <translation type="unfinished"></translation>
+        <translation>Netzmaske:</translation>
     </message>
 </context>
 <context>
     <name>TimeInputDialog</name>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="7"/>
         <source>Dialog</source>
-        <translation type="unfinished"></translation>
+        <translation>Dialog</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="24"/>
         <source>Mounth:</source>
-        <translation type="unfinished"></translation>
+        <translation>Monate:</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="51"/>
         <source>Days:</source>
-        <translation type="unfinished"></translation>
+        <translation>Tage:</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="82"/>
         <source> h</source>
-        <translation type="unfinished"></translation>
+        <translation> h</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="92"/>
-        <location filename="../dialogs/timeinputdialog.ui" line="112"/>
         <source>:</source>
-        <translation type="unfinished"></translation>
+        <translation>:</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="102"/>
         <source> m</source>
-        <translation type="unfinished"></translation>
+        <translation> min</translation>
     </message>
     <message>
-        <location filename="../dialogs/timeinputdialog.ui" line="122"/>
         <source> s</source>
-        <translation type="unfinished"></translation>
+        <translation> s</translation>
+    </message>
+</context>
+<context>
+    <name>fileio</name>
+    <message>
+        <source>The old content cannot be kept while it is overwritten</source>
+        <translation>Der alte Inhalt kann während des Überschreibens nicht aufbewahrt werden</translation>
+    </message>
+    <message>
+        <source>%1. The file is damaged, its old content is kept in %2</source>
+        <translation>%1. Die Datei ist beschädigt, ihr alter Inhalt liegt in %2</translation>
     </message>
 </context>
 </TS>
