@@ -7,7 +7,7 @@
 
 namespace {
 
-constexpr qint64 momentaryBytes = 4 * 1024 * 1024;
+constexpr qint64 momentaryBytes = qint64{4} << 20U;
 
 } // namespace
 
