@@ -1,0 +1,617 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/fmain.h"
+#include "common/paths.h"
+#include "config/dhcpdconfigmodel.h"
+#include "dialogs/hostinputdialog.h"
+#include "leases/dhcpdleasesmodel.h"
+#include "tests/app/testmachine.h"
+#include "tests/support/modalboxes.h"
+#include "tests/support/temporaryroot.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QContextMenuEvent>
+#include <QDialogButtonBox>
+#include <QFile>
+#include <QLineEdit>
+#include <QMenu>
+#include <QProcess>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QTabBar>
+#include <QTableView>
+#include <QTest>
+#include <QToolButton>
+#include <QTreeView>
+
+namespace {
+
+const QString foundStyle = QStringLiteral("QLineEdit { color: black; }");
+const QString notFoundStyle = QStringLiteral("QLineEdit { color: red; }");
+
+QByteArray lease(const QByteArray &address, const QByteArray &name, const QByteArray &state = "active",
+                 const QByteArray &mac = "00:00:5e:00:53:01", const QByteArray &end = "2026/03/02 20:00:00")
+{
+    return "lease " + address + " {\n  starts 1 2026/03/02 08:00:00;\n  ends 1 " + end + ";\n  binding state " + state +
+           ";\n  hardware ethernet " + mac + ";\n  client-hostname \"" + name + "\";\n}\n";
+}
+
+const QByteArray configuration = R"(ddns-hostname gamma;
+subnet 10.0.0.0 netmask 255.255.255.0 {
+    host nested {
+    }
+}
+host delta {
+}
+host delta {
+    fixed-address 10.0.0.77;
+}
+)";
+
+/// Runs a shell command with the path of the lease file as its argument, while the window goes on.
+void runOutside(const QString &command, const QByteArray &input = {})
+{
+    QProcess shell;
+    shell.start(QStringLiteral("sh"), {QStringLiteral("-ec"), command, QStringLiteral("sh"), paths::leases()});
+    shell.write(input);
+    shell.closeWriteChannel();
+    QTRY_COMPARE(shell.state(), QProcess::NotRunning);
+    QCOMPARE(shell.exitCode(), 0);
+}
+
+/// The window, with the leases in front, driven as by a user.
+struct Site final
+{
+    explicit Site(const TestMachine &machine)
+        : window{machine.openWindow()}
+        , table{window->findChild<QTableView *>(QStringLiteral("dhcpdLeaseTable"))}
+        , field{window->findChild<QLineEdit *>(QStringLiteral("searchLease"))}
+        , previous{window->findChild<QToolButton *>(QStringLiteral("searchPrevLease"))}
+        , next{window->findChild<QToolButton *>(QStringLiteral("searchNextLease"))}
+        , tabs{window->findChild<QTabWidget *>(QStringLiteral("mainTabWidget"))}
+        , tree{window->findChild<QTreeView *>(QStringLiteral("topologyTree"))}
+        , model{window->findChild<DhcpdConfigModel *>()}
+    {
+        QTest::mouseClick(tabs->tabBar(), Qt::LeftButton, {}, tabs->tabBar()->tabRect(1).center());
+    }
+
+    QString cell(int row, int column) const { return table->model()->index(row, column).data().toString(); }
+    QStringList addresses() const
+    {
+        QStringList texts;
+        for (int row = 0; row < table->model()->rowCount(); ++row)
+            texts.append(cell(row, DhcpdLeasesModel::Address));
+        return texts;
+    }
+    QString currentAddress() const
+    {
+        return table->currentIndex().siblingAtColumn(DhcpdLeasesModel::Address).data().toString();
+    }
+    QString topAddress() const { return cell(table->rowAt(0), DhcpdLeasesModel::Address); }
+    bool stepsAreEnabled() const { return previous->isEnabled() && next->isEnabled(); }
+    bool stepsAreDisabled() const { return !previous->isEnabled() && !next->isEnabled(); }
+
+    int rowOf(const char *address) const { return addresses().indexOf(QString::fromLatin1(address)); }
+    QPoint centre(const char *address, int column = 0) const
+    {
+        const QModelIndex index = table->model()->index(rowOf(address), column);
+        table->scrollTo(index);
+        return table->visualRect(index).center();
+    }
+    void click(const char *address, int column = 0) const
+    {
+        QTest::mouseClick(table->viewport(), Qt::LeftButton, {}, centre(address, column));
+    }
+    void doubleClick(const char *address) const
+    {
+        click(address);
+        QTest::mouseDClick(table->viewport(), Qt::LeftButton, {}, centre(address));
+    }
+    void rightClick(QPoint position) const
+    {
+        QTest::mouseClick(table->viewport(), Qt::RightButton, {}, position);
+        QContextMenuEvent event{QContextMenuEvent::Mouse, position, table->viewport()->mapToGlobal(position)};
+        QApplication::sendEvent(table->viewport(), &event);
+    }
+    void type(const QString &text) const { QTest::keyClicks(field, text); }
+    void press(QToolButton *button) const { QTest::mouseClick(button, Qt::LeftButton); }
+
+    /// The values of the children of the "All network" node.
+    QStringList values() const
+    {
+        QStringList texts;
+        const QModelIndex network = model->index(0, 0);
+        for (int row = 0; row < model->rowCount(network); ++row)
+            texts.append(model->index(row, 1, network).data().toString());
+        return texts;
+    }
+
+    std::unique_ptr<FMain> window;
+    QTableView *table;
+    QLineEdit *field;
+    QToolButton *previous;
+    QToolButton *next;
+    QTabWidget *tabs;
+    QTreeView *tree;
+    DhcpdConfigModel *model;
+};
+
+ModalBoxes::Box goToTopology()
+{
+    return {QMessageBox::Information, QStringLiteral("Information"),
+            QStringLiteral("The IP address is reserved.\nGo to topology?"), QMessageBox::Yes | QMessageBox::No,
+            QMessageBox::Yes};
+}
+
+void press(const QDialog &dialog, QDialogButtonBox::StandardButton button)
+{
+    QTest::mouseClick(dialog.findChild<QDialogButtonBox *>()->button(button), Qt::LeftButton);
+}
+
+void save(HostInputDialog *dialog) { press(*dialog, QDialogButtonBox::Save); }
+
+} // namespace
+
+class LeaseCommandsTest final : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+
+    void search_data();
+    void search();
+    void searchForAnEnd();
+    void clearedSearchShowsEverything();
+    void matchesAreScrolledTo();
+    void stepsDoNotWrap();
+    void stepsVisitOneColumn();
+    void stepsForgetASelectedRow();
+    void stepsNeedAText();
+
+    void menuOpensOverALease();
+    void dialogShowsTheLease_data();
+    void dialogShowsTheLease();
+    void cancelledReservationChangesNothing();
+    void reservationIsAdded();
+    void reservationGoesToTopology_data();
+    void reservationGoesToTopology();
+    void reservationTakesTheTypedValues();
+    void reservationOutlivesAReload();
+    void reservationNeedsAConfiguration();
+    void reservationNeedsALease();
+
+    void placeIsKeptOverAutomaticReloads_data();
+    void placeIsKeptOverAutomaticReloads();
+    void searchIsKeptOverAutomaticReloads();
+
+private:
+    std::unique_ptr<TestMachine> m_machine;
+};
+
+void LeaseCommandsTest::init()
+{
+    m_machine = std::make_unique<TestMachine>();
+    writeTestFile(paths::configuration(), configuration);
+    writeTestFile(paths::leases(),
+                  lease("10.0.0.11", "gamma", "free") + lease("10.0.0.9", "Alpha") +
+                      lease("10.0.0.10", "beta", "active", "00:00:5e:AC:53:02") +
+                      lease("10.0.1.9", "at-10.0.0.1", "backup", "00:00:5e:00:53:04", "2031/07/19 03:04:05") +
+                      lease("10.0.1.10", "alphabet", "free"));
+}
+
+void LeaseCommandsTest::cleanup() { m_machine.reset(); }
+
+void LeaseCommandsTest::search_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("shown");
+    QTest::addColumn<QString>("first"); // the first match, none for a search that finds nothing
+    QTest::addColumn<int>("column");
+
+    const auto row = [](const char *name, const char *text, const char *shown, const char *first, int column) {
+        QTest::addRow("%s", name) << QString::fromLatin1(text) << QString::fromLatin1(shown)
+                                  << QString::fromLatin1(first) << column;
+    };
+    row("address", "10.0.1", "10.0.1.9 10.0.1.10", "10.0.1.9", DhcpdLeasesModel::Address);
+    row("address and name", "10.0.0.1", "10.0.0.10 10.0.0.11 10.0.1.9", "10.0.0.10", DhcpdLeasesModel::Address);
+    row("name", "beta", "10.0.0.10", "10.0.0.10", DhcpdLeasesModel::HostName);
+    row("part of a name", "bet", "10.0.0.10 10.0.1.10", "10.0.0.10", DhcpdLeasesModel::HostName);
+    row("letter case", "alpha", "10.0.1.10", "10.0.1.10", DhcpdLeasesModel::HostName);
+    row("other letter case", "Alpha", "10.0.0.9", "10.0.0.9", DhcpdLeasesModel::HostName);
+    row("matches ignore case", "ac", "10.0.0.9 10.0.0.10 10.0.1.9", "10.0.0.10", DhcpdLeasesModel::Mac);
+    row("state", "free", "10.0.0.11 10.0.1.10", "10.0.0.11", DhcpdLeasesModel::State);
+    row("no pattern", "10.0.0.*", "", "", -1);
+    row("nothing", "zeta", "", "", -1);
+    row("nothing in this case", "BETA", "", "", -1);
+}
+
+void LeaseCommandsTest::search()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, shown);
+    QFETCH(QString, first);
+    QFETCH(int, column);
+    const Site site{*m_machine};
+    site.type(text);
+    QCOMPARE(site.addresses().join(QLatin1Char{' '}), shown);
+    if (first.isEmpty()) {
+        QCOMPARE(site.field->styleSheet(), notFoundStyle);
+        QVERIFY(site.stepsAreDisabled());
+    } else {
+        QCOMPARE(site.field->styleSheet(), foundStyle);
+        QVERIFY(site.stepsAreEnabled());
+        QCOMPARE(site.currentAddress(), first);
+        QCOMPARE(site.table->currentIndex().column(), column);
+        QCOMPARE(site.table->selectionModel()->selectedIndexes(), QModelIndexList{site.table->currentIndex()});
+    }
+}
+
+void LeaseCommandsTest::searchForAnEnd()
+{
+    const Site site{*m_machine};
+    const QString end = site.cell(site.rowOf("10.0.1.9"), DhcpdLeasesModel::End);
+    QVERIFY(!end.isEmpty());
+    site.type(end);
+    QCOMPARE(site.addresses(), QStringList{QStringLiteral("10.0.1.9")});
+    QCOMPARE(site.table->currentIndex().column(), int{DhcpdLeasesModel::End});
+    QVERIFY(site.stepsAreEnabled());
+}
+
+void LeaseCommandsTest::clearedSearchShowsEverything()
+{
+    const Site site{*m_machine};
+    const QStringList all = site.addresses();
+    QCOMPARE(all.join(QLatin1Char{' '}), QStringLiteral("10.0.0.9 10.0.0.10 10.0.0.11 10.0.1.9 10.0.1.10"));
+    for (const QString &text : {QStringLiteral("beta"), QStringLiteral("zeta")}) {
+        site.type(text);
+        QVERIFY(site.addresses() != all);
+        QTest::keyClick(site.field, Qt::Key_A, Qt::ControlModifier);
+        QTest::keyClick(site.field, Qt::Key_Delete);
+        QCOMPARE(site.addresses(), all);
+        QCOMPARE(site.field->styleSheet(), foundStyle);
+        QVERIFY(site.stepsAreDisabled());
+    }
+}
+
+void LeaseCommandsTest::matchesAreScrolledTo()
+{
+    QByteArray leases;
+    for (int i = 0; i < 200; ++i)
+        leases += lease("10.0.0." + QByteArray::number(i), "some");
+    writeTestFile(paths::leases(), leases);
+    const Site site{*m_machine};
+    const auto currentIsShown = [&site] {
+        return site.table->viewport()->rect().contains(site.table->visualRect(site.table->currentIndex()));
+    };
+    site.type(QStringLiteral("some"));
+    QCOMPARE(site.table->model()->rowCount(), 200);
+    for (int i = 0; i < 199; ++i)
+        site.press(site.next);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.199"));
+    QVERIFY(currentIsShown());
+    QTest::keyClick(site.field, Qt::Key_Backspace);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.0"));
+    QVERIFY(currentIsShown());
+}
+
+void LeaseCommandsTest::stepsDoNotWrap()
+{
+    const Site site{*m_machine};
+    site.type(QStringLiteral("10.0.0."));
+    QStringList visited{site.currentAddress()};
+    for (QToolButton *button :
+         {site.previous, site.next, site.next, site.next, site.previous, site.previous, site.previous, site.next}) {
+        site.press(button);
+        visited.append(site.currentAddress());
+        QCOMPARE(site.table->selectionModel()->selectedIndexes(), QModelIndexList{site.table->currentIndex()});
+    }
+    QCOMPARE(visited.join(QLatin1Char{' '}),
+             QStringLiteral("10.0.0.9 10.0.0.9 10.0.0.10 10.0.0.11 10.0.0.11 10.0.0.10 10.0.0.9 10.0.0.9 10.0.0.10"));
+}
+
+void LeaseCommandsTest::stepsVisitOneColumn()
+{
+    const Site site{*m_machine};
+    site.type(QStringLiteral("10.0.0.1"));
+    QCOMPARE(site.table->model()->rowCount(), 3);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
+    for (int i = 0; i < 3; ++i)
+        site.press(site.next);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11")); // not the one with the text in its name
+}
+
+// Where the user selected a whole row, the steps go on from the match that was last stepped to.
+void LeaseCommandsTest::stepsForgetASelectedRow()
+{
+    const Site site{*m_machine};
+    site.type(QStringLiteral("10.0.0."));
+    site.click("10.0.0.11");
+    QCOMPARE(site.table->selectionModel()->selectedIndexes().size(), 6);
+    site.press(site.next);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
+    site.press(site.next);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11"));
+
+    site.click("10.0.0.9");
+    site.press(site.next); // there is none behind the last
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.9"));
+    QCOMPARE(site.table->selectionModel()->selectedIndexes().size(), 6);
+    site.press(site.previous);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
+}
+
+void LeaseCommandsTest::stepsNeedAText()
+{
+    const Site site{*m_machine};
+    site.click("10.0.0.10");
+    site.window->selectNextLease();
+    site.window->selectPrevLease();
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
+    QVERIFY(site.stepsAreDisabled());
+}
+
+void LeaseCommandsTest::menuOpensOverALease()
+{
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectMenu([&site](QMenu *menu) {
+        QCOMPARE(menu->title(), QStringLiteral("Actions"));
+        QCOMPARE(menu->actions(), QList<QAction *>{site.window->findChild<QAction *>(QStringLiteral("aAddReserveIP"))});
+        QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(menu->actions().first()).center());
+    });
+    QString address;
+    boxes.expectDialog<HostInputDialog>([&address](HostInputDialog *dialog) {
+        address = dialog->ip();
+        press(*dialog, QDialogButtonBox::Cancel);
+    });
+    site.rightClick(site.centre("10.0.0.10", 2));
+    boxes.verify();
+    QCOMPARE(address, QStringLiteral("10.0.0.10"));
+
+    const QPoint beside{5, site.table->viewport()->height() - 5};
+    QVERIFY(!site.table->indexAt(beside).isValid());
+    site.rightClick(beside); // opens nothing
+    QTest::qWait(0);
+}
+
+void LeaseCommandsTest::dialogShowsTheLease_data()
+{
+    QTest::addColumn<bool>("byAction");
+    QTest::addRow("double click") << false;
+    QTest::addRow("action") << true;
+}
+
+void LeaseCommandsTest::dialogShowsTheLease()
+{
+    QFETCH(bool, byAction);
+    const Site site{*m_machine};
+    site.type(QStringLiteral("10.0.0.1")); // the table's rows are not the model's any more
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([&site](HostInputDialog *dialog) {
+        QCOMPARE(dialog->windowTitle(), QStringLiteral("Reserve an IP address"));
+        QCOMPARE(dialog->parent(), site.window.get());
+        QCOMPARE(dialog->ip(), QStringLiteral("10.0.1.9"));
+        QCOMPARE(dialog->mac(), QStringLiteral("00:00:5e:00:53:04"));
+        QCOMPARE(dialog->name(), QStringLiteral("at-10.0.0.1"));
+        QCOMPARE(dialog->size(), dialog->sizeHint());
+        press(*dialog, QDialogButtonBox::Cancel);
+    });
+    if (byAction) {
+        site.click("10.0.1.9", 4);
+        site.window->findChild<QAction *>(QStringLiteral("aAddReserveIP"))->trigger();
+    } else {
+        site.doubleClick("10.0.1.9");
+    }
+    boxes.verify();
+}
+
+void LeaseCommandsTest::cancelledReservationChangesNothing()
+{
+    const Site site{*m_machine};
+    const QByteArray before = site.model->fileContent();
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([](HostInputDialog *dialog) { QTest::keyClick(dialog, Qt::Key_Escape); });
+    site.doubleClick("10.0.0.10");
+    boxes.verify();
+    QCOMPARE(site.model->fileContent(), before);
+    QVERIFY(!site.model->isModified());
+    QCOMPARE(site.tabs->currentIndex(), 1);
+}
+
+void LeaseCommandsTest::reservationIsAdded()
+{
+    const Site site{*m_machine};
+    const QStringList before = site.values();
+    site.tree->collapseAll();
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>(save);
+    boxes.expectBox(goToTopology(), QMessageBox::No);
+    site.doubleClick("10.0.1.9"); // in no subnet of the configuration
+    boxes.verify();
+
+    QCOMPARE(site.tabs->currentIndex(), 1);
+    QCOMPARE(site.values(), before + QStringList{QStringLiteral("at-10.0.0.1")});
+    QVERIFY(site.model->isModified());
+    const QByteArray content = site.model->fileContent();
+    QVERIFY(content.contains("host at-10.0.0.1 {"));
+    QVERIFY(content.contains("hardware ethernet 00:00:5e:00:53:04;"));
+    QVERIFY(content.contains("fixed-address 10.0.1.9;"));
+    const QModelIndex network = site.model->index(0, 0);
+    QVERIFY(site.tree->isExpanded(network));
+    for (int row = 1; row < site.model->rowCount(network); ++row) {
+        const QModelIndex child = site.model->index(row, 0, network);
+        QCOMPARE(site.tree->isExpanded(child), site.model->hasChildren(child));
+    }
+}
+
+void LeaseCommandsTest::reservationGoesToTopology_data()
+{
+    QTest::addColumn<QByteArray>("leaseName");
+    QTest::addColumn<QString>("typedName"); // null: as in the lease
+    QTest::addColumn<int>("row");           // the child of the network that is current in the end; -1: none of them
+    // The children of the network: ddns-hostname gamma, the subnet, two hosts delta, and the new one.
+    QTest::addRow("new host") << QByteArray{"beta"} << QString{} << 4;
+    QTest::addRow("name changed") << QByteArray{"beta"} << QStringLiteral("eta") << -1;
+    QTest::addRow("name changed, the old one there")
+        << QByteArray{"delta"} << QStringLiteral("eta") << 2; // the first of the two
+    QTest::addRow("any statement of this value") << QByteArray{"gamma"} << QString{} << 0;
+    QTest::addRow("no deeper statement") << QByteArray{"nested"} << QStringLiteral("eta") << -1;
+    QTest::addRow("letter case") << QByteArray{"DELTA"} << QStringLiteral("eta") << -1;
+}
+
+void LeaseCommandsTest::reservationGoesToTopology()
+{
+    QFETCH(QByteArray, leaseName);
+    QFETCH(QString, typedName);
+    QFETCH(int, row);
+    writeTestFile(paths::leases(), lease("10.0.0.10", leaseName));
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([&typedName](HostInputDialog *dialog) {
+        if (!typedName.isNull())
+            dialog->setName(typedName);
+        save(dialog);
+    });
+    boxes.expectBox(goToTopology(), QMessageBox::Yes);
+    site.doubleClick("10.0.0.10");
+    boxes.verify();
+    QCOMPARE(site.tabs->currentIndex(), 0);
+    const QModelIndex network = site.model->index(0, 0);
+    QCOMPARE(site.model->rowCount(network), 5);
+    const QModelIndex current = site.tree->currentIndex();
+    QCOMPARE(current.isValid() && current.parent() == network ? current.row() : -1, row);
+}
+
+void LeaseCommandsTest::reservationTakesTheTypedValues()
+{
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([](HostInputDialog *dialog) {
+        dialog->setName(QStringLiteral("eta"));
+        dialog->setMac(QStringLiteral("00:00:5e:00:53:ff"));
+        dialog->setIp(QStringLiteral("10.0.0.200"));
+        save(dialog);
+    });
+    boxes.expectBox(goToTopology(), Qt::Key_Escape);
+    site.doubleClick("10.0.0.10");
+    boxes.verify();
+    QCOMPARE(site.tabs->currentIndex(), 1);
+    const QByteArray content = site.model->fileContent();
+    QVERIFY(content.contains("host eta {"));
+    QVERIFY(content.contains("hardware ethernet 00:00:5e:00:53:ff;"));
+    QVERIFY(content.contains("fixed-address 10.0.0.200;"));
+}
+
+void LeaseCommandsTest::reservationOutlivesAReload()
+{
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([&site](HostInputDialog *dialog) {
+        runOutside(QStringLiteral("cat >\"$1\""), lease("10.9.9.9", "other"));
+        QTRY_COMPARE(site.table->model()->rowCount(), 1);
+        QCOMPARE(dialog->ip(), QStringLiteral("10.0.0.10"));
+        save(dialog);
+    });
+    boxes.expectBox(goToTopology(), QMessageBox::Yes);
+    site.doubleClick("10.0.0.10");
+    boxes.verify();
+    QCOMPARE(site.tree->currentIndex().siblingAtColumn(1).data().toString(), QStringLiteral("beta"));
+    QVERIFY(site.model->fileContent().contains("fixed-address 10.0.0.10;"));
+}
+
+void LeaseCommandsTest::reservationNeedsAConfiguration()
+{
+    QVERIFY(QFile::remove(paths::configuration()));
+    ModalBoxes boxes;
+    boxes.expectBox({QMessageBox::Critical, QStringLiteral("Error"),
+                     QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()), QMessageBox::Ok,
+                     QMessageBox::Ok},
+                    QMessageBox::Ok);
+    const Site site{*m_machine};
+    boxes.verify();
+    site.doubleClick("10.0.0.10");
+    site.window->findChild<QAction *>(QStringLiteral("aAddReserveIP"))->trigger();
+    QCOMPARE(site.model->rowCount(), 0);
+}
+
+void LeaseCommandsTest::reservationNeedsALease()
+{
+    QVERIFY(QFile::remove(paths::leases()));
+    const ModalBoxes noBox;
+    const Site site{*m_machine};
+    site.window->findChild<QAction *>(QStringLiteral("aAddReserveIP"))->trigger();
+    QVERIFY(!site.model->isModified());
+}
+
+void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data()
+{
+    QTest::addColumn<QString>("command");
+    QTest::addRow("appended to") << QStringLiteral("cat >>\"$1\"");
+    QTest::addRow("replaced") << QStringLiteral("cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"");
+    QTest::addRow("replaced, the old one kept")
+        << QStringLiteral("ln -f \"$1\" \"$1~\"; cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"");
+    QTest::addRow("written anew") << QStringLiteral("{ cat \"$1\"; cat; } >\"$1.all\"; cat \"$1.all\" >\"$1\"");
+}
+
+void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
+{
+    QFETCH(QString, command);
+    QByteArray leases;
+    for (int i = 0; i < 400; ++i)
+        leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
+    writeTestFile(paths::leases(), leases);
+    const Site site{*m_machine};
+    site.click("10.0.1.100", 2);
+    site.table->verticalScrollBar()->setValue(site.rowOf("10.0.0.150"));
+    QCOMPARE(site.topAddress(), QStringLiteral("10.0.0.150"));
+
+    // Rows come above, within and below what is shown.
+    QByteArray more;
+    for (const char *address : {"9.0.0.1", "10.0.0.201", "10.0.0.202", "11.0.0.1"})
+        more += lease(address, "more");
+    for (int round = 0; round < 2; ++round) {
+        runOutside(command, more);
+        QTRY_COMPARE(site.table->model()->rowCount(), 404 + round);
+        QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.100"));
+        QCOMPARE(site.table->currentIndex().column(), 2);
+        QCOMPARE(site.table->selectionModel()->selectedRows(2), QModelIndexList{site.table->currentIndex()});
+        QCOMPARE(site.topAddress(), QStringLiteral("10.0.0.150"));
+        more = lease("9.0.0.2", "once more");
+    }
+}
+
+void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
+{
+    const Site site{*m_machine};
+    site.type(QStringLiteral("bet"));
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
+    site.press(site.next);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.10"));
+
+    for (const QString &command :
+         {QStringLiteral("cat >>\"$1\""), QStringLiteral("cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"")}) {
+        const int before = site.table->model()->rowCount();
+        const QByteArray address = "9.0.0." + QByteArray::number(before);
+        runOutside(command, lease(address, "alphabet") + lease("8.0.0.1", "other"));
+        QTRY_COMPARE(site.table->model()->rowCount(), before + 1); // the filter holds
+        QCOMPARE(site.field->text(), QStringLiteral("bet"));
+        QCOMPARE(site.field->styleSheet(), foundStyle);
+        QVERIFY(site.stepsAreEnabled());
+        QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.10"));
+        QCOMPARE(site.table->currentIndex().column(), int{DhcpdLeasesModel::HostName});
+    }
+
+    // A colour that tells of no match stays as well, although there is one now.
+    QTest::keyClick(site.field, Qt::Key_A, Qt::ControlModifier);
+    site.type(QStringLiteral("zeta"));
+    QCOMPARE(site.field->styleSheet(), notFoundStyle);
+    runOutside(QStringLiteral("cat >>\"$1\""), lease("9.0.0.99", "zeta"));
+    QTRY_COMPARE(site.addresses(), QStringList{QStringLiteral("9.0.0.99")});
+    QCOMPARE(site.field->styleSheet(), notFoundStyle);
+    QVERIFY(site.stepsAreDisabled());
+}
+
+QTEST_MAIN(LeaseCommandsTest)
+#include "tst_leasecommands.moc"
