@@ -3,8 +3,6 @@
 
 #include <QDir>
 #include <QFile>
-#include <QFileInfo>
-#include <QMap>
 #include <QSet>
 
 #include <algorithm>
@@ -18,8 +16,6 @@ struct IconTheme
     QStringList folders; ///< where its icons lie
     QStringList parents;
 };
-
-using IconThemes = QMap<QString, IconTheme>;
 
 // The theme's own entries stand in the first group; the groups after it, one for each folder, are most of the file.
 std::optional<IconTheme> readIndex(const QString &path)
@@ -48,46 +44,59 @@ std::optional<IconTheme> readIndex(const QString &path)
     return theme;
 }
 
-IconThemes installedThemes(const QStringList &searchPaths)
+// A theme in several search paths is the first of them that has a valid index.
+IconTheme findTheme(const QStringList &searchPaths, const QString &name)
 {
-    IconThemes themes;
     for (const QString &searchPath : searchPaths) {
-        const QDir parent{searchPath};
-        for (const QString &name : parent.entryList(QDir::Dirs | QDir::NoDotAndDotDot)) {
-            const std::optional<IconTheme> theme{readIndex(parent.filePath(name + QStringLiteral("/index.theme")))};
-            if (!theme || theme->folders.isEmpty() || themes.contains(name))
-                continue;
-            IconTheme &added{themes[name]};
-            added.parents = theme->parents;
-            for (const QString &folder : theme->folders)
-                added.folders.append(parent.filePath(name + QLatin1Char('/') + folder.trimmed() + QLatin1Char('/')));
-        }
+        const QString root{searchPath + QLatin1Char('/') + name + QLatin1Char('/')};
+        std::optional<IconTheme> theme{readIndex(root + QStringLiteral("index.theme"))};
+        if (!theme || theme->folders.isEmpty())
+            continue;
+        for (QString &folder : theme->folders)
+            folder = root + folder.trimmed() + QLatin1Char('/');
+        return *theme;
     }
-    return themes;
+    return {};
 }
 
-bool hasIcon(const IconTheme &theme, const QString &name)
+// The folders of the theme and of all that it inherits from, themes visited before left out.
+QStringList foldersOf(const QStringList &searchPaths, const QString &name, QSet<QString> &visited)
 {
-    const QString drawing{name + QStringLiteral(".svg")};
-    const QString picture{name + QStringLiteral(".png")};
-    return std::any_of(theme.folders.cbegin(), theme.folders.cend(), [&](const QString &folder) {
-        return QFileInfo::exists(folder + drawing) || QFileInfo::exists(folder + picture);
+    if (visited.contains(name))
+        return {};
+    visited.insert(name);
+    const IconTheme theme{findTheme(searchPaths, name)};
+    QStringList folders{theme.folders};
+    // Without folders it is a theme of cursors, and what it inherits is not the icons' concern.
+    if (!folders.isEmpty()) {
+        for (const QString &parent : theme.parents)
+            folders += foldersOf(searchPaths, parent.trimmed(), visited);
+    }
+    return folders;
+}
+
+bool hasIcon(const QStringList &folders, const QString &name)
+{
+    return std::any_of(folders.cbegin(), folders.cend(), [&](const QString &folder) {
+        return QFile::exists(folder + name + QStringLiteral(".svg")) ||
+               QFile::exists(folder + name + QStringLiteral(".png"));
     });
 }
 
-bool hasIconOrInherits(const IconThemes &themes, const QString &theme, const QString &name, QSet<QString> &visited)
+// Looks for no more names than it takes to know: a name that is missing is looked for in every folder.
+bool hasHalf(const QStringList &folders, const QStringList &names)
 {
-    const auto found{themes.constFind(theme)};
-    if (found == themes.cend() || visited.contains(theme))
-        return false;
-    visited.insert(theme);
-    return hasIcon(*found, name) ||
-           std::any_of(found->parents.cbegin(), found->parents.cend(), [&](const QString &parent) {
-               return hasIconOrInherits(themes, parent.trimmed(), name, visited);
-           });
+    int found{0};
+    int missing{0};
+    for (const QString &name : names) {
+        ++(hasIcon(folders, name) ? found : missing);
+        if (2 * found >= names.size() || 2 * missing > names.size())
+            break;
+    }
+    return 2 * found >= names.size();
 }
 
-// Themes with an even count of names: those that look best beside the bundled icons first.
+// Those that look best beside the bundled icons come first.
 int preference(const QString &theme)
 {
     static const QStringList preferred{
@@ -106,22 +115,28 @@ bool suitsPalette(const QString &theme, bool darkPalette)
     return !highContrast && dark == darkPalette;
 }
 
+QStringList installedThemes(const QStringList &searchPaths)
+{
+    QStringList names;
+    for (const QString &searchPath : searchPaths)
+        names += QDir{searchPath}.entryList(QDir::Dirs | QDir::NoDotAndDotDot);
+    return names;
+}
+
 } // namespace
 
 QString suitableIconTheme(const QStringList &searchPaths, const QStringList &names, bool darkPalette)
 {
-    const IconThemes themes{installedThemes(searchPaths)};
-    std::optional<std::tuple<bool, std::ptrdiff_t, int, QString>> best;
-    for (auto theme = themes.keyBegin(); theme != themes.keyEnd(); ++theme) {
-        const auto found{std::count_if(names.cbegin(), names.cend(), [&](const QString &name) {
-            QSet<QString> visited;
-            return hasIconOrInherits(themes, *theme, name, visited);
-        })};
-        if (2 * found < names.size())
-            continue;
-        const std::tuple rank{!suitsPalette(*theme, darkPalette), -found, preference(*theme), *theme};
-        if (!best || rank < *best)
-            best = rank;
-    }
-    return best ? std::get<QString>(*best) : QString{};
+    QStringList themes{installedThemes(searchPaths)};
+    const auto rank = [darkPalette](const QString &theme) {
+        return std::tuple{!suitsPalette(theme, darkPalette), preference(theme), theme};
+    };
+    std::sort(themes.begin(), themes.end(),
+              [&rank](const QString &left, const QString &right) { return rank(left) < rank(right); });
+    const auto chosen{std::find_if(themes.cbegin(), themes.cend(), [&](const QString &theme) {
+        // What every theme falls back on says nothing about this one.
+        QSet<QString> visited{fallbackIconTheme};
+        return hasHalf(foldersOf(searchPaths, theme, visited), names);
+    })};
+    return chosen == themes.cend() ? QString{} : *chosen;
 }

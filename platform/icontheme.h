@@ -3,7 +3,11 @@
 
 #include <QStringList>
 
-/// The installed icon theme below `searchPaths` that has the most of the icons `names`, its parents' included. A dark
-/// theme is taken for a dark palette only and a high-contrast one last, as long as another has at least half of the
-/// names. Empty when no theme has half of them: a patchwork would look worse than the bundled icons.
+/// The theme that every other falls back on; the bundled icons are part of it.
+inline constexpr QLatin1String fallbackIconTheme{"hicolor"};
+
+/// The installed icon theme below `searchPaths` to take: the first that has at least half of the icons `names`, its
+/// parents' included but not the fallback theme's. A dark theme comes first for a dark palette and late for another, a
+/// high-contrast one always late. Empty when no theme has half of them: a patchwork would look worse than the bundled
+/// icons.
 QString suitableIconTheme(const QStringList &searchPaths, const QStringList &names, bool darkPalette);

@@ -11,8 +11,6 @@
 
 namespace {
 
-const QLatin1String lastResortTheme{"hicolor"};
-
 QString &description()
 {
     static QString text;
@@ -29,18 +27,28 @@ QStringList usedIconNames()
     return names;
 }
 
+// Qt reads one index for a theme, the first that it finds. The system's index of the fallback theme lists hundreds of
+// folders, takes longer to read than all the icons do to draw, and has nothing that ours lacks and we look for.
+void useBundledIcons()
+{
+    const QString bundled{QStringLiteral(":/icons")};
+    QStringList paths{QIcon::themeSearchPaths()};
+    paths.removeAll(bundled);
+    paths.prepend(bundled);
+    QIcon::setThemeSearchPaths(paths);
+    if (QIcon::fallbackThemeName().isEmpty())
+        QIcon::setFallbackThemeName(fallbackIconTheme);
+}
+
 void chooseIconTheme()
 {
-    // The bundled icons are part of it.
-    if (QIcon::fallbackThemeName().isEmpty())
-        QIcon::setFallbackThemeName(lastResortTheme);
     const QString named{QIcon::themeName()};
-    if (!named.isEmpty() && named != lastResortTheme)
+    if (!named.isEmpty() && named != fallbackIconTheme)
         return;
     const bool darkPalette{QGuiApplication::palette().color(QPalette::Window).lightness() < 128};
     const QString chosen{suitableIconTheme(QIcon::themeSearchPaths(), usedIconNames(), darkPalette)};
     // Without a theme name Qt looks nowhere, not even among the bundled icons.
-    QIcon::setThemeName(chosen.isEmpty() ? QString{lastResortTheme} : chosen);
+    QIcon::setThemeName(chosen.isEmpty() ? QString{fallbackIconTheme} : chosen);
 }
 
 } // namespace
@@ -50,6 +58,7 @@ void orvInit(const char *version, const char *descriptionText)
     Q_INIT_RESOURCE(platform);
     QCoreApplication::setApplicationVersion(QString::fromUtf8(version));
     description() = QString::fromUtf8(descriptionText);
+    useBundledIcons();
     chooseIconTheme();
 }
 

@@ -55,11 +55,11 @@ class TestIconTheme final : public QObject
     Q_OBJECT
 
 private slots:
-    void theBestIsChosen_data();
-    void theBestIsChosen();
+    void theFirstGoodOneIsChosen_data();
+    void theFirstGoodOneIsChosen();
 };
 
-void TestIconTheme::theBestIsChosen_data()
+void TestIconTheme::theFirstGoodOneIsChosen_data()
 {
     QTest::addColumn<std::vector<Theme>>("themes");
     QTest::addColumn<QString>("onLight");
@@ -73,12 +73,14 @@ void TestIconTheme::theBestIsChosen_data()
                         const QString &onDark) { QTest::addRow("%s", name) << themes << onLight << onDark; };
 
     row("nothing installed", {}, none, none);
-    row("the most names", {{a, plain, icons(2)}, {b, plain, icons(3)}}, b, b);
-    row("equally many", {{b, plain, icons(3)}, {a, plain, icons(3)}}, a, a);
-    row("equally many, one preferred",
+    row("by name", {{b, plain, icons(3)}, {a, plain, icons(3)}}, a, a);
+    row("the first has too few", {{a, plain, icons(1)}, {b, plain, icons(3)}}, b, b);
+    row("preferred ones first",
         {{a, plain, icons(3)}, {QStringLiteral("gnome"), plain, icons(3)}, {QStringLiteral("breeze"), plain, icons(3)}},
         QStringLiteral("breeze"), QStringLiteral("breeze"));
-    row("more names than the preferred", {{a, plain, icons(4)}, {QStringLiteral("breeze"), plain, icons(3)}}, a, a);
+    row("preferred though another has more", {{a, plain, icons(4)}, {QStringLiteral("breeze"), plain, icons(2)}},
+        QStringLiteral("breeze"), QStringLiteral("breeze"));
+    row("the preferred has too few", {{a, plain, icons(2)}, {QStringLiteral("breeze"), plain, icons(1)}}, a, a);
     row("half of the names", {{a, plain, icons(2)}}, a, a);
     row("less than half of the names", {{a, plain, icons(1)}}, none, none);
     row("the dark sibling has more", {{a, plain, icons(3)}, {QStringLiteral("a-Dark"), plain, icons(4)}}, a,
@@ -94,10 +96,14 @@ void TestIconTheme::theBestIsChosen_data()
          {b, plain, {QStringLiteral("22/actions/three.svg")}},
          {QStringLiteral("c"), plain, {QStringLiteral("22/actions/four.svg")}}},
         a, a);
-    row("parents in a ring", {{a, inheriting(b), icons(2)}, {b, inheriting(a), icons(1)}}, a, a);
+    row("parents in a ring", {{a, inheriting(b), icons(1)}, {b, inheriting(a), {QStringLiteral("22/actions/two.svg")}}},
+        a, a);
+    row("names of what every theme falls back on count for none",
+        {{a, inheriting(QStringLiteral("hicolor")), icons(1)}, {QStringLiteral("hicolor"), plain, icons(4)}}, none,
+        none);
     row("a parent that is missing", {{a, inheriting(b), icons(2)}}, a, a);
     row("several folders",
-        {{a, listing(QStringLiteral("16,22/actions , x/y")), icons(2) + icons(4, QStringLiteral("x/y/%1.png"))},
+        {{a, listing(QStringLiteral("16,22/actions , x/y")), icons(1) << QStringLiteral("x/y/two.png")},
          {b, plain, icons(3)}},
         a, a);
     row("a folder that the index does not list", {{a, plain, icons(4, QStringLiteral("48/apps/%1.svg"))}}, none, none);
@@ -108,10 +114,10 @@ void TestIconTheme::theBestIsChosen_data()
     row("an index of nonsense", {{a, QStringLiteral("\x01[[[=,=\n]=Directories"), icons(4)}}, none, none);
     row("in the second search path", {{QStringLiteral("../second/a"), plain, icons(3)}}, a, a);
     row("in both search paths",
-        {{a, plain, icons(2)}, {QStringLiteral("../second/a"), plain, icons(4)}, {b, plain, icons(3)}}, b, b);
+        {{a, plain, icons(1)}, {QStringLiteral("../second/a"), plain, icons(4)}, {b, plain, icons(3)}}, b, b);
 }
 
-void TestIconTheme::theBestIsChosen()
+void TestIconTheme::theFirstGoodOneIsChosen()
 {
     QFETCH(const std::vector<Theme>, themes);
     QFETCH(const QString, onLight);

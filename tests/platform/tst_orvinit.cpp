@@ -164,10 +164,7 @@ void TestOrvInit::systemsIndexOfTheFallbackThemeDoesNotHideTheBundledIcons()
 {
     QTemporaryDir folder;
     writeFile(folder.filePath(QStringLiteral("hicolor/index.theme")),
-              "[Icon Theme]\nHidden=true\nDirectories=22x22/actions,24x24/actions,scalable/actions,scalable/apps\n\n"
-              "[22x22/actions]\nSize=22\nType=Threshold\n\n[24x24/actions]\nSize=24\nType=Threshold\n\n"
-              "[scalable/actions]\nMinSize=1\nSize=128\nMaxSize=256\nType=Scalable\n\n"
-              "[scalable/apps]\nMinSize=1\nSize=128\nMaxSize=256\nType=Scalable\n");
+              "[Icon Theme]\nHidden=true\nDirectories=48x48/apps\n\n[48x48/apps]\nSize=48\nType=Threshold\n");
     QIcon::setThemeSearchPaths({folder.path(), bundledIcons});
     orvInit("1", "text");
     for (const char *const name : iconNames)
