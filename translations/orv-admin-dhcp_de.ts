@@ -464,7 +464,7 @@
     </message>
     <message>
         <source>Add DHCP dynamic zone update</source>
-        <translation>Dynamische Zonenaktualisierung durch DHCP hinzufügen</translation>
+        <translation>Dynamische DNS-Aktualisierung hinzufügen</translation>
     </message>
     <message>
         <source>Value</source>
@@ -530,8 +530,8 @@ Zur Topologie wechseln?</translation>
         <source>This editing mode for advanced users.
 After applying this changes configuration may be incorrect.
 Do you want to resume?</source>
-        <translation>Dieser Bearbeitungsmodus ist für erfahrene Benutzer gedacht.
-Nach dem Übernehmen der Änderungen kann die Konfiguration fehlerhaft sein.
+        <translation>Dieser Bearbeitungsmodus ist für erfahrene Benutzer.
+Durch die Änderungen kann die Konfiguration fehlerhaft werden.
 Möchten Sie fortfahren?</translation>
     </message>
     <message>
