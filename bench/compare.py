@@ -179,6 +179,8 @@ def start_row(build, rounds):
                                   stderr=subprocess.DEVNULL) as process:
                 processor = process.stdout.readline()
                 wall = (time.perf_counter() - began) * 1e3
+            if process.returncode:
+                raise subprocess.CalledProcessError(process.returncode, program)
             return float(processor), wall
 
         runs = [start("orv_bench_start") + start("orv_bench_start_empty") for _ in range(4 * rounds)]

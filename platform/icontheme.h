@@ -4,7 +4,7 @@
 #include <QStringList>
 
 /// The theme that every other falls back on; the bundled icons are part of it.
-inline constexpr QLatin1String fallbackIconTheme{"hicolor"};
+inline const QLatin1String fallbackIconTheme{"hicolor"};
 
 /// The installed icon theme below `searchPaths` to take: the first that has at least half of the icons `names`, its
 /// parents' included but not the fallback theme's. A dark theme comes first for a dark palette and late for another, a
