@@ -268,8 +268,8 @@ void FMain::addArbitrary(const QString &title, const QString &label,
         return;
     addThroughDialog<StatementInputDialog>(
         title, [&label](StatementInputDialog &dialog) { dialog.setLabelText(label); },
-        [this, add](const StatementInputDialog &dialog, const QModelIndex &parent) {
-            (m_configModel->*add)(dialog.statementWords(), parent);
+        [&model = *m_configModel, add](const StatementInputDialog &dialog, const QModelIndex &parent) {
+            (model.*add)(dialog.statementWords(), parent);
         },
         OpenBranches::All);
 }
@@ -455,8 +455,8 @@ void FMain::addAddressList(const QString &title, const QString &label,
 {
     addThroughDialog<MultipleIpInputDialog>(
         title, [&label](MultipleIpInputDialog &dialog) { dialog.setLabel(label); },
-        [this, add](const MultipleIpInputDialog &dialog, const QModelIndex &parent) {
-            (m_configModel->*add)(dialog.ips(), parent);
+        [&model = *m_configModel, add](const MultipleIpInputDialog &dialog, const QModelIndex &parent) {
+            (model.*add)(dialog.ips(), parent);
         });
 }
 
@@ -519,8 +519,8 @@ void FMain::addLeaseTime(const QString &title, bool (DhcpdConfigModel::*add)(con
 {
     addThroughDialog<TimeInputDialog>(
         title, [](const TimeInputDialog &) {},
-        [this, add](const TimeInputDialog &dialog, const QModelIndex &parent) {
-            (m_configModel->*add)(dialog.seconds(), parent);
+        [&model = *m_configModel, add](const TimeInputDialog &dialog, const QModelIndex &parent) {
+            (model.*add)(dialog.seconds(), parent);
         });
 }
 
