@@ -16,7 +16,7 @@ FakePrograms::FakePrograms()
 
 FakePrograms::~FakePrograms() { qputenv("PATH", m_oldPath); }
 
-void FakePrograms::install(const QString &name, const QByteArray &lines)
+void FakePrograms::install(const QString &name, const QByteArray &lines) const
 {
     writeTestFile(file(name), "#!/bin/sh\n" + lines);
     QVERIFY(QFile::setPermissions(file(name), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));

@@ -21,7 +21,7 @@ public:
     Q_DISABLE_COPY_MOVE(FakePrograms)
 
     /// Makes the lines of a shell script a program, in place of the one of that name.
-    void install(const QString &name, const QByteArray &lines);
+    void install(const QString &name, const QByteArray &lines) const;
     /// The path of a file beside the programs, where they leave what a test looks for ("${0%/*}/name" for them).
     QString file(const QString &name) const;
 
@@ -43,7 +43,6 @@ public:
     /// Makes the main window, shows it and waits until it is active.
     std::unique_ptr<FMain> openWindow() const;
 
-    FakePrograms &programs() { return m_programs; }
     const FakePrograms &programs() const { return m_programs; }
     FakeSystemctl &systemctl() { return m_systemctl; }
 

@@ -150,7 +150,7 @@ void runOutside(const QByteArray &command)
 void changeOutside(const Site &site)
 {
     const int before = site.notices.count();
-    runOutside("echo '# by hand' >>\"$1\"");
+    runOutside(R"(echo '# by hand' >>"$1")");
     QTRY_VERIFY(site.notices.count() > before);
     site.settle();
 }
@@ -308,15 +308,14 @@ void FileCommandsTest::savesInARowRewrite()
 void FileCommandsTest::outsideChangeIsNoticed_data()
 {
     QTest::addColumn<QByteArray>("command");
-    QTest::addRow("written in place") << QByteArray{"echo 'max-lease-time 1;' >\"$1\""};
-    QTest::addRow("appended to") << QByteArray{"echo 'max-lease-time 1;' >>\"$1\""};
-    QTest::addRow("replaced") << QByteArray{"cp \"$1\" \"$1.new\"; mv \"$1.new\" \"$1\""};
-    QTest::addRow("replaced, the old one kept")
-        << QByteArray{"ln \"$1\" \"$1~\"; cp \"$1\" \"$1.new\"; mv \"$1.new\" \"$1\""};
-    QTest::addRow("removed") << QByteArray{"rm \"$1\""};
-    QTest::addRow("removed and back at once") << QByteArray{"cp \"$1\" \"$1.old\"; rm \"$1\"; mv \"$1.old\" \"$1\""};
-    QTest::addRow("removed and back later") << QByteArray{"mv \"$1\" \"$1.old\"; sleep 0.5; mv \"$1.old\" \"$1\""};
-    QTest::addRow("another file made") << QByteArray{"echo >\"$1.other\""};
+    QTest::addRow("written in place") << QByteArray{R"(echo 'max-lease-time 1;' >"$1")"};
+    QTest::addRow("appended to") << QByteArray{R"(echo 'max-lease-time 1;' >>"$1")"};
+    QTest::addRow("replaced") << QByteArray{R"(cp "$1" "$1.new"; mv "$1.new" "$1")"};
+    QTest::addRow("replaced, the old one kept") << QByteArray{R"(ln "$1" "$1~"; cp "$1" "$1.new"; mv "$1.new" "$1")"};
+    QTest::addRow("removed") << QByteArray{R"(rm "$1")"};
+    QTest::addRow("removed and back at once") << QByteArray{R"(cp "$1" "$1.old"; rm "$1"; mv "$1.old" "$1")"};
+    QTest::addRow("removed and back later") << QByteArray{R"(mv "$1" "$1.old"; sleep 0.5; mv "$1.old" "$1")"};
+    QTest::addRow("another file made") << QByteArray{R"(echo >"$1.other")"};
 }
 
 void FileCommandsTest::outsideChangeIsNoticed()
@@ -339,7 +338,7 @@ void FileCommandsTest::burstOfWritesIsFewNotices()
     Site site{*m_machine, *m_boxes};
     QElapsedTimer timer;
     timer.start();
-    runOutside("i=0; while [ $i -lt 1000 ]; do echo '# again' >>\"$1\"; i=$((i + 1)); done");
+    runOutside(R"(i=0; while [ $i -lt 1000 ]; do echo '# again' >>"$1"; i=$((i + 1)); done)");
     site.settle();
     QVERIFY(site.notices.count() > 0);
     // Each notice ends a tenth of a second, however long the writes took.
@@ -394,7 +393,7 @@ void FileCommandsTest::failedSaveChangesNothing()
 void FileCommandsTest::failedSaveKeepsChangedOutside()
 {
     const Site site{*m_machine, *m_boxes};
-    runOutside("rm \"$1\"; mkdir \"$1\"");
+    runOutside(R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
     ModalBoxes &boxes = *m_boxes;
@@ -404,7 +403,7 @@ void FileCommandsTest::failedSaveKeepsChangedOutside()
     boxes.verify();
     QVERIFY(site.isModified());
     QVERIFY(QFileInfo{paths::configuration()}.isDir());
-    runOutside("rmdir \"$1\"");
+    runOutside(R"(rmdir "$1")");
     site.settle();
     site.save(overwriteText);
     QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
@@ -593,7 +592,7 @@ void FileCommandsTest::closingQuestionHasNoDefault()
 void FileCommandsTest::unwrittenConfigurationIsKept()
 {
     const Site site{*m_machine, *m_boxes};
-    runOutside("rm \"$1\"; mkdir \"$1\"");
+    runOutside(R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
     const QByteArray unsaved = site.model->fileContent();

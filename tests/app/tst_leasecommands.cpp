@@ -509,7 +509,7 @@ void LeaseCommandsTest::reservationOutlivesAReload()
     const Site site{*m_machine};
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>([&site](HostInputDialog *dialog) {
-        runOutside(QStringLiteral("cat >\"$1\""), lease("10.9.9.9", "other"));
+        runOutside(QStringLiteral(R"(cat >"$1")"), lease("10.9.9.9", "other"));
         QTRY_COMPARE(site.table->model()->rowCount(), 1);
         QCOMPARE(dialog->ip(), QStringLiteral("10.0.0.10"));
         save(dialog);
@@ -548,11 +548,11 @@ void LeaseCommandsTest::reservationNeedsALease()
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data()
 {
     QTest::addColumn<QString>("command");
-    QTest::addRow("appended to") << QStringLiteral("cat >>\"$1\"");
-    QTest::addRow("replaced") << QStringLiteral("cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"");
+    QTest::addRow("appended to") << QStringLiteral(R"(cat >>"$1")");
+    QTest::addRow("replaced") << QStringLiteral(R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")");
     QTest::addRow("replaced, the old one kept")
-        << QStringLiteral("ln -f \"$1\" \"$1~\"; cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"");
-    QTest::addRow("written anew") << QStringLiteral("{ cat \"$1\"; cat; } >\"$1.all\"; cat \"$1.all\" >\"$1\"");
+        << QStringLiteral(R"(ln -f "$1" "$1~"; cat "$1" - >"$1.new"; mv "$1.new" "$1")");
+    QTest::addRow("written anew") << QStringLiteral(R"({ cat "$1"; cat; } >"$1.all"; cat "$1.all" >"$1")");
 }
 
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
@@ -591,7 +591,7 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.10"));
 
     for (const QString &command :
-         {QStringLiteral("cat >>\"$1\""), QStringLiteral("cat \"$1\" - >\"$1.new\"; mv \"$1.new\" \"$1\"")}) {
+         {QStringLiteral(R"(cat >>"$1")"), QStringLiteral(R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")")}) {
         const int before = site.table->model()->rowCount();
         const QByteArray address = "9.0.0." + QByteArray::number(before);
         runOutside(command, lease(address, "alphabet") + lease("8.0.0.1", "other"));
@@ -607,7 +607,7 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
     QTest::keyClick(site.field, Qt::Key_A, Qt::ControlModifier);
     site.type(QStringLiteral("zeta"));
     QCOMPARE(site.field->styleSheet(), notFoundStyle);
-    runOutside(QStringLiteral("cat >>\"$1\""), lease("9.0.0.99", "zeta"));
+    runOutside(QStringLiteral(R"(cat >>"$1")"), lease("9.0.0.99", "zeta"));
     QTRY_COMPARE(site.addresses(), QStringList{QStringLiteral("9.0.0.99")});
     QCOMPARE(site.field->styleSheet(), notFoundStyle);
     QVERIFY(site.stepsAreDisabled());

@@ -15,19 +15,19 @@ constexpr int patience = 60'000; // milliseconds until what never comes fails th
 constexpr uint nobody = 65534;
 
 const QString program = QStringLiteral(ORV_PROGRAM);
-const QString demoNamespace = QStringLiteral(ORV_DEMO_NAMESPACE);
+const QString privateNetwork = QStringLiteral(ORV_PRIVATE_NETWORK);
 
 bool isInstalled(const char *name) { return !QStandardPaths::findExecutable(QString::fromLatin1(name)).isEmpty(); }
 
-/// Why no private site can be made here; empty when it can.
-QByteArray refusalOfNamespace()
+/// Why no private network can be made here; empty when it can.
+QByteArray refusalOfNetwork()
 {
     QProcess process;
-    process.start(demoNamespace, {QStringLiteral("true")});
+    process.start(privateNetwork, {QStringLiteral("true")});
     process.waitForFinished(patience);
     return process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0
                ? QByteArray{}
-               : "no private namespace: " + process.readAllStandardError();
+               : "no private network: " + process.readAllStandardError();
 }
 
 /// A virtual display, and what a person does there.
@@ -136,13 +136,13 @@ void MainTest::superuserGetsTheWindow()
 {
     if (!isInstalled("Xvfb") || !isInstalled("xdotool"))
         QSKIP("Xvfb and xdotool are needed to close the window");
-    if (const QByteArray refusal = refusalOfNamespace(); !refusal.isEmpty())
+    if (const QByteArray refusal = refusalOfNetwork(); !refusal.isEmpty())
         QSKIP(refusal.constData());
 
     const Display display;
     QProcess process;
     process.setProcessEnvironment(display.environment());
-    process.start(demoNamespace,
+    process.start(privateNetwork,
                   {QStringLiteral("sh"), QStringLiteral("-c"),
                    QStringLiteral("\"$0\"; status=$?; cd \"$XDG_CONFIG_HOME\"; cat */*; exit $status"), program});
     const QString title = QStringLiteral("Configure DHCP server");
@@ -156,15 +156,17 @@ void MainTest::superuserGetsTheWindow()
 
 void MainTest::secondStartEnds()
 {
-    if (const QByteArray refusal = refusalOfNamespace(); !refusal.isEmpty())
+    if (const QByteArray refusal = refusalOfNetwork(); !refusal.isEmpty())
         QSKIP(refusal.constData());
+    // The first instance has asked for the server's state, which the network's service manager notes down, when
+    // it has long been the first.
     QProcess process;
-    process.start(demoNamespace, {QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral(R"("$0" & first=$!
-                   until [ -e "$ORV_DEMO_STATE" ]; do sleep 0.1; done
+    process.start(privateNetwork, {QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral(R"("$0" & first=$!
+                   until [ -e /run/private-network/service ]; do sleep 0.1; done
                    "$0"; echo "second: $?"
                    kill -0 $first && echo "first runs"
                    kill $first)"),
-                                  program});
+                                   program});
     QVERIFY(process.waitForFinished(patience));
     QCOMPARE(process.readAllStandardOutput(), QByteArray{"second: 1\nfirst runs\n"});
 }
