@@ -8,6 +8,7 @@
 #include "config/dhcpdconfigdeclaration.h"
 #include "config/dhcpdconfigmodel.h"
 #include "leases/dhcpdleasesmodel.h"
+#include "leases/leaseproxymodel.h"
 #include "platform/orvhelpmenu.h"
 #include "platform/packagemanager.h"
 #include "ui_fmain.h"
@@ -18,7 +19,6 @@
 #include <QMenu>
 #include <QMessageBox>
 #include <QSettings>
-#include <QSortFilterProxyModel>
 
 namespace {
 
@@ -158,7 +158,7 @@ void FMain::setUpLeases()
     m_leaseMenu = new QMenu{tr("Actions"), this};
     m_leaseMenu->addAction(m_ui->aAddReserveIP);
 
-    m_leaseProxy = std::make_unique<QSortFilterProxyModel>(nullptr);
+    m_leaseProxy = std::make_unique<LeaseProxyModel>(nullptr);
     m_leaseProxy->setSourceModel(m_leasesModel.get());
     m_leaseProxy->setFilterKeyColumn(-1);
     table->setModel(m_leaseProxy.get());

@@ -11,10 +11,10 @@
 class DhcpdConfigModel;
 class DhcpdConfigStatement;
 class DhcpdLeasesModel;
+class LeaseProxyModel;
 class PathWatch;
 class QLabel;
 class QMenu;
-class QSortFilterProxyModel;
 class QString;
 class TopologyMenus;
 class TreeExpansion;
@@ -185,7 +185,7 @@ private:
     TreeExpansion *m_treeExpansion{};
     PathWatch *m_configWatch{};
     PathWatch *m_leaseWatch{};
-    std::unique_ptr<QSortFilterProxyModel> m_leaseProxy;
+    std::unique_ptr<LeaseProxyModel> m_leaseProxy;
     QMenu *m_leaseMenu{};
     int m_matchPosition{};
     QStringList m_bind9Versions;

@@ -6,11 +6,11 @@
 #include "config/dhcpdconfigmodel.h"
 #include "dialogs/hostinputdialog.h"
 #include "leases/dhcpdleasesmodel.h"
+#include "leases/leaseproxymodel.h"
 #include "ui_fmain.h"
 
 #include <QMenu>
 #include <QMessageBox>
-#include <QSortFilterProxyModel>
 
 namespace {
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/dhcpdleasesmodel.h"
 
+#include "leases/leasesearch.h"
+
 #include <array>
 
 namespace {
@@ -60,6 +62,11 @@ QVariant DhcpdLeasesModel::headerData(int section, Qt::Orientation orientation, 
         return section; // deliberately from 0 on
     }
     return section >= 0 && section < columns ? tr(headers[static_cast<std::size_t>(section)]) : QVariant{};
+}
+
+std::unique_ptr<LeaseSearch> DhcpdLeasesModel::search(const LeaseNeedle &needle) const
+{
+    return std::make_unique<LeaseSearch>(m_table, m_timeTexts, needle);
 }
 
 void DhcpdLeasesModel::reload(const QString &path)

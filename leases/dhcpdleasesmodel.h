@@ -8,6 +8,11 @@
 #include <QAbstractListModel>
 #include <QString>
 
+#include <memory>
+
+class LeaseSearch;
+struct LeaseNeedle;
+
 /// The leases of the DHCP server's lease file, a row for each address in the order of the addresses. It has six columns
 /// although it is a list: address, MAC address, host name, binding state, start and end.
 class DhcpdLeasesModel final : public QAbstractListModel
@@ -31,6 +36,9 @@ public:
     int columnCount(const QModelIndex &parent = {}) const override;
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
     QVariant headerData(int section, Qt::Orientation orientation, int role = Qt::DisplayRole) const override;
+
+    /// A search in the texts that the model shows; not to be used after the model is gone.
+    std::unique_ptr<LeaseSearch> search(const LeaseNeedle &needle) const;
 
 signals:
     /// The file could not be read, and the model is empty; `message` is for the user.

@@ -11,9 +11,6 @@
 
 namespace {
 
-// A text's bytes follow their number, which takes one byte, or this one and eight more.
-constexpr char longText{'\xFF'};
-
 // The room that is made ahead, from the bytes of a usual block and of the texts in it; memory that is not needed is
 // never touched.
 constexpr qint64 bytesPerLease{256};
@@ -65,15 +62,12 @@ LeaseTexts::Id LeaseTexts::add(std::string_view text)
     return static_cast<Id>(id);
 }
 
-std::string_view LeaseTexts::at(Id id) const
+std::string_view LeaseTexts::longTextAt(Id id) const
 {
-    const char *const text{m_bytes.data() + id};
-    if (*text != longText) {
-        return {text + 1, static_cast<unsigned char>(*text)};
-    }
+    const char *const text{m_bytes.data() + id + 1};
     quint64 size{};
-    std::memcpy(&size, text + 1, sizeof size);
-    return {text + 1 + sizeof size, size};
+    std::memcpy(&size, text, sizeof size);
+    return {text + sizeof size, size};
 }
 
 void LeaseTable::clear() { *this = LeaseTable{}; }
@@ -168,6 +162,12 @@ void LeaseTable::settleNext()
 
 QString LeaseTable::addressText(quint32 address) const
 {
+    const QString *const text{oddAddressText(address)};
+    return text ? *text : QHostAddress{address}.toString();
+}
+
+const QString *LeaseTable::oddAddressText(quint32 address) const
+{
     const auto text{m_addressTexts.constFind(address)};
-    return text != m_addressTexts.cend() ? *text : QHostAddress{address}.toString();
+    return text != m_addressTexts.cend() ? &*text : nullptr;
 }

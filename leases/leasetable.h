@@ -30,9 +30,20 @@ public:
     void reserve(std::size_t bytes) { m_bytes.reserve(bytes); }
     Id add(std::string_view text);
     /// The text of a number that add() returned; valid until the next add().
-    std::string_view at(Id id) const;
+    std::string_view at(Id id) const
+    {
+        const char *const text{m_bytes.data() + id};
+        return *text == longText ? longTextAt(id) : std::string_view{text + 1, static_cast<unsigned char>(*text)};
+    }
+    /// The memory in which the texts lie in the order in which they were added, with other bytes between.
+    std::string_view memory() const { return m_bytes; }
 
 private:
+    // A text's bytes follow their number, which takes one byte, or this one and eight more.
+    static constexpr char longText{'\xFF'};
+
+    std::string_view longTextAt(Id id) const;
+
     std::string m_bytes;
 };
 
@@ -81,6 +92,14 @@ public:
     int size() const { return static_cast<int>(m_rows.size()); }
     const Lease &at(int row) const { return m_leases[m_rows[static_cast<std::size_t>(row)]]; }
     QString addressText(quint32 address) const;
+    /// The text of an address that is not shown as its number would be; null for any other.
+    const QString *oddAddressText(quint32 address) const;
+    bool hasOddAddresses() const { return !m_addressTexts.isEmpty(); }
+
+    /// The same leases in the order of the file. They and their texts lie in memory like this, so that reading all is
+    /// several times as fast as by row.
+    const Lease &inFileOrder(int place) const { return m_leases[static_cast<std::size_t>(place)]; }
+    int placeInFile(int row) const { return static_cast<int>(m_rows[static_cast<std::size_t>(row)]); }
 
 private:
     LeaseTexts m_texts;

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasetime.h"
 
-#include <array>
+#include <algorithm>
 #include <cstring>
+#include <iterator>
 
 namespace {
 
@@ -46,16 +47,6 @@ unsigned number(const char *digits, int count)
         value = value * 10 + static_cast<unsigned>(digits[i] - '0');
     }
     return value;
-}
-
-template<typename Format>
-QString remembered(QHash<quint32, QString> &texts, quint32 key, const Format &format)
-{
-    auto found{texts.find(key)};
-    if (found == texts.end()) {
-        found = texts.insert(key, format());
-    }
-    return *found;
 }
 
 } // namespace
@@ -106,20 +97,88 @@ QTime LeaseTime::time() const
     return {static_cast<int>(m_time >> 16U), static_cast<int>(m_time >> 8U & 0xFFU), static_cast<int>(m_time & 0xFFU)};
 }
 
+TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
+{
+    // Two numbers without a digit in common.
+    constexpr int number{11};
+    constexpr int otherNumber{22};
+    const auto text{[&locale](int hour, int minute, int second) {
+        return locale.toString(QTime{hour, minute, second}, QLocale::LongFormat);
+    }};
+    for (std::size_t i{0}; i < m_hours.size(); ++i) {
+        const int hour{static_cast<int>(i)};
+        const QString example{text(hour, number, number)};
+        m_hours[i] = {example, difference(example, text(hour, otherNumber, number)),
+                      difference(example, text(hour, number, otherNumber))};
+    }
+    const Hour &first{m_hours.front()};
+    const auto numberIn{[&first](const QString &whole, Field field) {
+        return whole.mid(field.position, field.length + whole.size() - first.text.size());
+    }};
+    for (std::size_t i{0}; i < m_minutes.size(); ++i) {
+        m_minutes[i] = numberIn(text(0, static_cast<int>(i), number), first.minute);
+        m_seconds[i] = numberIn(text(0, number, static_cast<int>(i)), first.second);
+    }
+}
+
+/// The part of `left` that is another in `right`, which is as long.
+TimeOfDayTexts::Field TimeOfDayTexts::difference(const QString &left, const QString &right)
+{
+    const auto begin{std::mismatch(left.cbegin(), left.cend(), right.cbegin(), right.cend()).first};
+    const auto end{std::mismatch(left.crbegin(), std::make_reverse_iterator(begin), right.crbegin()).first.base()};
+    return {static_cast<int>(begin - left.cbegin()), static_cast<int>(end - begin)};
+}
+
+QString TimeOfDayTexts::text(QTime time) const
+{
+    const Hour &hour{m_hours[static_cast<std::size_t>(time.hour())]};
+    const QString &minute{m_minutes[static_cast<std::size_t>(time.minute())]};
+    const QString &second{m_seconds[static_cast<std::size_t>(time.second())]};
+    QString text{hour.text};
+    const auto put{[&text](Field field, const QString &number) { text.replace(field.position, field.length, number); }};
+    // The latter first, so that the former stays where it is.
+    if (hour.minute.position < hour.second.position) {
+        put(hour.second, second);
+        put(hour.minute, minute);
+    } else {
+        put(hour.minute, minute);
+        put(hour.second, second);
+    }
+    return text;
+}
+
 QString LeaseTimeTexts::text(LeaseTime time)
 {
-    if (!time.isValid()) {
-        return {};
+    return time.isValid() ? timeOfDayText(time) + separator + dateText(time) : QString{};
+}
+
+QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
+{
+    heedLocale();
+    if (!m_timesOfDay) {
+        m_timesOfDay.emplace(m_locale);
     }
-    if (const QLocale locale; locale != m_locale) {
-        m_locale = locale;
-        m_dates.clear();
-        m_times.clear();
-    }
+    return m_timesOfDay->text(time.time());
+}
+
+QString LeaseTimeTexts::dateText(LeaseTime time)
+{
+    heedLocale();
     if (m_dates.size() >= rememberedDates) {
         m_dates.clear();
     }
-    return remembered(m_times, time.timeKey(), [&] { return m_locale.toString(time.time(), QLocale::LongFormat); }) +
-           QLatin1Char{' '} +
-           remembered(m_dates, time.dateKey(), [&] { return m_locale.toString(time.date(), QLocale::NarrowFormat); });
+    auto text{m_dates.find(time.dateKey())};
+    if (text == m_dates.end()) {
+        text = m_dates.insert(time.dateKey(), m_locale.toString(time.date(), QLocale::NarrowFormat));
+    }
+    return *text;
+}
+
+void LeaseTimeTexts::heedLocale()
+{
+    if (const QLocale locale; locale != m_locale) {
+        m_locale = locale;
+        m_dates.clear();
+        m_timesOfDay.reset();
+    }
 }

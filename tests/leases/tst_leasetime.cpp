@@ -49,6 +49,7 @@ private slots:
     void isShownInTheDefaultLocale();
     void hasNoTextIfInvalid();
     void remembersNoWrongTexts();
+    void knowsAllTimesOfDayInAllLocales();
 };
 
 void TestLeaseTime::cleanup() { QLocale::setDefault(QLocale::c()); }
@@ -178,6 +179,21 @@ void TestLeaseTime::remembersNoWrongTexts()
         QVERIFY(texts.text(parsed(date, "13:04:05")).endsWith(QLocale{}.toString(day, QLocale::NarrowFormat)));
     }
     QCOMPARE(texts.text(time), german);
+}
+
+void TestLeaseTime::knowsAllTimesOfDayInAllLocales()
+{
+    QRandomGenerator random{5};
+    const QList<QLocale> locales{
+        QLocale::matchingLocales(QLocale::AnyLanguage, QLocale::AnyScript, QLocale::AnyCountry)};
+    QVERIFY(locales.size() > 100);
+    for (const QLocale &locale : locales) {
+        const TimeOfDayTexts texts{locale};
+        for (int second{0}; second < 24 * 60 * 60; second += random.bounded(1, 1000)) {
+            const QTime time{QTime::fromMSecsSinceStartOfDay(second * 1000)};
+            QCOMPARE(texts.text(time), locale.toString(time, QLocale::LongFormat));
+        }
+    }
 }
 
 QTEST_GUILESS_MAIN(TestLeaseTime)

@@ -1,0 +1,116 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/leaseproxymodel.h"
+
+#include "leases/dhcpdleasesmodel.h"
+
+#include <QSignalBlocker>
+
+void LeaseProxyModel::setSourceModel(QAbstractItemModel *model)
+{
+    for (const QMetaObject::Connection &connection : m_connections) {
+        disconnect(connection);
+    }
+    // Before the base connects itself, so that what is known of the old leases is forgotten when it asks about the new.
+    if (model) {
+        m_connections = {
+            connect(model, &QAbstractItemModel::modelReset, this, &LeaseProxyModel::searchAgain),
+            connect(model, &QAbstractItemModel::rowsAboutToBeInserted, this, &LeaseProxyModel::forgetFound),
+            connect(model, &QAbstractItemModel::dataChanged, this, &LeaseProxyModel::forgetFound),
+        };
+    }
+    search(model);
+    QSortFilterProxyModel::setSourceModel(model);
+}
+
+void LeaseProxyModel::setFilterFixedString(const QString &text)
+{
+    if (!leases()) {
+        QSortFilterProxyModel::setFilterFixedString(text);
+        return;
+    }
+    if (text == m_text) {
+        return;
+    }
+    beginResetModel();
+    m_text = text;
+    searchAgain();
+    {
+        // The base's own notices would move rows one by one, or twice.
+        const QSignalBlocker blocker{this};
+        invalidate();
+    }
+    endResetModel();
+}
+
+QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const QVariant &value, int hits,
+                                       Qt::MatchFlags flags) const
+{
+    const DhcpdLeasesModel *const model{leases()};
+    if (!model || !isSearchable(start, role, hits, flags)) {
+        return QSortFilterProxyModel::match(start, role, value, hits, flags);
+    }
+    const QModelIndex first{mapToSource(start)};
+    const LeaseNeedle needle{value.toString(),
+                             flags.testFlag(Qt::MatchCaseSensitive) ? Qt::CaseSensitive : Qt::CaseInsensitive};
+    if (!m_lastMatch || !(m_lastMatch->needle() == needle)) {
+        m_lastMatch = model->search(needle);
+    }
+    const LeaseHits found{m_lastMatch->find(first.column(), m_found ? &*m_found : nullptr)};
+    QModelIndexList matches;
+    if (found.isEmpty()) {
+        return matches;
+    }
+    const auto collect{[&](int from, int to) {
+        for (int row{from}; row < to && matches.size() != hits; ++row) {
+            if (!found.contains(row)) {
+                continue;
+            }
+            if (const QModelIndex match{mapFromSource(model->index(row, first.column()))}; match.isValid()) {
+                matches.append(match);
+            }
+        }
+    }};
+    collect(first.row(), model->rowCount());
+    if (flags.testFlag(Qt::MatchWrap)) {
+        collect(0, first.row());
+    }
+    return matches;
+}
+
+bool LeaseProxyModel::filterAcceptsRow(int row, const QModelIndex &parent) const
+{
+    const bool isFound{!m_search || (m_found ? m_found->contains(row) : m_search->contains(row))};
+    return isFound && QSortFilterProxyModel::filterAcceptsRow(row, parent);
+}
+
+const DhcpdLeasesModel *LeaseProxyModel::leases() const
+{
+    return qobject_cast<const DhcpdLeasesModel *>(sourceModel());
+}
+
+bool LeaseProxyModel::isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const
+{
+    // There are no levels to recurse into.
+    constexpr Qt::MatchFlags heeded{Qt::MatchCaseSensitive | Qt::MatchWrap | Qt::MatchRecursive};
+    return (flags & ~heeded) == Qt::MatchContains && role == Qt::DisplayRole && (hits > 0 || hits == -1) &&
+           start.model() == this && hasIndex(start.row(), start.column()) && sortColumn() < 0;
+}
+
+void LeaseProxyModel::search(const QAbstractItemModel *model)
+{
+    forgetFound();
+    m_search.reset();
+    const auto *const searched{qobject_cast<const DhcpdLeasesModel *>(model)};
+    if (searched && !m_text.isEmpty()) {
+        m_search = searched->search({m_text, Qt::CaseSensitive});
+        m_found.emplace(m_search->find());
+    }
+}
+
+void LeaseProxyModel::searchAgain() { search(sourceModel()); }
+
+void LeaseProxyModel::forgetFound()
+{
+    m_found.reset();
+    m_lastMatch.reset();
+}

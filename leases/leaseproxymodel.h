@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "leases/leasesearch.h"
+
+#include <QSortFilterProxyModel>
+
+#include <array>
+#include <memory>
+#include <optional>
+
+class DhcpdLeasesModel;
+
+/// A filter and search for a DhcpdLeasesModel that keep up with typing over a million leases.
+///
+/// All of QSortFilterProxyModel works as ever, through a pointer to it also. Its own filter, set by this class's
+/// setFilterFixedString(), stands beside the base's: a row is shown if both accept it.
+class LeaseProxyModel final : public QSortFilterProxyModel
+{
+    Q_OBJECT
+
+public:
+    using QSortFilterProxyModel::QSortFilterProxyModel;
+
+    void setSourceModel(QAbstractItemModel *model) override;
+
+    /// Shows only the leases that have `text`, in the same letter case, in any column; all if it is empty. The views
+    /// see one reset.
+    void setFilterFixedString(const QString &text);
+
+    /// As the base's, and fast for Qt::MatchContains.
+    QModelIndexList match(const QModelIndex &start, int role, const QVariant &value, int hits = 1,
+                          Qt::MatchFlags flags = {Qt::MatchStartsWith | Qt::MatchWrap}) const override;
+
+protected:
+    bool filterAcceptsRow(int row, const QModelIndex &parent) const override;
+
+private:
+    const DhcpdLeasesModel *leases() const;
+    /// Whether match() can do such a search without the base.
+    bool isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const;
+    void search(const QAbstractItemModel *model);
+    void searchAgain();
+    void forgetFound();
+
+    QString m_text;
+    std::unique_ptr<LeaseSearch> m_search; // null when no text is set
+    // Until the leases change: what m_search found, and the search of the last match().
+    std::optional<LeaseHits> m_found;
+    mutable std::unique_ptr<LeaseSearch> m_lastMatch;
+    std::array<QMetaObject::Connection, 3> m_connections;
+};
