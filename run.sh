@@ -14,7 +14,8 @@ Usage: ./run.sh [OPTION]
 
 Builds the program and starts it. What the build lacks is installed first, on Debian and Ubuntu.
 
-  (no option)         on a demonstration site of its own, as any user; nothing of this machine is touched
+  (no option)         on a demonstration site with a DHCP server and clients of its own, as any user; nothing of this
+                      machine is touched
   --system            as the superuser, on the DHCP server of this machine
   --screenshot FILE   on the demonstration site without a display; saves a PNG picture of the window and ends
   -h, --help          this text
@@ -56,7 +57,9 @@ if [ "$mode" = screenshot ]; then
 else
     require_packages build run
 fi
+[ "$mode" = system ] || scripts/fetch-tools isc-dhcp-server isc-dhcp-client
 scripts/build release
+site=(scripts/private-network demo/open-site "$program")
 
 # The display, its key and the language, which sudo and pkexec drop.
 session_variables() {
@@ -69,10 +72,10 @@ session_variables() {
 
 case $mode in
 demo)
-    exec scripts/demo-namespace "$program"
+    exec "${site[@]}"
     ;;
 screenshot)
-    scripts/screenshot "$picture" "$title" scripts/demo-namespace "$program"
+    scripts/screenshot "$picture" "$title" "${site[@]}"
     ;;
 system)
     mapfile -t session < <(session_variables)

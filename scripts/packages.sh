@@ -5,9 +5,10 @@
 
 declare -A packages=(
     [build]="cmake g++ ninja-build qtbase5-dev qttools5-dev qttools5-dev-tools"
-    [run]="breeze-icon-theme fonts-dejavu-core libqt5svg5 mount qttranslations5-l10n util-linux"
+    [run]="breeze-icon-theme dbus-daemon fonts-dejavu-core iproute2 libqt5svg5 mount procps qttranslations5-l10n socat \
+util-linux xauth"
     [screenshot]="maim xauth xdotool xvfb"
-    [test]="dpkg iproute2 procps"
+    [test]="dpkg"
     [bench]="libbenchmark-dev python3"
     [fuzz]="clang libclang-rt-dev"
     [lint]="clang-format clang-tidy clazy git shellcheck"
