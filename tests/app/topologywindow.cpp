@@ -216,7 +216,7 @@ void TopologyWindow::choose(ModalBoxes &boxes, const QString &statement, const Q
 {
     const auto clickEntries = [entries](QMenu *menu) {
         for (const QString &entry : entries) {
-            QAction *action = entryOf(*menu, entry);
+            QAction *action = menu ? entryOf(*menu, entry) : nullptr;
             QVERIFY2(action, qPrintable(entry));
             QMenu *submenu = action->menu();
             QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(action).center());

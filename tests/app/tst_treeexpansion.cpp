@@ -69,7 +69,8 @@ public:
 private:
     const Node &nodeOf(const QModelIndex &index) const
     {
-        return index.isValid() ? *static_cast<const Node *>(index.internalPointer()) : m_top;
+        const auto *node = static_cast<const Node *>(index.internalPointer());
+        return node ? *node : m_top;
     }
 
     mutable Node m_top{text("top")};
