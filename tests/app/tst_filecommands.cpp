@@ -204,6 +204,7 @@ private slots:
     void outsideChangeIsNoticed_data();
     void outsideChangeIsNoticed();
     void burstOfWritesIsFewNotices();
+    void steadyWritingIsNoticedMeanwhile();
     void changeDuringTheQuestionIsIgnored();
     void failedSaveChangesNothing();
     void failedSaveKeepsChangedOutside();
@@ -325,11 +326,10 @@ void FileCommandsTest::outsideChangeIsNoticed()
     runOutside(command);
     QTRY_VERIFY(site.notices.count() > 0);
     site.settle();
+    changeOutside(site); // the file that is there now is watched
     site.save(overwriteText);
     QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
-
-    // The file that is there now is watched again.
-    changeOutside(site);
+    changeOutside(site); // and the one that was saved
     site.save(overwriteText);
 }
 
@@ -346,6 +346,13 @@ void FileCommandsTest::burstOfWritesIsFewNotices()
     site.notices.clear();
     changeOutside(site);
     QCOMPARE(site.notices.count(), 1);
+}
+
+void FileCommandsTest::steadyWritingIsNoticedMeanwhile()
+{
+    const Site site{*m_machine, *m_boxes};
+    runOutside(R"(i=0; while [ $i -lt 100 ]; do echo '# again' >>"$1"; sleep 0.02; i=$((i + 1)); done)");
+    QVERIFY(site.notices.count() > 1);
 }
 
 void FileCommandsTest::changeDuringTheQuestionIsIgnored()
