@@ -85,7 +85,8 @@ public:
         , m_name{name}
         , m_prefix{name + mark}
     {
-        for (const QByteArray &entry : posix::entries(folder)) {
+        const auto entries = posix::entries(folder);
+        for (const QByteArray &entry : entries) {
             if (entry.size() == m_prefix.size() + stampLength && entry.startsWith(m_prefix))
                 m_versions.append(entry);
         }

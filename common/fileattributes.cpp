@@ -42,7 +42,8 @@ std::error_code readAttributes(int descriptor, Attributes &attributes)
         return {};
     if (error)
         return error;
-    for (const QByteArray &name : names.split('\0')) {
+    const QList<QByteArray> present{names.split('\0')};
+    for (const QByteArray &name : present) {
         if (name.isEmpty() || isContentSignature(name))
             continue;
         const auto get = [&](char *data, size_t size) { return fgetxattr(descriptor, name.constData(), data, size); };

@@ -92,7 +92,8 @@ std::error_code TemporaryFile::renameTo(const QByteArray &name)
 void TemporaryFile::removeLeftOvers(int directory, const QByteArray &name, uid_t owner)
 {
     const QByteArray prefix{prefixFor(name)};
-    for (const QByteArray &entry : posix::entries(directory)) {
+    const auto entries = posix::entries(directory);
+    for (const QByteArray &entry : entries) {
         if (entry.size() != prefix.size() + suffixLength || !entry.startsWith(prefix))
             continue;
         // The lock is held until the name is gone, so that its writer cannot be one that just begins.

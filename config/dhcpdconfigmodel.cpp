@@ -143,8 +143,8 @@ void DhcpdConfigModel::setModified()
 
 QIcon DhcpdConfigModel::themeIcon(const QString &name) const
 {
-    auto icon = m_icons.constFind(name);
-    if (icon == m_icons.constEnd())
-        icon = m_icons.insert(name, QIcon::fromTheme(name));
-    return *icon;
+    QIcon &icon{m_icons[name]};
+    if (icon.isNull())
+        icon = QIcon::fromTheme(name);
+    return icon;
 }

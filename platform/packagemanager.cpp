@@ -36,8 +36,9 @@ QStringList PackageManager::getInstalledPackagesVersions(const QString &package)
         return {};
     // A removed package whose configuration files were left is still in the database.
     const QString installed{QStringLiteral("installed ")};
+    const QStringList packages{QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char('\n'))};
     QStringList versions;
-    for (const QString &line : QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char('\n'))) {
+    for (const QString &line : packages) {
         if (line.startsWith(installed))
             versions.append(line.mid(installed.size()));
     }

@@ -91,7 +91,8 @@ void DhcpServerManager::readInterfacesFile(const QString &path)
     // Deliberately one list for all lines: the last line with the key decides, even one that cannot be taken apart.
     // Such a line is dropped, so that the next write leaves it out, but its pieces count as names.
     QStringList served;
-    for (const QString &line : linesOf(m_fileEncoding.decode(*content))) {
+    const QStringList lines = linesOf(m_fileEncoding.decode(*content));
+    for (const QString &line : lines) {
         if (!line.contains(interfacesKey) || splitInterfacesLine(line, served))
             m_fileLines.append(line);
     }
