@@ -217,7 +217,8 @@ void TopologyWindow::choose(ModalBoxes &boxes, const QString &statement, const Q
     const auto clickEntries = [entries](QMenu *menu) {
         for (const QString &entry : entries) {
             QAction *action = menu ? entryOf(*menu, entry) : nullptr;
-            QVERIFY2(action, qPrintable(entry));
+            if (!action)
+                qFatal("no entry \"%s\"", qPrintable(entry));
             QMenu *submenu = action->menu();
             QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(action).center());
             if (submenu)
