@@ -60,19 +60,16 @@ QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const
     if (found.isEmpty()) {
         return matches;
     }
-    const auto collect{[&](int from, int to) {
-        for (int row{from}; row < to && matches.size() != hits; ++row) {
-            if (!found.contains(row)) {
-                continue;
-            }
-            if (const QModelIndex match{mapFromSource(model->index(row, first.column()))}; match.isValid()) {
-                matches.append(match);
-            }
+    const int rows{model->rowCount()};
+    const int end{rows + (flags.testFlag(Qt::MatchWrap) ? first.row() : 0)};
+    for (int i{first.row()}; i < end && matches.size() != hits; ++i) {
+        const int row{i < rows ? i : i - rows};
+        if (!found.contains(row)) {
+            continue;
         }
-    }};
-    collect(first.row(), model->rowCount());
-    if (flags.testFlag(Qt::MatchWrap)) {
-        collect(0, first.row());
+        if (const QModelIndex match{mapFromSource(model->index(row, first.column()))}; match.isValid()) {
+            matches.append(match);
+        }
     }
     return matches;
 }

@@ -58,6 +58,7 @@ private slots:
     void matchesOtherwiseAsQtDoes();
     void followsUpdates_data();
     void followsUpdates();
+    void findsTextsThatAreNew();
     void followsReloads();
     void followsAnotherModel();
     void outlivesItsModel();
@@ -272,17 +273,40 @@ void TestLeaseProxyModel::followsUpdates()
     const QAbstractItemModelTester tester{m_proxy.get()};
     stock.setFilterFixedString(wanted);
     m_proxy->setFilterFixedString(wanted);
-    const QSignalSpy reset{m_proxy.get(), &QAbstractItemModel::modelReset};
     for (int i{0}; i < 150; ++i) {
-        // Asked now, so that something is remembered that must not be afterwards.
-        m_proxy->match(m_proxy->index(0, 0), Qt::DisplayRole, text("1"), -1, Qt::MatchContains);
-        appendTo(m_path, leaseBlock(random.bounded(3), random.bounded(12), random.bounded(30)));
+        const int version{random.bounded(30) + i};
+        const QString newName{QStringLiteral("host-%1").arg(version)};
+        // Whatever is remembered of this must be forgotten by the update.
+        if (random.bounded(2) == 0) {
+            m_proxy->setFilterFixedString({});
+            m_proxy->setFilterFixedString(wanted);
+        }
+        compareMatches(random, newName);
+        appendTo(m_path, leaseBlock(random.bounded(3), random.bounded(12), version));
+        const QSignalSpy reset{m_proxy.get(), &QAbstractItemModel::modelReset};
         m_model->update(m_path);
+        QCOMPARE(reset.count(), 0);
         QCOMPARE(rowsOf(*m_proxy), rowsOf(stock));
+        compareMatches(random, newName);
         compareMatches(random, text("1"));
-        compareMatches(random, text("host-2"));
     }
-    QCOMPARE(reset.count(), 0);
+}
+
+/// A text that only the newest lease has, looked for before and after that came.
+void TestLeaseProxyModel::findsTextsThatAreNew()
+{
+    load(leaseBlock(0, 1, 1));
+    const auto found{[this] {
+        return m_proxy
+            ->match(m_proxy->index(0, DhcpdLeasesModel::HostName), Qt::DisplayRole, text("laptop"), -1,
+                    Qt::MatchContains)
+            .size();
+    }};
+    QCOMPARE(found(), 0);
+    appendTo(m_path, leaseBlock(0, 1, 2).replace("host-2", "laptop"));
+    m_model->update(m_path);
+    QCOMPARE(found(), 1);
+    QCOMPARE(found(), 1);
 }
 
 void TestLeaseProxyModel::followsReloads()

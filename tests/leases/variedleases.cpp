@@ -132,6 +132,7 @@ QStringList searchTexts(QRandomGenerator &random, const QAbstractItemModel &tabl
         QStringLiteral("\uFF11"), // a wide digit
         QStringLiteral("@"),
         QStringLiteral("`"),
+        QStringLiteral("_"),
         QStringLiteral("\u0000"),
         QStringLiteral("xxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxx"),
         QStringLiteral("                                        "),
