@@ -15,6 +15,8 @@ constexpr int mostSplits{13};
 
 bool isAscii(char byte) { return static_cast<quint8>(byte) < 0x80; }
 
+const char *endOf(std::string_view text) { return text.data() + text.size(); }
+
 bool isAscii(std::string_view text)
 {
     return isAscii(std::accumulate(text.begin(), text.end(), '\0',
@@ -153,7 +155,7 @@ bool LeaseTextPattern::isIn(std::string_view bytes) const
                                            [](char byte, ByteTest test) { return test.accepts(byte); }) != bytes.end());
 }
 
-const char *LeaseTextPattern::nextCandidate(const char *begin, const char *end) const
+const char *LeaseTextPattern::nextCandidate(std::string_view memory) const
 {
     // Without a branch for each byte, so that the processor takes many at once.
     constexpr int block{64};
@@ -166,7 +168,8 @@ const char *LeaseTextPattern::nextCandidate(const char *begin, const char *end) 
         }
         return found != 0;
     }};
-    const char *at{begin};
+    const char *at{memory.data()};
+    const char *const end{endOf(memory)};
     while (end - at > block && !hasCandidate(at)) {
         at += block;
     }
@@ -179,7 +182,8 @@ LeaseTextScan::LeaseTextScan(const LeaseTextPattern &pattern, const LeaseTexts &
     : m_pattern{pattern}
     , m_texts{texts}
     , m_begin{texts.memory().data()}
-    , m_candidate{m_begin}
+    , m_candidate{pattern.nextCandidate(texts.memory())}
+    , m_hasCandidates{m_candidate != endOf(texts.memory())}
 {
 }
 
@@ -192,7 +196,8 @@ bool LeaseTextScan::operator()(LeaseTexts::Id id)
     }
     if (begin > m_candidate) {
         m_begin = begin;
-        m_candidate = m_pattern.nextCandidate(begin, m_texts.memory().data() + m_texts.memory().size());
+        m_candidate =
+            m_pattern.nextCandidate(m_texts.memory().substr(static_cast<std::size_t>(begin - m_texts.memory().data())));
     }
     return m_candidate < begin + text.size() && m_pattern.isIn(text);
 }

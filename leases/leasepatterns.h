@@ -92,8 +92,9 @@ public:
 
     bool isIn(std::string_view bytes) const;
 
-    /// The first place from which on something is worth a look with isIn(): no text before it has the needle.
-    const char *nextCandidate(const char *begin, const char *end) const;
+    /// The first place in `memory` with something worth a look with isIn(), or its end: no text before it has the
+    /// needle.
+    const char *nextCandidate(std::string_view memory) const;
 
 private:
     /// What bytes are, or for letters without case become by setting a bit.
@@ -120,9 +121,13 @@ public:
 
     bool operator()(LeaseTexts::Id id);
 
+    /// Whether the needle may be in any text at all.
+    bool hasCandidates() const { return m_hasCandidates; }
+
 private:
     const LeaseTextPattern &m_pattern;
     const LeaseTexts &m_texts;
     const char *m_begin; // the texts from here to m_candidate do not have the needle
     const char *m_candidate;
+    bool m_hasCandidates;
 };

@@ -18,10 +18,8 @@ LeaseSearch::LeaseSearch(const LeaseTable &table, LeaseTimeTexts &timeTexts, Lea
     , m_addressPattern{m_needle}
     , m_textPattern{m_needle}
     , m_timePattern{m_needle, timeTexts}
+    , m_textScan{m_textPattern, table.texts()}
 {
-    const std::string_view texts{table.texts().memory()};
-    const char *const end{texts.data() + texts.size()};
-    m_canBeInTexts = m_textPattern.nextCandidate(texts.data(), end) != end;
 }
 
 bool LeaseSearch::contains(int row) const
@@ -46,10 +44,9 @@ LeaseHits LeaseSearch::findIn(Columns columns, const LeaseHits *among) const
     if (columns.empty()) {
         return hits;
     }
-    LeaseTextScan scan{m_textPattern, m_table.texts()};
     for (int row{0}; row < m_table.size(); ++row) {
         const auto place{static_cast<std::size_t>(row)};
-        if ((!among || among->m_isHit[place]) && isInAny(m_table.inFileOrder(row), columns, scan)) {
+        if ((!among || among->m_isHit[place]) && isInAny(m_table.inFileOrder(row), columns, m_textScan)) {
             hits.m_isHit[place] = true;
             hits.m_isEmpty = false;
         }
@@ -65,7 +62,7 @@ bool LeaseSearch::canBeIn(int column) const
     case DhcpdLeasesModel::Mac:
     case DhcpdLeasesModel::HostName:
     case DhcpdLeasesModel::State:
-        return m_canBeInTexts;
+        return m_textScan.hasCandidates();
     default:
         return true;
     }

@@ -65,5 +65,5 @@ private:
     LeaseAddressPattern m_addressPattern;
     LeaseTextPattern m_textPattern;
     LeaseTimePattern m_timePattern;
-    bool m_canBeInTexts;
+    mutable LeaseTextScan m_textScan; // of the texts that there were at the start
 };
