@@ -117,8 +117,10 @@ bool Reader::endStatement(Kind delimiter)
     } else if (isDeclaration) {
         auto *const declaration =
             m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
-        if (delimiter == Kind::OpeningBrace)
+        if (delimiter == Kind::OpeningBrace) {
+            declaration->setReadAsBlock();
             m_current = declaration;
+        }
     } else {
         m_current->addParam(std::make_unique<DhcpdConfigParam>(takeWords(), m_current));
     }

@@ -9,17 +9,38 @@
 
 namespace {
 
-int joinedSize(const WordList &words)
+// Deep nesting makes a long text of a short file: each line is indented.
+constexpr qint64 maximumBytes{1 << 30};
+
+/// What is written so far; null once it is longer than the maximum.
+using Text = QByteArray;
+
+qint64 joinedSize(const WordList &words)
 {
-    return std::accumulate(words.begin(), words.end(), -1,
-                           [](int size, std::string_view word) { return size + static_cast<int>(word.size()) + 1; });
+    return std::accumulate(words.begin(), words.end(), qint64{-1}, [](qint64 size, std::string_view word) {
+        return size + static_cast<qint64>(word.size()) + 1;
+    });
 }
 
-void appendLine(QByteArray &text, const DhcpdConfigStatement &statement, std::string_view end)
+/// Makes room for so many bytes more and returns where they begin; null, for good, when that is too much.
+char *extend(Text &text, qint64 bytes)
 {
     const int start{text.size()};
-    text.resize(start + statement.indentWidth() + joinedSize(statement.words()) + static_cast<int>(end.size()));
-    char *to{std::fill_n(text.data() + start, statement.indentWidth(), ' ')};
+    if (text.isNull() || start + bytes > maximumBytes) {
+        text = {};
+        return nullptr;
+    }
+    text.resize(static_cast<int>(start + bytes));
+    return text.data() + start;
+}
+
+void appendLine(Text &text, const DhcpdConfigStatement &statement, std::string_view end)
+{
+    const qint64 size{statement.indentWidth() + joinedSize(statement.words()) + static_cast<qint64>(end.size())};
+    char *to{extend(text, size)};
+    if (!to)
+        return;
+    to = std::fill_n(to, statement.indentWidth(), ' ');
     bool first{true};
     for (const std::string_view word : statement.words()) {
         if (!std::exchange(first, false))
@@ -29,15 +50,23 @@ void appendLine(QByteArray &text, const DhcpdConfigStatement &statement, std::st
     std::copy(end.begin(), end.end(), to);
 }
 
-void append(QByteArray &text, const DhcpdConfigParam &param)
+void append(Text &text, const DhcpdConfigParam &param)
 {
     if (!param.words().at(0).empty())
         appendLine(text, param, ";\n");
 }
 
-void append(QByteArray &text, const DhcpdConfigDeclaration &declaration);
+/// Whether a declaration is written without its children. They are only dropped, deliberately, where an edit put them:
+/// a block that was read with braces, as those of subclasses often are, keeps them.
+bool isOneLine(const DhcpdConfigDeclaration &declaration)
+{
+    return (declaration.isRange() || declaration.isSubclass() || declaration.isFixedAddress()) &&
+           !(declaration.isReadAsBlock() && declaration.childCount() > 0);
+}
 
-void appendBody(QByteArray &text, const DhcpdConfigDeclaration &declaration)
+void append(Text &text, const DhcpdConfigDeclaration &declaration);
+
+void appendBody(Text &text, const DhcpdConfigDeclaration &declaration)
 {
     for (const auto &param : declaration.parameters())
         append(text, *param);
@@ -45,19 +74,20 @@ void appendBody(QByteArray &text, const DhcpdConfigDeclaration &declaration)
         append(text, *child);
 }
 
-void append(QByteArray &text, const DhcpdConfigDeclaration &declaration)
+void append(Text &text, const DhcpdConfigDeclaration &declaration)
 {
     if (declaration.isRoot()) {
         appendBody(text, declaration);
     } else if (declaration.words().at(0).empty()) {
         return; // its children go with it, deliberately: they would end up in the block around it
-    } else if (declaration.isRange() || declaration.isSubclass() || declaration.isFixedAddress()) {
+    } else if (isOneLine(declaration)) {
         appendLine(text, declaration, ";\n");
     } else {
         appendLine(text, declaration, " {\n");
         appendBody(text, declaration);
-        text.append(declaration.indentWidth(), ' ');
-        text += "}\n";
+        constexpr std::string_view end{"}\n"};
+        if (char *to{extend(text, declaration.indentWidth() + static_cast<qint64>(end.size()))})
+            std::copy(end.begin(), end.end(), std::fill_n(to, declaration.indentWidth(), ' '));
     }
 }
 
@@ -65,7 +95,7 @@ void append(QByteArray &text, const DhcpdConfigDeclaration &declaration)
 
 QByteArray serialize(const DhcpdConfigStatement &statement)
 {
-    QByteArray text;
+    Text text{""}; // empty, not null
     if (statement.isDeclaration())
         append(text, static_cast<const DhcpdConfigDeclaration &>(statement));
     else

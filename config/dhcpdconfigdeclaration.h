@@ -26,6 +26,10 @@ public:
     DhcpdConfigParam *addParam(const QStringList &words);
     DhcpdConfigDeclaration *addDeclaration(const QStringList &words);
 
+    /// Whether the declaration stood in the file with a body in braces, whatever its keyword is.
+    bool isReadAsBlock() const { return m_isReadAsBlock; }
+    void setReadAsBlock() { m_isReadAsBlock = true; }
+
     void removeChild(DhcpdConfigStatement *statement) override;
     bool removeChildren(int row, int count) override;
     DhcpdConfigStatement *child(int row) const override;
@@ -52,5 +56,6 @@ private:
     template<class List>
     static bool eraseFound(List &list, const DhcpdConfigStatement *statement);
 
+    bool m_isReadAsBlock{};
     std::unique_ptr<Children> m_children; // null while there were none: most declarations are ranges and addresses
 };

@@ -28,7 +28,8 @@ DhcpdConfigModel::DhcpdConfigModel(const QStringList &headerLabels, QObject *par
 
 QModelIndex DhcpdConfigModel::index(int row, int column, const QModelIndex &parent) const
 {
-    if (!hasIndex(row, column, parent))
+    // As hasIndex(), but column 0 does not count the words of the parent: a view asks for it for every row.
+    if (row < 0 || row >= rowCount(parent) || column < 0 || (column > 0 && column >= columnCount(parent)))
         return {};
     DhcpdConfigStatement *const child{statementFor(parent)->child(row)};
     return child ? createIndex(row, column, child) : QModelIndex{};
@@ -91,7 +92,11 @@ DhcpdConfigStatement *DhcpdConfigModel::statementFor(const QModelIndex &index) c
 
 bool DhcpdConfigModel::parse(const QString &text) { return parseUtf8(text.toUtf8()); }
 
-QByteArray DhcpdConfigModel::fileContent() const { return m_encoding.fromUtf8(serialize(*m_topNode)); }
+QByteArray DhcpdConfigModel::fileContent() const
+{
+    const QByteArray text{serialize(*m_topNode)};
+    return text.isEmpty() ? text : m_encoding.fromUtf8(text);
+}
 
 void DhcpdConfigModel::reload(const QString &confFile)
 {
@@ -114,8 +119,10 @@ void DhcpdConfigModel::read(const QString &confFile)
 
 bool DhcpdConfigModel::write(const QString &confFile)
 {
-    // A tree without a top row was never read: nothing of it may replace a file that does hold something.
-    if (m_topNode->childCount() > 0 && fileio::replaceFile(confFile, fileContent()))
+    // A tree without a top row was never read: nothing of it may replace a file that does hold something. Nor may a
+    // part of a tree whose text is too long.
+    const QByteArray content{m_topNode->childCount() > 0 ? fileContent() : QByteArray{}};
+    if (!content.isNull() && fileio::replaceFile(confFile, content))
         return true;
     return refuse(tr("Unable to open file '%1' for write").arg(confFile));
 }

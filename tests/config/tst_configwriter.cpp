@@ -72,6 +72,7 @@ private slots:
     void writesParamAlone();
     void writesBothTopRows();
     void readsBackWhatItWrote();
+    void refusesATextThatIsTooLong();
     void keepsBytes();
 };
 
@@ -99,7 +100,10 @@ void ConfigWriterTest::rewrites_data()
     addRow("quoted runs of spaces", "a \"b   c\td\";", "a \"b c d\";\n");
     addRow("keyword at a later position becomes an empty block", "option foo range;", "option foo range {\n}\n");
     addRow("keywords in capitals", "RANGE 1;Subclass 2;fixed-ADDRESS 3;", "RANGE 1;\nSubclass 2;\nfixed-ADDRESS 3;\n");
-    addRow("children of a range are lost", "range 1 2 { a b; }", "range 1 2;\n");
+    addRow("a subclass keeps its body", "subclass \"a\" 1:2 { option x y; b { c d; } }",
+           "subclass \"a\" 1:2 {\n    option x y;\n    b  {\n        c d;\n    }\n}\n");
+    addRow("so does a range, even if the server knows none", "range 1 2 { a b; }", "range 1 2 {\n    a b;\n}\n");
+    addRow("empty bodies go", "subclass 1 2 {} fixed-address 1 {}", "subclass 1 2;\nfixed-address 1;\n");
     addRow("carriage returns stay in their words", "a b\r\n;", "a b\r;\n");
 }
 
@@ -170,6 +174,18 @@ void ConfigWriterTest::readsBackWhatItWrote()
         QCOMPARE(nodeOf(*again), tree);
         QCOMPARE(serialize(*topAgain), written);
     }
+}
+
+void ConfigWriterTest::refusesATextThatIsTooLong()
+{
+    // Some two kilobytes of indentation for each of the innermost statements.
+    QByteArray text;
+    for (int depth = 0; depth < 499; ++depth)
+        text += "a {";
+    const auto top = makeTop();
+    QVERIFY(readUnder(*top, QString::fromLatin1(text + QByteArray{"b;"}.repeated(600'000))));
+    QVERIFY(serialize(*top).isNull());
+    QVERIFY(!serialize(*makeTop()).isNull());
 }
 
 void ConfigWriterTest::keepsBytes()
