@@ -157,6 +157,9 @@ void FMain::setUpLeases()
 
     m_leaseMenu = new QMenu{tr("Actions"), this};
     m_leaseMenu->addAction(m_ui->aAddReserveIP);
+    // Queued: the menu hides before it triggers what was chosen.
+    connect(
+        m_leaseMenu, &QMenu::aboutToHide, this, [this] { m_menuLease.reset(); }, Qt::QueuedConnection);
 
     m_leaseProxy = std::make_unique<LeaseProxyModel>(nullptr);
     m_leaseProxy->setSourceModel(m_leasesModel.get());
@@ -189,7 +192,11 @@ void FMain::restoreSize() { resize(QSettings{}.value(QLatin1String{sizeKey}, siz
 
 void FMain::showError(const QString &text)
 {
-    // A failed load or save reports from under the busy cursor.
+    if (m_heldErrors) {
+        m_heldErrors->append(text);
+        return;
+    }
+    // A failed load reports from under the busy cursor.
     QGuiApplication::setOverrideCursor(QCursor{Qt::ArrowCursor});
     QMessageBox::critical(this, tr("Error"), text, QMessageBox::Ok);
     QGuiApplication::restoreOverrideCursor();
@@ -235,7 +242,7 @@ void FMain::handleServerStateChanged(DhcpServerManager::ServerStates state)
 void FMain::handleTreeItemChanged(QModelIndex current)
 {
     const auto *statement = static_cast<DhcpdConfigStatement *>(current.internalPointer());
-    if (!statement)
+    if (!statement || m_ui->mainTabWidget->currentIndex() != TopologyTab)
         return;
     const bool root = statement->isDeclaration() && statement->isRoot();
     const bool sharedNetwork = statement->isDeclaration() && statement->isSharedNetwork();

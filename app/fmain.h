@@ -7,6 +7,7 @@
 #include <QModelIndexList>
 
 #include <memory>
+#include <optional>
 
 class DhcpdConfigModel;
 class DhcpdConfigStatement;
@@ -174,8 +175,19 @@ private:
     QModelIndexList leaseMatches(const QString &text, int hits) const;
     void showLeaseMatch(const QModelIndex &match);
     void stepToLease(int step);
-    /// Offers to add a host for the lease at `lease`, an index of the lease table.
-    void reserveLease(const QModelIndex &lease);
+    /// The texts of a lease, copied, since the table may change while a menu or dialog is open.
+    struct LeaseTexts
+    {
+        QString address;
+        QString mac;
+        QString hostName;
+    };
+    /// The lease at an index of the lease table.
+    static std::optional<LeaseTexts> leaseAt(const QModelIndex &index);
+    /// Offers to add a host for a lease.
+    void reserve(const std::optional<LeaseTexts> &lease);
+    /// Adds a host and opens the whole tree.
+    void addHostTo(const QModelIndex &network, const QString &name, const QString &mac, const QString &ip);
 
     std::unique_ptr<Ui::FMain> m_ui;
     QLabel *m_statusLabel{};
@@ -187,9 +199,11 @@ private:
     PathWatch *m_leaseWatch{};
     std::unique_ptr<LeaseProxyModel> m_leaseProxy;
     QMenu *m_leaseMenu{};
+    std::optional<LeaseTexts> m_menuLease; // the one that the open lease menu is about
     int m_matchPosition{};
     QStringList m_bind9Versions;
     std::unique_ptr<TopologyMenus> m_topologyMenus;
+    std::optional<QStringList> m_heldErrors; // while errors are to be shown later
     bool m_ignoreNextChange{};
     bool m_changedOutside{};
 };

@@ -18,6 +18,8 @@
 #include <QHeaderView>
 #include <QMessageBox>
 
+#include <utility>
+
 void FMain::reload()
 {
     if (m_ui->mainTabWidget->currentIndex() == LeasesTab) {
@@ -82,6 +84,8 @@ FMain::SaveOutcome FMain::saveConfiguration()
         return SaveOutcome::Failed;
     m_ignoreNextChange = true;
     m_changedOutside = false;
+    // A notice that was due from before the write is about a version that is gone.
+    m_configWatch->forget();
     // The notice of the write itself, which the paused watch did not give; a second one if somebody else wrote
     // meanwhile.
     QMetaObject::invokeMethod(this, &FMain::configChanged, Qt::QueuedConnection);
@@ -93,10 +97,18 @@ FMain::SaveOutcome FMain::saveConfiguration()
 
 bool FMain::writeConfiguration()
 {
-    const BusyCursor busy{paths::configuration()};
-    m_configWatch->pause();
-    const bool written = m_configModel->write();
-    m_configWatch->resume();
+    // An error is shown when the file is watched again: while a box is open, others may change it.
+    m_heldErrors.emplace();
+    bool written{};
+    {
+        const BusyCursor busy{paths::configuration()};
+        m_configWatch->pause();
+        written = m_configModel->write();
+        m_configWatch->resume();
+    }
+    const QStringList errors = *std::exchange(m_heldErrors, std::nullopt);
+    for (const QString &error : errors)
+        showError(error);
     return written;
 }
 
@@ -126,7 +138,7 @@ void FMain::closeEvent(QCloseEvent *event)
     const auto answer = QMessageBox::question(this, tr("Confirmation"), tr("There are unsaved changes, save?"),
                                               QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
     // After a Yes the window closes whatever became of the save, deliberately; what could not be written is kept.
-    if (answer == QMessageBox::Yes && saveConfiguration() == SaveOutcome::Failed)
+    if (answer == QMessageBox::Yes && saveConfiguration() == SaveOutcome::Failed && m_configModel->rowCount() > 0)
         fileio::keepCopy(paths::configuration(), m_configModel->fileContent());
     event->setAccepted(answer == QMessageBox::Yes || answer == QMessageBox::No);
 }

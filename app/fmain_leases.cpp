@@ -11,11 +11,20 @@
 
 #include <QMenu>
 #include <QMessageBox>
+#include <QRegularExpression>
 
 namespace {
 
 constexpr auto foundStyle = "QLineEdit { color: black; }";
 constexpr auto notFoundStyle = "QLineEdit { color: red; }";
+
+/// The name without the characters that would end it in the configuration: the client chose it, and might write
+/// statements of its own there.
+QString withoutSyntax(QString name)
+{
+    static const QRegularExpression syntax{QStringLiteral("[\"#;{}\\x00-\\x1f]")};
+    return name.remove(syntax);
+}
 
 } // namespace
 
@@ -72,34 +81,41 @@ void FMain::stepToLease(int step)
 
 void FMain::handleTableContextMenuRequested(QPoint position)
 {
-    if (m_ui->dhcpdLeaseTable->indexAt(position).isValid())
-        m_leaseMenu->popup(QCursor::pos());
+    if (!m_ui->dhcpdLeaseTable->indexAt(position).isValid())
+        return;
+    m_menuLease = leaseAt(m_ui->dhcpdLeaseTable->currentIndex());
+    m_leaseMenu->popup(QCursor::pos());
 }
 
-void FMain::handleTableDoubleClicked(QModelIndex index) { reserveLease(index); }
+void FMain::handleTableDoubleClicked(QModelIndex index) { reserve(leaseAt(index)); }
 
-void FMain::handleReserveIp() { reserveLease(m_ui->dhcpdLeaseTable->currentIndex()); }
+void FMain::handleReserveIp() { reserve(m_menuLease ? m_menuLease : leaseAt(m_ui->dhcpdLeaseTable->currentIndex())); }
 
-void FMain::reserveLease(const QModelIndex &lease)
+std::optional<FMain::LeaseTexts> FMain::leaseAt(const QModelIndex &index)
+{
+    if (!index.isValid())
+        return {};
+    const auto cell = [&index](int column) { return index.siblingAtColumn(column).data().toString(); };
+    return LeaseTexts{cell(DhcpdLeasesModel::Address), cell(DhcpdLeasesModel::Mac), cell(DhcpdLeasesModel::HostName)};
+}
+
+void FMain::reserve(const std::optional<LeaseTexts> &lease)
 {
     // Without a configuration there is nothing that the host could be added to.
     const QModelIndex network = m_configModel->index(0, 0);
-    if (!lease.isValid() || !network.isValid())
+    if (!lease || !network.isValid())
         return;
-    // Copied before the dialog opens: the table may be reloaded meanwhile.
-    const auto cell = [&lease](int column) { return lease.siblingAtColumn(column).data().toString(); };
-    const QString hostName = cell(DhcpdLeasesModel::HostName);
+    const LeaseTexts texts = *lease;
     HostInputDialog dialog{this};
     dialog.setWindowTitle(tr("Reserve an IP address"));
-    dialog.setIp(cell(DhcpdLeasesModel::Address));
-    dialog.setMac(cell(DhcpdLeasesModel::Mac));
-    dialog.setName(hostName);
+    dialog.setIp(texts.address);
+    dialog.setMac(texts.mac);
+    dialog.setName(withoutSyntax(texts.hostName));
     dialog.adjustSize();
     if (dialog.exec() != QDialog::Accepted)
         return;
 
-    m_configModel->addHost(dialog.name(), dialog.mac(), dialog.ip(), network);
-    m_treeExpansion->expandAll();
+    addHostTo(network, dialog.name(), dialog.mac(), dialog.ip());
     const auto answer =
         QMessageBox::information(this, tr("Information"), tr("The IP address is reserved.\nGo to topology?"),
                                  QMessageBox::Yes | QMessageBox::No);
@@ -108,7 +124,7 @@ void FMain::reserveLease(const QModelIndex &lease)
     m_ui->mainTabWidget->setCurrentIndex(TopologyTab);
     // The name as the lease has it is looked for, deliberately, even if another was typed.
     for (int row = 0; row < m_configModel->rowCount(network); ++row) {
-        if (m_configModel->index(row, 1, network).data().toString() == hostName) {
+        if (m_configModel->index(row, 1, network).data().toString() == texts.hostName) {
             m_ui->topologyTree->setCurrentIndex(m_configModel->index(row, 0, network));
             break;
         }

@@ -28,6 +28,7 @@
 #include <QMessageBox>
 
 #include <algorithm>
+#include <limits>
 #include <tuple>
 
 namespace {
@@ -52,6 +53,13 @@ QStringList wordsFrom(const Statement &statement, int first)
 QString textFrom(const Statement &statement, int first)
 {
     return wordsFrom(statement, first).join(QLatin1Char{' '}).trimmed();
+}
+
+/// The seconds of a lease time, which may be more than the dialog's numbers hold.
+int secondsOf(const Statement &time)
+{
+    using Limits = std::numeric_limits<int>;
+    return static_cast<int>(qBound<qint64>(Limits::min(), time.word(1).toLongLong(), Limits::max()));
 }
 
 /// The subnet as one text; the mask may be missing.
@@ -353,7 +361,7 @@ void FMain::handleAddRange()
         tr("Add range"),
         [this](RangeInputDialog &dialog) {
             const Statement &subnet = *m_configModel->statementFor(currentDeclaration());
-            const QStringList range = m_configModel->defaultRange(subnetText(subnet.word(1), subnet.word(3)));
+            const QStringList range = m_configModel->defaultRange(subnet.word(1) + QLatin1Char{'/'} + subnet.word(3));
             dialog.setStartIp(range.value(0));
             dialog.setEndIp(range.value(1));
         },
@@ -394,6 +402,12 @@ void FMain::handleAddHost()
         [this](const HostInputDialog &dialog, const QModelIndex &parent) {
             m_configModel->addHost(dialog.name(), dialog.mac(), dialog.ip(), parent);
         });
+}
+
+void FMain::addHostTo(const QModelIndex &network, const QString &name, const QString &mac, const QString &ip)
+{
+    addTo(
+        network, [&] { m_configModel->addHost(name, mac, ip, network); }, OpenBranches::All);
 }
 
 void FMain::handleEditHost()
@@ -527,7 +541,7 @@ void FMain::addLeaseTime(const QString &title, bool (DhcpdConfigModel::*add)(con
 void FMain::editLeaseTime(const QString &title, KindTest isKind)
 {
     editValueThroughDialog<TimeInputDialog>(
-        title, isKind, [](TimeInputDialog &dialog, const Statement &time) { dialog.setSeconds(time.word(1).toInt()); },
+        title, isKind, [](TimeInputDialog &dialog, const Statement &time) { dialog.setSeconds(secondsOf(time)); },
         [](const TimeInputDialog &dialog) { return dialog.seconds(); });
 }
 

@@ -49,12 +49,15 @@ LeasePlace::LeasePlace(const QTableView &table)
 void LeasePlace::restoreIn(QTableView &table) const
 {
     const QAbstractItemModel &leases = *table.model();
-    if (m_current && !table.currentIndex().isValid()) {
-        const int row = lowerBound(leases, *m_current);
+    // When the current row goes, the table makes its neighbour current; another lease than the user chose.
+    if (addressOf(table.currentIndex()) != m_current) {
+        const int row = m_current ? lowerBound(leases, *m_current) : leases.rowCount();
         if (row < leases.rowCount() && addressAt(leases, row) == *m_current) {
             const auto extent = m_cellSelected ? QItemSelectionModel::NoUpdate : QItemSelectionModel::Rows;
             table.selectionModel()->setCurrentIndex(leases.index(row, m_column),
                                                     QItemSelectionModel::ClearAndSelect | extent);
+        } else {
+            table.selectionModel()->clear();
         }
     }
     if (m_top && addressOf(table.indexAt({0, 0})) != m_top) {

@@ -24,6 +24,8 @@ public:
     /// given.
     void pause();
     void resume();
+    /// Drops a notice that is due.
+    void forget() { m_burst.stop(); }
 
 signals:
     /// The file may have changed; also sent for other files of its directory.

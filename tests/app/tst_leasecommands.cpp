@@ -185,6 +185,8 @@ private slots:
     void placeIsKeptOverAutomaticReloads_data();
     void placeIsKeptOverAutomaticReloads();
     void searchIsKeptOverAutomaticReloads();
+    void leaseThatLeavesTheFilterHasNoSuccessor();
+    void clientsNameAddsNoStatements();
 
 private:
     std::unique_ptr<TestMachine> m_machine;
@@ -439,6 +441,9 @@ void LeaseCommandsTest::reservationIsAdded()
     QVERIFY(content.contains("hardware ethernet 00:00:5e:00:53:04;"));
     QVERIFY(content.contains("fixed-address 10.0.1.9;"));
     const QModelIndex network = site.model->index(0, 0);
+    QCOMPARE(site.tree->currentIndex(), network);
+    // The tree is not in view: what adds to it stays off.
+    QVERIFY(!site.window->findChild<QAction *>(QStringLiteral("aAddHost"))->isEnabled());
     QVERIFY(site.tree->isExpanded(network));
     for (int row = 1; row < site.model->rowCount(network); ++row) {
         const QModelIndex child = site.model->index(row, 0, network);
@@ -580,6 +585,31 @@ void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
         QCOMPARE(site.topAddress(), QStringLiteral("10.0.0.150"));
         more = lease("9.0.0.2", "once more");
     }
+}
+
+void LeaseCommandsTest::leaseThatLeavesTheFilterHasNoSuccessor()
+{
+    writeTestFile(paths::leases(), lease("10.0.0.1", "a") + lease("10.0.0.2", "b") + lease("10.0.0.3", "c"));
+    const Site site{*m_machine};
+    site.type(QStringLiteral("active"));
+    site.click("10.0.0.2", 2);
+    runOutside(QStringLiteral(R"(cat >>"$1")"), lease("10.0.0.2", "b", "free"));
+    QTRY_COMPARE(site.table->model()->rowCount(), 2);
+    QTRY_VERIFY(!site.table->currentIndex().isValid());
+    QVERIFY(!site.table->selectionModel()->hasSelection());
+}
+
+void LeaseCommandsTest::clientsNameAddsNoStatements()
+{
+    writeTestFile(paths::leases(), lease("10.0.0.1", "x;} include #y{"));
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([](HostInputDialog *dialog) {
+        QCOMPARE(dialog->name(), QStringLiteral("x include y"));
+        press(*dialog, QDialogButtonBox::Cancel);
+    });
+    site.doubleClick("10.0.0.1");
+    boxes.verify();
 }
 
 void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
