@@ -105,7 +105,7 @@ void FMain::reserve(const std::optional<LeaseTexts> &lease)
     const QModelIndex network = m_configModel->index(0, 0);
     if (!lease || !network.isValid())
         return;
-    const LeaseTexts texts = *lease;
+    const LeaseTexts &texts = *lease;
     HostInputDialog dialog{this};
     dialog.setWindowTitle(tr("Reserve an IP address"));
     dialog.setIp(texts.address);

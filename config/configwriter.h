@@ -5,6 +5,6 @@
 
 #include <QByteArray>
 
-/// The text (in UTF-8) of `statement` and everything under it, as it stands in a configuration file; null when it would be
-/// longer than 1 GiB.
+/// The text (in UTF-8) of `statement` and everything under it, as it stands in a configuration file; null when it would
+/// be longer than 1 GiB.
 QByteArray serialize(const DhcpdConfigStatement &statement);
