@@ -132,7 +132,7 @@ LeaseTextPattern::LeaseTextPattern(LeaseNeedle needle)
     : m_needle{std::move(needle)}
 {
     const bool ignoresCase{m_needle.sensitivity == Qt::CaseInsensitive};
-    for (const QChar character : m_needle.text) {
+    for (const QChar character : qAsConst(m_needle.text)) {
         const QChar folded{ignoresCase ? character.toCaseFolded() : character};
         m_canBeInAscii = m_canBeInAscii && folded.unicode() < 0x80;
         const bool isLetter{folded >= QLatin1Char{'a'} && folded <= QLatin1Char{'z'}};

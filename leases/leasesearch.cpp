@@ -7,8 +7,13 @@
 
 namespace {
 
-const std::vector<int> allColumns{DhcpdLeasesModel::Address, DhcpdLeasesModel::Mac,   DhcpdLeasesModel::HostName,
-                                  DhcpdLeasesModel::State,   DhcpdLeasesModel::Start, DhcpdLeasesModel::End};
+const std::vector<int> &allColumns()
+{
+    static const std::vector<int> columns{DhcpdLeasesModel::Address,  DhcpdLeasesModel::Mac,
+                                          DhcpdLeasesModel::HostName, DhcpdLeasesModel::State,
+                                          DhcpdLeasesModel::Start,    DhcpdLeasesModel::End};
+    return columns;
+}
 
 } // namespace
 
@@ -24,7 +29,7 @@ LeaseSearch::LeaseSearch(const LeaseTable &table, LeaseTimeTexts &timeTexts, Lea
 
 bool LeaseSearch::contains(int row) const
 {
-    return isInAny(m_table.at(row), allColumns, [this](LeaseTexts::Id id) { return isInText(id); });
+    return isInAny(m_table.at(row), allColumns(), [this](LeaseTexts::Id id) { return isInText(id); });
 }
 
 bool LeaseSearch::contains(int row, int column) const
@@ -32,7 +37,7 @@ bool LeaseSearch::contains(int row, int column) const
     return isIn(m_table.at(row), column, [this](LeaseTexts::Id id) { return isInText(id); });
 }
 
-LeaseHits LeaseSearch::find() const { return findIn(allColumns, nullptr); }
+LeaseHits LeaseSearch::find() const { return findIn(allColumns(), nullptr); }
 
 LeaseHits LeaseSearch::find(int column, const LeaseHits *among) const { return findIn({column}, among); }
 
