@@ -6,9 +6,6 @@
 #include <memory>
 #include <string_view>
 
-/// The deepest nesting of blocks that a configuration may have: views and the server itself recurse into them.
-constexpr int maximumBlockDepth{500};
-
 /// Reads the text of a configuration (in UTF-8) into a new "All network" declaration, whose parent is `top` but which
 /// is not among its children yet. Any text gives a tree, syntax errors are not reported; nothing when blocks are nested
 /// deeper than maximumBlockDepth.

@@ -12,7 +12,7 @@ namespace {
 // Deep nesting makes a long text of a short file: each line is indented.
 constexpr qint64 maximumBytes{1 << 30};
 
-/// What is written so far; null once it is longer than the maximum.
+/// What is written so far; null once it is longer than the maximum or blocks are nested too deep.
 using Text = QByteArray;
 
 qint64 joinedSize(const WordList &words)
@@ -82,6 +82,8 @@ void append(Text &text, const DhcpdConfigDeclaration &declaration)
         return; // its children go with it, deliberately: they would end up in the block around it
     } else if (isOneLine(declaration)) {
         appendLine(text, declaration, ";\n");
+    } else if (declaration.depth() >= maximumBlockDepth) {
+        text = {};
     } else {
         appendLine(text, declaration, " {\n");
         appendBody(text, declaration);

@@ -7,6 +7,9 @@
 #include <memory>
 #include <vector>
 
+/// The deepest nesting of blocks that a configuration may have: views and the server itself recurse into them.
+constexpr int maximumBlockDepth{500};
+
 /// A statement that owns others: parameters, and after them declarations.
 class DhcpdConfigDeclaration final : public DhcpdConfigStatement
 {
@@ -29,6 +32,8 @@ public:
     /// Whether the declaration stood in the file with a body in braces, whatever its keyword is.
     bool isReadAsBlock() const { return m_isReadAsBlock; }
     void setReadAsBlock() { m_isReadAsBlock = true; }
+    /// Whether a block in this one would not be nested too deep.
+    bool takesBlocks() const { return depth() + 1 < maximumBlockDepth; }
 
     void removeChild(DhcpdConfigStatement *statement) override;
     bool removeChildren(int row, int count) override;

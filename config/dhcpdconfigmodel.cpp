@@ -120,7 +120,7 @@ void DhcpdConfigModel::read(const QString &confFile)
 bool DhcpdConfigModel::write(const QString &confFile)
 {
     // A tree without a top row was never read: nothing of it may replace a file that does hold something. Nor may a
-    // part of a tree whose text is too long.
+    // text that could not be read again.
     const QByteArray content{m_topNode->childCount() > 0 ? fileContent() : QByteArray{}};
     if (!content.isNull() && fileio::replaceFile(confFile, content))
         return true;

@@ -42,11 +42,12 @@ public:
 
     /// Appends what `text` holds; false, with nothing appended, when its blocks are nested too deep.
     bool parse(const QString &text);
-    /// The bytes that write() puts into the file; null when they are too many.
+    /// The bytes that write() puts into the file; null when they could not be read again.
     QByteArray fileContent() const;
 
     // The operations below add statements at the end of those of their sort under the statement of `parent`. What they
-    // refuse, with an error(), changes nothing. A reset tells of statements that came or went.
+    // refuse, with an error(), changes nothing. A parent too deep to hold blocks is refused like one of the wrong kind.
+    // A reset tells of statements that came or went.
 
     void addSharedNetwork(const QString &name, const QModelIndex &parent);
     /// `mask` is a netmask, a prefix length, or empty when `address` has one.

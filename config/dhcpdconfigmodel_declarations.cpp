@@ -15,9 +15,10 @@ constexpr int wordsOfBlock{3 * wordsOfLine};
 constexpr QLatin1Char blank{' '};
 constexpr QLatin1Char quote{'"'};
 
-bool isRootOrGroup(const DhcpdConfigDeclaration *declaration)
+// Whether blocks that stand at the top of a file can be added.
+bool takesTopBlocks(const DhcpdConfigDeclaration *declaration)
 {
-    return declaration && (declaration->isRoot() || declaration->isGroup());
+    return declaration && (declaration->isRoot() || declaration->isGroup()) && declaration->takesBlocks();
 }
 
 bool takesAnything(const DhcpdConfigDeclaration *declaration)
@@ -47,7 +48,7 @@ bool appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaratio
 void DhcpdConfigModel::addSharedNetwork(const QString &name, const QModelIndex &parent)
 {
     auto *const holder = declarationFor(parent);
-    if (!isRootOrGroup(holder))
+    if (!takesTopBlocks(holder))
         refuse(tr("Error adding shared-network. Can not add shared-network to '%1'").arg(keywordFor(parent)));
     else
         changeTree([&] { holder->addDeclaration({QStringLiteral("shared-network"), name}); });
@@ -60,7 +61,7 @@ void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, co
     auto *const holder = declarationFor(parent);
     if (!subnet)
         refuse(tr("Error adding subnet. Invalid subnet '%1'").arg(text));
-    else if (!isRootOrGroup(holder) && !(holder && holder->isSharedNetwork()))
+    else if (!takesTopBlocks(holder) && !(holder && holder->isSharedNetwork() && holder->takesBlocks()))
         refuse(tr("Error adding subnet. Can not add subnet to '%1'").arg(keywordFor(parent)));
     else
         changeTree([&] {
@@ -106,7 +107,7 @@ void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QS
                                const QModelIndex &parent)
 {
     auto *const holder = declarationFor(parent);
-    if (!isRootOrGroup(holder)) {
+    if (!takesTopBlocks(holder)) {
         refuse(tr("Error adding host. Can not add host to '%1'").arg(keywordFor(parent)));
         return;
     }
@@ -153,7 +154,7 @@ void DhcpdConfigModel::addFixedAddress(const QString &address, const QModelIndex
 bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex &parent)
 {
     auto *const holder = declarationFor(parent);
-    if (!isRootOrGroup(holder))
+    if (!takesTopBlocks(holder))
         return refuse(tr("Error adding bind9. Can not add bind9 to '%1'").arg(keywordFor(parent)));
     if (statements.isEmpty())
         return refuse(tr("Error adding bind9. bind9 can not be empty."));
@@ -173,7 +174,7 @@ bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex
 bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelIndex &parent)
 {
     auto *const holder = declarationFor(parent);
-    if (!takesAnything(holder))
+    if (!takesAnything(holder) || !holder->takesBlocks())
         return refuse(tr("Error adding declaration. Can not add declaration to '%1'").arg(keywordFor(parent)));
     changeTree([&] { holder->addDeclaration(words); });
     return true;

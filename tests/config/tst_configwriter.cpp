@@ -73,6 +73,7 @@ private slots:
     void writesBothTopRows();
     void readsBackWhatItWrote();
     void refusesATextThatIsTooLong();
+    void refusesBlocksNestedTooDeep();
     void keepsBytes();
 };
 
@@ -186,6 +187,18 @@ void ConfigWriterTest::refusesATextThatIsTooLong()
     QVERIFY(readUnder(*top, QString::fromLatin1(text + QByteArray{"b;"}.repeated(600'000))));
     QVERIFY(serialize(*top).isNull());
     QVERIFY(!serialize(*makeTop()).isNull());
+}
+
+// Words behind the keyword make a declaration of a line that is not nested deeper than its block, but written as one
+// that is.
+void ConfigWriterTest::refusesBlocksNestedTooDeep()
+{
+    const QString blocks{QStringLiteral("a {").repeated(maximumBlockDepth)};
+    const auto top = makeTop();
+    QVERIFY(readUnder(*top, blocks + QStringLiteral("range 1 2;")));
+    QVERIFY(!serialize(*top).isNull());
+    QVERIFY(readUnder(*top, blocks + QStringLiteral("option foo range;")));
+    QVERIFY(serialize(*top).isNull());
 }
 
 void ConfigWriterTest::keepsBytes()

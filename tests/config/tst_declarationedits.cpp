@@ -48,6 +48,30 @@ Edit addWords(WordsOperation add, const QStringList &words, bool isAdded = true)
     return [=](DhcpdConfigModel &model, const QModelIndex &parent) { QCOMPARE((model.*add)(words, parent), isAdded); };
 }
 
+// A configuration of `depth` blocks, each in the one before; the innermost is a `kind`.
+QString nestedBlocks(int depth, const char *kind)
+{
+    return text("group { ").repeated(depth - 1) + text(kind) + text(" { ") + text("} ").repeated(depth);
+}
+
+QModelIndex innermost(const DhcpdConfigModel &model)
+{
+    QModelIndex index;
+    while (model.rowCount(index) > 0)
+        index = model.index(0, 0, index);
+    return index;
+}
+
+// Fails the test unless the model can read the file that it would write.
+void verifyIsReadAgain(const EditedModel &edited)
+{
+    const QByteArray content{edited.model().fileContent()};
+    QVERIFY(!content.isNull());
+    DhcpdConfigModel model{{text("Topology"), text("Value")}};
+    QVERIFY(model.parse(QString::fromUtf8(content)));
+    QCOMPARE(model.fileContent(), content);
+}
+
 constexpr auto subnet = "subnet 10.0.0.0 netmask 255.255.255.0 { range 10.0.0.10 10.0.0.20; }";
 
 } // namespace
@@ -61,6 +85,10 @@ private slots:
     void adds();
     void refuses_data();
     void refuses();
+    void addsNoBlocksThatCouldNotBeRead_data();
+    void addsNoBlocksThatCouldNotBeRead();
+    void addsLinesToTheDeepestBlock_data();
+    void addsLinesToTheDeepestBlock();
     void computesDefaultRange_data();
     void computesDefaultRange();
     void removesStatement();
@@ -277,6 +305,68 @@ void TestDeclarationEdits::refuses()
 {
     QFETCH(Refusal, refusal);
     verifyRefusal(refusal);
+}
+
+void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead_data()
+{
+    QTest::addColumn<QString>("holder");
+    QTest::addColumn<EditCase::Edit>("edit");
+    QTest::addColumn<QString>("error");
+
+    const auto row = [](const char *holder, const Edit &edit, const char *error) {
+        QTest::addRow("%s", error) << text(holder) << edit << text(error);
+    };
+    row("group", addSharedNetwork("a"), "Error adding shared-network. Can not add shared-network to 'group'");
+    row("group", addSubnet("10.0.0.0", "24"), "Error adding subnet. Can not add subnet to 'group'");
+    row("shared-network", addSubnet("10.0.0.0", "24"), "Error adding subnet. Can not add subnet to 'shared-network'");
+    row("group", addHost("pc", "", ""), "Error adding host. Can not add host to 'group'");
+    row(
+        "group",
+        [](DhcpdConfigModel &model, const QModelIndex &parent) {
+            model.addBind9(words("zone|a.|primary|127.0.0.1|key|k"), parent);
+        },
+        "Error adding bind9. Can not add bind9 to 'group'");
+    row(
+        "pool", [](DhcpdConfigModel &model, const QModelIndex &parent) { model.addDeclaration(words("a|b"), parent); },
+        "Error adding declaration. Can not add declaration to 'pool'");
+}
+
+void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead()
+{
+    QFETCH(QString, holder);
+    QFETCH(EditCase::Edit, edit);
+    QFETCH(QString, error);
+
+    EditedModel deep{nestedBlocks(maximumBlockDepth - 1, qPrintable(holder))};
+    edit(deep.model(), innermost(deep.model()));
+    deep.verifyChange(1);
+    verifyIsReadAgain(deep);
+
+    const auto deepest = nestedBlocks(maximumBlockDepth, qPrintable(holder));
+    EditedModel refused{deepest};
+    edit(refused.model(), innermost(refused.model()));
+    refused.verifyRefusal(error);
+    QCOMPARE(refused.outline(), EditedModel{deepest}.outline());
+}
+
+void TestDeclarationEdits::addsLinesToTheDeepestBlock_data()
+{
+    QTest::addColumn<QString>("holder");
+    QTest::addColumn<EditCase::Edit>("edit");
+
+    QTest::addRow("range") << text("subnet 10.0.0.0 netmask 255.0.0.0") << addRange("10.0.0.1", "10.0.0.2");
+    QTest::addRow("fixed address") << text("host a") << addFixedAddress("10.0.0.1");
+    QTest::addRow("parameter") << text("pool") << addWords(&DhcpdConfigModel::addParameter, words("a|b"));
+}
+
+void TestDeclarationEdits::addsLinesToTheDeepestBlock()
+{
+    QFETCH(QString, holder);
+    QFETCH(EditCase::Edit, edit);
+    EditedModel edited{nestedBlocks(maximumBlockDepth, qPrintable(holder))};
+    edit(edited.model(), innermost(edited.model()));
+    edited.verifyChange(1);
+    verifyIsReadAgain(edited);
 }
 
 void TestDeclarationEdits::computesDefaultRange_data()
