@@ -4,13 +4,12 @@
 
 bool DhcpdConfigModel::removeRows(int row, int count, const QModelIndex &parent)
 {
-    DhcpdConfigStatement *const statement{statementFor(parent)};
-    const bool inRange{row >= 0 && count >= 0 && count <= statement->childCount() - row};
-    if (!inRange)
+    DhcpdConfigDeclaration *const declaration{declarationFor(parent)};
+    if (!declaration || row < 0 || count < 0 || count > declaration->childCount() - row)
         return false;
     if (count > 0) {
         beginRemoveRows(parent, row, row + count - 1);
-        statement->removeChildren(row, count);
+        declaration->removeChildren(row, count);
         endRemoveRows();
     }
     setModified();
