@@ -28,10 +28,12 @@ DhcpdConfigModel::DhcpdConfigModel(const QStringList &headerLabels, QObject *par
 
 QModelIndex DhcpdConfigModel::index(int row, int column, const QModelIndex &parent) const
 {
-    // As hasIndex(), but column 0 does not count the words of the parent: a view asks for it for every row.
-    if (row < 0 || row >= rowCount(parent) || column < 0 || (column > 0 && column >= columnCount(parent)))
+    // As hasIndex(), but without counting the words of the parent for column 0: a view asks for it for every row.
+    const DhcpdConfigStatement &holder{*statementFor(parent)};
+    const bool hasColumn{column == 0 ? !holder.words().isEmpty() : column > 0 && column < columnCount(parent)};
+    if (row < 0 || row >= rowCount(parent) || !hasColumn)
         return {};
-    DhcpdConfigStatement *const child{statementFor(parent)->child(row)};
+    DhcpdConfigStatement *const child{holder.child(row)};
     return child ? createIndex(row, column, child) : QModelIndex{};
 }
 

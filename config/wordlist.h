@@ -58,6 +58,7 @@ public:
     WordList() = default;
     explicit WordList(const Buffer &words);
 
+    bool isEmpty() const { return !m_block; }
     /// Counts the words: takes time in proportion to their number.
     int count() const;
     /// The word at `index`; empty when there is none.

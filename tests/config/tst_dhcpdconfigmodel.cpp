@@ -95,6 +95,7 @@ private slots:
     void knowsParents();
     void countsColumnsByWords();
     void refusesIndexesThatAreNotThere();
+    void hasTheIndexesThatItsCountsPromise();
     void showsHeaderLabels();
     void showsTexts();
     void showsIcons_data();
@@ -226,6 +227,36 @@ void DhcpdConfigModelTest::refusesIndexesThatAreNotThere()
     QVERIFY(!m_model->index(3, 0, allNetwork()).isValid());
     QVERIFY(!m_model->index(0, 0, m_model->index(0, 0, allNetwork())).isValid());
     QVERIFY(m_model->index(0, 3, m_model->index(1, 0, allNetwork())).isValid());
+}
+
+// Compares index() and parent() with the counts of rows and columns under every cell, one beyond each end.
+void DhcpdConfigModelTest::hasTheIndexesThatItsCountsPromise()
+{
+    QVERIFY(m_model->parse(QStringLiteral("a; b c d e { f g; h { i j k; range 1 2; } } group { l m; }")));
+    QVERIFY(m_model->parse(QStringLiteral("a b { c; }")));
+    QVERIFY(m_model->replaceWords(m_model->index(2, 0, allNetwork()), {})); // the group has no words now
+    QVector<QModelIndex> parents{QModelIndex{}};
+    int valid{};
+    for (int i{}; i < parents.size(); ++i) {
+        const QModelIndex parent{parents.at(i)};
+        const DhcpdConfigStatement &statement{*m_model->statementFor(parent)};
+        for (int row{-1}; row <= statement.childCount(); ++row) {
+            for (int column{-1}; column <= statement.wordCount(); ++column) {
+                const QModelIndex index{m_model->index(row, column, parent)};
+                QCOMPARE(index.isValid(), m_model->hasIndex(row, column, parent));
+                if (!index.isValid())
+                    continue;
+                ++valid;
+                QCOMPARE(index.row(), row);
+                QCOMPARE(index.column(), column);
+                QCOMPARE(m_model->statementFor(index), statement.child(row));
+                QCOMPARE(m_model->parent(index), parent);
+                parents += index;
+            }
+        }
+    }
+    // The two top rows, then each child as often as its parent has words.
+    QCOMPARE(valid, 2 * 2 + 3 * 2 + 2 * 4 + 2 * 2 + 1 * 2 + 1 * 2);
 }
 
 void DhcpdConfigModelTest::showsHeaderLabels()
