@@ -173,6 +173,20 @@ QStringList keptHeading(Block block, const QStringList &words)
     return {zoneKeyword, name};
 }
 
+bool dropsStatement(const QString &word)
+{
+    static const QStringList words{QStringLiteral("type"), QStringLiteral("file"), QStringLiteral("allow-update")};
+    return words.contains(word);
+}
+
+// Whether statements() would misread a value that stands without quotes: some words mean the same to it wherever they
+// stand, and a slash starts a comment.
+bool needsQuotes(const QString &value)
+{
+    return dropsStatement(value) || value == zoneKeyword ||
+           (value.contains(QLatin1Char{'/'}) && !value.contains(quote));
+}
+
 // Appends a statement of two words; false when there is none, or when statements() would not keep it together.
 bool appendStatement(QString &text, const QStringList &words, QChar delimiter)
 {
@@ -181,8 +195,8 @@ bool appendStatement(QString &text, const QStringList &words, QChar delimiter)
         std::none_of(value.cbegin(), value.cend(), [](QChar c) { return isBlank(c) || isDelimiter(c); })};
     if (value.isEmpty() || !isWhole)
         return false;
-    if (value.contains(QLatin1Char{'/'}) && !value.contains(quote))
-        value = quote + value + quote; // else it would start a comment
+    if (needsQuotes(value))
+        value = quote + value + quote;
     text += words.first() + QLatin1Char{' '} + value + delimiter + QLatin1Char{'\n'};
     return true;
 }
@@ -190,10 +204,9 @@ bool appendStatement(QString &text, const QStringList &words, QChar delimiter)
 // What a statement that ends with `delimiter` adds to the statement list.
 QStringList scannedStatement(QStringList words, QChar delimiter)
 {
-    static const QStringList dropped{QStringLiteral("type"), QStringLiteral("file"), QStringLiteral("allow-update")};
     while (words.size() < 2)
         words += QString{};
-    if (std::any_of(dropped.cbegin(), dropped.cend(), [&words](const QString &word) { return words.contains(word); }))
+    if (std::any_of(words.cbegin(), words.cend(), dropsStatement))
         return delimiter == QLatin1Char{'}'} ? words : QStringList{}; // deliberately not dropped before a closing brace
     if (words.contains(zoneKeyword)) {
         words[1] = bind9::unquoted(words.at(1)) + dot;

@@ -184,6 +184,15 @@ void TestBind9Reader::keepsZonesAndKeys_data()
     row("updaters outside a zone", "options { allow-update { key k; }; }; allow-update { key k; };", "");
     row("slash in a word without quotes", "key k { algorithm a; secret YS9i/Yw==; };",
         "key|k|algorithm|a|secret|\"YS9i/Yw==\"");
+    row("zone named like a keyword",
+        "zone file { allow-update { key k; }; }; zone \"type\" { }; zone zone { }; zone \"allow-update.\" IN { };",
+        "zone|file.|primary|127.0.0.1|key|k|zone|type.|primary|127.0.0.1|zone|zone.|primary|127.0.0.1"
+        "|zone|allow-update.|primary|127.0.0.1");
+    row("key named like a keyword",
+        R"(zone a { allow-update { key file; key "type"; key zone; }; update-policy { grant allow-update self b; }; };)"
+        R"(key file { algorithm a; secret s; }; key zone { algorithm type; secret "s"; };)",
+        R"(zone|a.|primary|127.0.0.1|key|"file"|key|"type"|key|"zone"|key|"allow-update")"
+        R"(|key|"file"|algorithm|a|secret|s|key|"zone"|algorithm|"type"|secret|"s")");
     row("delimiters between quotes", "options { version \"zone a { allow-update { key k; }; };\"; };", "");
     row("name with a blank", R"(zone "a b" { allow-update { key k; }; }; key "c;d" { algorithm a; secret s; };)", "");
     row("carriage returns", "zone a {\r\nallow-update {\r\nkey k;\r\n};\r\n};\r\n", "zone|a.|primary|127.0.0.1|key|k");

@@ -252,6 +252,10 @@ void TestVerdict::judges_data()
         addBind9(bind9File)(model, parent);
         addBind9(bind9File)(model, parent);
     });
+    accepted("bind9 names like keywords", "",
+             addBind9("key file { algorithm hmac-sha256; secret \"Zm9v\"; };"
+                      "key zone { algorithm hmac-sha256; secret \"Zm9v\"; };"
+                      "zone type { allow-update { key \"file\"; }; }; zone zone { allow-update { key zone; }; };"));
     accepted("bind9 zone of a known key", "", addBind9(R"(zone "a.org" { allow-update { key "KNOWN"; }; };)"));
 
     // What the model takes, deliberately, although the server does not. The names and addresses are as the user typed
