@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <cstring>
 #include <iterator>
+#include <utility>
 
 namespace {
 
@@ -155,6 +156,7 @@ QString LeaseTimeTexts::text(LeaseTime time)
 QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
 {
     heedLocale();
+    heedZone();
     if (!m_timesOfDay) {
         m_timesOfDay.emplace(m_locale);
     }
@@ -179,6 +181,17 @@ void LeaseTimeTexts::heedLocale()
     if (const QLocale locale; locale != m_locale) {
         m_locale = locale;
         m_dates.clear();
+        m_timesOfDay.reset();
+    }
+}
+
+/// Once a second, which is when the name changes, for the locale takes microseconds to tell.
+void LeaseTimeTexts::heedZone()
+{
+    const std::time_t now{std::time(nullptr)};
+    const QTime example{0, 0};
+    if (std::exchange(m_zoneHeeded, now) != now && m_timesOfDay &&
+        m_timesOfDay->text(example) != m_locale.toString(example, QLocale::LongFormat)) {
         m_timesOfDay.reset();
     }
 }

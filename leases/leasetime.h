@@ -8,6 +8,7 @@
 #include <QTime>
 
 #include <array>
+#include <ctime>
 #include <optional>
 #include <string_view>
 
@@ -79,7 +80,8 @@ private:
     std::array<QString, 60> m_seconds;
 };
 
-/// The texts of times in the default locale: its long time, a separator and its narrow date. The locale takes
+/// The texts of times in the default locale: its long time, a separator and its narrow date. Long times usually name
+/// the local zone, as it is called when the text is made: with daylight saving time or without. The locale takes
 /// microseconds a text and the distinct ones are few, so they are remembered.
 class LeaseTimeTexts final
 {
@@ -94,8 +96,10 @@ public:
 
 private:
     void heedLocale();
+    void heedZone();
 
     QLocale m_locale;
     QHash<quint32, QString> m_dates;
     std::optional<TimeOfDayTexts> m_timesOfDay;
+    std::time_t m_zoneHeeded{};
 };

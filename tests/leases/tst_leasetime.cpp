@@ -49,6 +49,7 @@ private slots:
     void isShownInTheDefaultLocale();
     void hasNoTextIfInvalid();
     void remembersNoWrongTexts();
+    void namesTheZoneAsItIsCalledNow();
     void knowsAllTimesOfDayInAllLocales();
 };
 
@@ -179,6 +180,16 @@ void TestLeaseTime::remembersNoWrongTexts()
         QVERIFY(texts.text(parsed(date, "13:04:05")).endsWith(QLocale{}.toString(day, QLocale::NarrowFormat)));
     }
     QCOMPARE(texts.text(time), german);
+}
+
+void TestLeaseTime::namesTheZoneAsItIsCalledNow()
+{
+    LeaseTimeTexts texts;
+    const LeaseTime time{parsed("2026/01/02", "13:04:05")};
+    const LocalZone winter{"CET-1"};
+    QCOMPARE(texts.text(time), QStringLiteral("13:04:05 CET 2 Jan 2026"));
+    const LocalZone summer{"CEST-2"};
+    QTRY_COMPARE(texts.text(time), QStringLiteral("13:04:05 CEST 2 Jan 2026"));
 }
 
 void TestLeaseTime::knowsAllTimesOfDayInAllLocales()
