@@ -126,11 +126,13 @@ bool LeaseReader::readOn(const LeaseFile &file)
 /// Keeps samples of the bytes that stand at m_position in the file.
 void LeaseReader::remember(std::string_view bytes)
 {
-    const auto size{static_cast<int>(bytes.size())};
     if (m_samples.empty() || m_position >= m_samples.back().offset + sampleDistance) {
-        const int kept{m_samples.empty() ? comparedAtEnds : sampleSize};
-        m_samples.push_back({m_position, QByteArray{bytes.data(), std::min(kept, size)}});
+        m_samples.push_back({m_position, {}});
     }
-    m_lastBytes += QByteArray::fromRawData(bytes.data(), size).right(comparedAtEnds);
+    const auto read{QByteArray::fromRawData(bytes.data(), static_cast<int>(bytes.size()))};
+    QByteArray &sample{m_samples.back().bytes};
+    // One that is not full yet ends where these bytes begin.
+    sample += read.left((m_samples.size() == 1 ? comparedAtEnds : sampleSize) - sample.size());
+    m_lastBytes += read.right(comparedAtEnds);
     m_lastBytes = m_lastBytes.right(comparedAtEnds);
 }

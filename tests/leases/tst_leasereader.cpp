@@ -21,6 +21,8 @@ private slots:
     void endsWhereTheFileWasCut();
     void readsTheOpenedFileAfterItWasReplaced();
     void isNotContinuedByAnother();
+    void noticesChangesInWhatCameInSmallPieces_data();
+    void noticesChangesInWhatCameInSmallPieces();
 
 private:
     std::unique_ptr<QTemporaryDir> m_folder;
@@ -102,6 +104,33 @@ void TestLeaseReader::isNotContinuedByAnother()
     m_reader.clear();
     QVERIFY(!m_reader.continues(LeaseFile{m_path}));
     QCOMPARE(m_table.size(), 0);
+}
+
+void TestLeaseReader::noticesChangesInWhatCameInSmallPieces_data()
+{
+    constexpr int sampleDistance{1 << 20};
+    QTest::addColumn<QVector<int>>("sizes"); // of the file each time that it is read
+    QTest::addColumn<int>("changed");        // the offset of a byte that is another then
+    QTest::addRow("beginning") << QVector<int>{1, 20'000} << 1000;
+    QTest::addRow("last compared byte of the beginning") << QVector<int>{1, 2, 4000, 4095, 20'000} << 4095;
+    QTest::addRow("sample") << QVector<int>{sampleDistance, sampleDistance + 10, sampleDistance + 20'000}
+                            << sampleDistance + 40;
+}
+
+void TestLeaseReader::noticesChangesInWhatCameInSmallPieces()
+{
+    QFETCH(const QVector<int>, sizes);
+    QFETCH(const int, changed);
+    QByteArray text(sizes.last(), '#');
+    for (const int size : sizes) {
+        writeTestFile(m_path, text.left(size));
+        QVERIFY(m_reader.readOn(LeaseFile{m_path}));
+        QCOMPARE(m_reader.position(), qint64{size});
+    }
+    QVERIFY(m_reader.continues(LeaseFile{m_path}));
+    text[changed] = '!';
+    writeTestFile(m_path, text);
+    QVERIFY(!m_reader.continues(LeaseFile{m_path}));
 }
 
 QTEST_GUILESS_MAIN(TestLeaseReader)
