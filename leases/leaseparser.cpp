@@ -220,6 +220,9 @@ void LeaseParser::feed(std::string_view bytes)
 
 void LeaseParser::finish()
 {
+    if (m_beforeUnfinished) { // the line was taken, and nothing was fed since
+        return;
+    }
     m_beforeUnfinished = m_values;
     m_blockEnded = false;
     readLine(m_unfinished);

@@ -28,7 +28,7 @@ public:
     /// Takes the next piece of the text; its leases are pending in the table.
     void feed(std::string_view bytes);
 
-    /// Takes what follows the last line feed as a line, for there is no more text now.
+    /// Takes what follows the last line feed as a line, for there is no more text now; once until more is fed.
     void finish();
 
     /// Whether the table holds after finish() what more text can be added to. Not so if a line that was not complete

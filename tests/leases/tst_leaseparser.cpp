@@ -49,6 +49,7 @@ private slots:
     void readsTheSameInPieces();
     void readsTheSameCutAnywhere();
     void continuesAfterTheEnd();
+    void finishesOnceUntilMoreIsFed();
     void readsVeryLongTexts();
     void sortsInBetweenWithoutLoss();
 };
@@ -315,6 +316,37 @@ void TestLeaseParser::continuesAfterTheEnd()
         QVERIFY2(rowsOf(table) == referenceRows(file), file.constData());
     }
     QVERIFY(continued > 100);
+}
+
+/// The line that is cut sets the end of the lease; as a whole it sets the state instead.
+void TestLeaseParser::finishesOnceUntilMoreIsFed()
+{
+    const QByteArray first{"lease 10.0.0.1 {\n  ends 6 2026/11/21 01:15:30;\n}\nlease 10.0.0.2 {\n"};
+    const QByteArray cut{"  ends 6 2026/11/22 01:15:30;"};
+    const QByteArray rest{" binding state\n}\n"};
+    LeaseTable table;
+    LeaseParser parser{table};
+    const auto feed{[&parser](const QByteArray &text) {
+        parser.feed({text.constData(), static_cast<std::size_t>(text.size())});
+    }};
+    feed(first + cut);
+    parser.finish();
+    parser.finish();
+    QVERIFY(parser.canContinue());
+    feed(rest);
+    parser.finish();
+    table.settleAll();
+    QCOMPARE(rowsOf(table), referenceRows(first + cut + rest));
+
+    // A block that such a line ends is taken once.
+    parser.clear();
+    feed("}");
+    parser.finish();
+    parser.finish();
+    QVERIFY(!parser.canContinue());
+    QCOMPARE(table.size(), 0);
+    table.settleNext();
+    QVERIFY(!table.hasPending());
 }
 
 void TestLeaseParser::readsVeryLongTexts()
