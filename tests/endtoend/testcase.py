@@ -1,0 +1,75 @@
+# SPDX-License-Identifier: GPL-3.0-or-later
+"""What the tests of the program in a private network have in common."""
+
+import functools
+import unittest
+
+import desktop
+import machine
+
+
+def keeping_picture(test):
+    @functools.wraps(test)
+    def run(self):
+        try:
+            test(self)
+            self.finish()
+        except BaseException:
+            desktop.keep_picture(self.id())
+            raise
+
+    return run
+
+
+class PictureTest(unittest.TestCase):
+    """Keeps a picture of the display when a test fails."""
+
+    def __init_subclass__(cls, **options):
+        super().__init_subclass__(**options)
+        for name, test in list(vars(cls).items()):
+            if name.startswith("test"):
+                setattr(cls, name, keeping_picture(test))
+
+    def finish(self):
+        """What is checked at the end of every test."""
+
+
+class ProgramTest(PictureTest):
+    """Each test has the machine as it was at first, and the program freshly started on it.
+
+    A class or test that needs the machine otherwise than at first changes it in prepare().
+    """
+
+    def setUp(self):
+        machine.reset()
+        self.prepare()
+        self.start()
+
+    def prepare(self):
+        """What happens to the machine before the program starts."""
+
+    def start(self):
+        self.program = desktop.Program()
+        self.addCleanup(self.program.end)
+        self.main = self.program.window(desktop.MAIN_TITLE)
+
+    def finish(self):
+        self.assertEqual([self.program.describe(window) for window in self.program.unknown()], [])
+
+    @property
+    def tree(self):
+        return self.main.find("tree", "Topology")
+
+    def wait(self, condition, what):
+        """Waits until the condition holds; WHAT names it where that does not happen."""
+        return self.program.wait(condition, lambda: what)
+
+    def message(self, title, text, *, informative_text="", buttons=("OK",), default="OK"):
+        """A message box that has opened, which must be as described."""
+        box = self.program.window(title)
+        self.assertEqual(box.role, "alert")
+        self.assertEqual(box.text, text)
+        self.assertEqual(box.informative_text, informative_text)
+        self.assertEqual(box.buttons, list(buttons))
+        self.assertEqual(box.default_button, default)
+        return box
