@@ -69,6 +69,8 @@ FileDescriptor &FileDescriptor::operator=(FileDescriptor &&other) noexcept
     return *this;
 }
 
+int FileDescriptor::release() { return std::exchange(m_descriptor, -1); }
+
 namespace posix {
 
 std::error_code lastError() { return {errno, std::generic_category()}; }
@@ -82,8 +84,10 @@ FileDescriptor openAt(int directory, const QByteArray &name, int flags, mode_t m
 QVector<QByteArray> entries(int directory)
 {
     QVector<QByteArray> names;
-    const int descriptor{retried([&] { return openat(directory, ".", O_RDONLY | O_DIRECTORY | O_CLOEXEC); })};
-    const std::unique_ptr<DIR, int (*)(DIR *)> stream{fdopendir(descriptor), closedir};
+    FileDescriptor readable{openAt(directory, QByteArrayLiteral("."), O_RDONLY | O_DIRECTORY)};
+    const std::unique_ptr<DIR, int (*)(DIR *)> stream{fdopendir(readable.get()), closedir};
+    if (stream)
+        readable.release(); // the stream closes it
     while (const dirent *const entry = stream ? readdir(stream.get()) : nullptr)
         names.append(entry->d_name);
     return names;

@@ -23,6 +23,8 @@ public:
 
     bool isOpen() const { return m_descriptor >= 0; }
     int get() const { return m_descriptor; }
+    /// The descriptor, for another owner to close.
+    int release();
 
 private:
     int m_descriptor;

@@ -14,6 +14,7 @@
 #include <QTest>
 #include <QThread>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <csignal>
@@ -220,6 +221,7 @@ private slots:
 
     void createsWithTheUsersMask_data();
     void createsWithTheUsersMask();
+    void leavesNothingOpenWhereFoldersCannotBeListed();
     void replacesWithAnyBytes_data();
     void replacesWithAnyBytes();
     void keepsMode_data();
@@ -425,6 +427,33 @@ void FileIoTest::createsWithTheUsersMask()
     QCOMPARE(readTestFile(paths::configuration()), newContent);
     QCOMPARE(statusOf(paths::configuration()).st_mode & 07777U, mode);
     QCOMPARE(namesIn(directory()), QStringList{QStringLiteral("dhcpd.conf")});
+}
+
+// Folders are listed only to clear up after earlier saves, so that a save succeeds without.
+void FileIoTest::leavesNothingOpenWhereFoldersCannotBeListed()
+{
+    writeTestFile(paths::configuration(), oldContent);
+    const auto openFiles = [] {
+        std::array<FileStatus, 100> statuses{};
+        int descriptor{};
+        return std::count_if(statuses.begin(), statuses.end(),
+                             [&descriptor](FileStatus &status) { return fstat(descriptor++, &status) == 0; });
+    };
+    const auto save = [&] {
+        const auto before = openFiles();
+        return fileio::replaceFile(paths::configuration(), newContent) && openFiles() == before ? 0 : 1;
+    };
+    // Of what a save calls, only the opening of a directory's stream asks for the flags of a descriptor.
+    int refused{};
+    const syscalljudge::Outcome outcome{syscalljudge::run(save, [&](int call, int) {
+        refused += call == SYS_fcntl ? 1 : 0;
+        return call == SYS_fcntl ? ENOMEM : unlessSync(call);
+    })};
+    if (!outcome.unsupported.isEmpty())
+        QSKIP(qPrintable(outcome.unsupported));
+    QVERIFY(refused > 0);
+    QCOMPARE(outcome.result, 0);
+    QCOMPARE(contentOf(paths::configuration()), newContent);
 }
 
 void FileIoTest::replacesWithAnyBytes_data() { readsAnyBytes_data(); }
