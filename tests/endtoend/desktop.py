@@ -334,7 +334,18 @@ class Menu(Control):
         return [None if entry.role == "separator" else entry.name for entry in self.children]
 
     def entry(self, name):
-        return self.find("menu item", name)
+        """The entry of the name. Waits for it."""
+
+        def found():
+            entries, top = self.children, self.box[1]
+            for entry in entries:
+                height = entry.box[3]
+                if entry.name == name:
+                    return MenuEntry(self, entry.accessible, top, height)
+                top += height
+            return None
+
+        return self.program.wait(found, lambda: f"the entry {name!r} in {self.entries}")
 
     def choose(self, *entries):
         """Walks into submenus with the mouse and clicks the last entry."""
@@ -346,6 +357,30 @@ class Menu(Control):
 
     def submenu(self, name):
         return self.entry(name).open_menu()
+
+
+class MenuEntry(Control):
+    """An entry of an open menu.
+
+    The toolkit has one object for an action that is in several menus, whose state and place are those in the first.
+    """
+
+    def __init__(self, menu, accessible, top, height):
+        super().__init__(menu.program, accessible)
+        self.menu, self.top, self.height = menu, top, height
+
+    @property
+    def is_showing(self):
+        return self.menu.is_showing
+
+    @property
+    def box(self):
+        x, _, width, _ = self.menu.box
+        return Box((x, self.top, width, self.height))
+
+    @property
+    def window(self):
+        return self.menu
 
 
 class Row:
