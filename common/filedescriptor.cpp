@@ -2,7 +2,6 @@
 #include "common/filedescriptor.h"
 
 #include <algorithm>
-#include <limits>
 #include <memory>
 #include <new>
 #include <utility>
@@ -17,11 +16,10 @@ namespace {
 // How much a file may grow while it is read before the rest is left for a later reading.
 constexpr qint64 growthLimit{16LL * 1024 * 1024};
 constexpr qint64 growthStep{64LL * 1024};
-constexpr qint64 largestArray{std::numeric_limits<int>::max() - 64}; // QByteArray counts in int
 
-std::error_code readRegular(int descriptor, qint64 size, QByteArray &content)
+std::error_code readRegular(int descriptor, qint64 size, QByteArray &content, qint64 largest)
 {
-    const qint64 limit{std::min(size + growthLimit, largestArray)};
+    const qint64 limit{std::min(size + growthLimit, largest)};
     qint64 length{};
     content = QByteArray{static_cast<int>(std::min(size + growthStep, limit)), Qt::Uninitialized};
     while (length < limit) {
@@ -93,7 +91,7 @@ QVector<QByteArray> entries(int directory)
     return names;
 }
 
-std::error_code readAll(int descriptor, QByteArray &content)
+std::error_code readAll(int descriptor, QByteArray &content, qint64 limit)
 {
     FileStatus status{};
     if (fstat(descriptor, &status) < 0)
@@ -106,10 +104,10 @@ std::error_code readAll(int descriptor, QByteArray &content)
     }
     if (!S_ISREG(status.st_mode))
         return std::make_error_code(std::errc::operation_not_supported);
-    if (status.st_size > largestArray)
+    if (status.st_size > limit)
         return std::make_error_code(std::errc::file_too_large);
     try {
-        return readRegular(descriptor, status.st_size, content);
+        return readRegular(descriptor, status.st_size, content, limit);
     } catch (const std::bad_alloc &) {
         return std::make_error_code(std::errc::not_enough_memory);
     }

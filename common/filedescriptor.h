@@ -5,6 +5,7 @@
 #include <QVector>
 
 #include <cerrno>
+#include <limits>
 #include <system_error>
 
 #include <sys/stat.h>
@@ -52,8 +53,11 @@ FileDescriptor openAt(int directory, const QByteArray &name, int flags, mode_t m
 /// The names in `directory`, in no order; none when it cannot be read.
 QVector<QByteArray> entries(int directory);
 
-/// Reads a regular file from its start, or a device that is empty (as /dev/null is); other kinds are refused.
-std::error_code readAll(int descriptor, QByteArray &content);
+constexpr qint64 largestContent{std::numeric_limits<int>::max() - 64}; // QByteArray counts in int
+
+/// Reads a regular file from its start, or a device that is empty (as /dev/null is); other kinds are refused, and files
+/// that have more bytes than `limit`.
+std::error_code readAll(int descriptor, QByteArray &content, qint64 limit = largestContent);
 
 /// Writes the whole of `content` to the start of a regular file; what follows there stays.
 std::error_code writeAll(int descriptor, const QByteArray &content);

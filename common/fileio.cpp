@@ -5,6 +5,7 @@
 #include "common/fileattributes.h"
 #include "common/filedescriptor.h"
 #include "common/temporaryfile.h"
+#include "common/textencoding.h"
 
 #include <QCoreApplication>
 #include <QDir>
@@ -265,7 +266,8 @@ std::optional<QByteArray> readFile(const QString &path, QString *reason)
 {
     const FileDescriptor file{posix::openAt(AT_FDCWD, QFile::encodeName(path), O_RDONLY)};
     QByteArray content;
-    const std::error_code error{file.isOpen() ? posix::readAll(file.get(), content) : posix::lastError()};
+    const std::error_code error{file.isOpen() ? posix::readAll(file.get(), content, TextEncoding::longestText)
+                                              : posix::lastError()};
     if (!error)
         return content;
     report(text(error), reason);

@@ -9,8 +9,9 @@
 /// Reading and replacing whole files; the one place where the program writes to the machine's files.
 namespace fileio {
 
-/// The whole content of the file at `path`. Nothing when it cannot be read (also a directory or a pipe), with the
-/// system's reason in `reason` if given. Never waits; of a file that grows meanwhile, at least what it held at first.
+/// The whole content of the file at `path`. Nothing when it cannot be read (also a directory or a pipe) or is longer
+/// than a text may be, with the system's reason in `reason` if given. Never waits; of a file that grows meanwhile, at
+/// least what it held at first.
 std::optional<QByteArray> readFile(const QString &path, QString *reason = nullptr);
 
 /// Replaces the content of the file at `path`, or creates it: afterwards it holds wholly the old or wholly the new

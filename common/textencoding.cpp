@@ -7,6 +7,7 @@
 #include <array>
 #include <cstdint>
 #include <cstring>
+#include <limits>
 #include <numeric>
 
 #include <langinfo.h>
@@ -149,6 +150,9 @@ QByteArray encodedWithGaps(QTextCodec *codec, const QString &text)
     const int half{text.size() / 2 + (isPairAt(text, text.size() / 2 - 1) ? 1 : 0)};
     return encodedWithGaps(codec, text.left(half)) + encodedWithGaps(codec, text.mid(half));
 }
+
+// One byte of a text takes two in a QString, and up to three as UTF-8.
+static_assert(qint64{3} * TextEncoding::longestText < std::numeric_limits<int>::max());
 
 QTextCodec *utf8Codec() { return QTextCodec::codecForMib(utf8Mib); }
 

@@ -14,6 +14,10 @@ class QTextCodec;
 class TextEncoding final
 {
 public:
+    /// The most bytes that a text may have: whatever they are, the text fits into a QString, and as UTF-8 into a
+    /// QByteArray.
+    static constexpr int longestText{1 << 29};
+
     /// UTF-8: the encoding of a file that does not exist yet.
     TextEncoding() = default;
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/configwriter.h"
 
+#include "common/textencoding.h"
 #include "config/dhcpdconfigdeclaration.h"
 
 #include <algorithm>
@@ -10,7 +11,7 @@
 namespace {
 
 // Deep nesting makes a long text of a short file: each line is indented.
-constexpr qint64 maximumBytes{1 << 30};
+constexpr qint64 maximumBytes{TextEncoding::longestText};
 
 /// What is written so far; null once it is longer than the maximum or blocks are nested too deep.
 using Text = QByteArray;

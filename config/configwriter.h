@@ -6,5 +6,5 @@
 #include <QByteArray>
 
 /// The text (in UTF-8) of `statement` and everything under it, as it stands in a configuration file; null when it could
-/// not be read again: when it would be longer than 1 GiB, or blocks nested deeper than maximumBlockDepth.
+/// not be read again: when it would be longer than a text may be, or blocks nested deeper than maximumBlockDepth.
 QByteArray serialize(const DhcpdConfigStatement &statement);

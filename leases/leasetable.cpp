@@ -29,8 +29,7 @@ quint32 placeOf(quint64 key) { return static_cast<quint32>(key); }
 
 QByteArray leaseBytes(std::string_view text)
 {
-    constexpr std::size_t mostThatQtTakes{std::size_t{1} << 29U};
-    return {text.data(), static_cast<int>(std::min(text.size(), mostThatQtTakes))};
+    return {text.data(), static_cast<int>(std::min(text.size(), std::size_t{TextEncoding::longestText}))};
 }
 
 QString decodeLeaseText(std::string_view text)

@@ -3,6 +3,7 @@
 
 #include "common/filedescriptor.h"
 #include "common/paths.h"
+#include "common/textencoding.h"
 #include "tests/common/childprocess.h"
 #include "tests/support/temporaryroot.h"
 
@@ -213,7 +214,7 @@ private slots:
     void refusesToRead();
     void readsTheEmptyDevice();
     void readsAFileWhoseSizeIsNotKnown();
-    void refusesAFileTooLargeToHold();
+    void refusesAFileThatIsTooLong();
     void refusesAFileWithoutPermission();
     void endsReadingAFileThatGrows();
     void readsThroughInterruptions();
@@ -337,13 +338,15 @@ void FileIoTest::readsAFileWhoseSizeIsNotKnown()
     QVERIFY(content && content->startsWith("Name:") && content->endsWith('\n'));
 }
 
-void FileIoTest::refusesAFileTooLargeToHold()
+void FileIoTest::refusesAFileThatIsTooLong()
 {
     writeTestFile(paths::configuration(), "x");
-    QCOMPARE(truncate(local(paths::configuration()).constData(), off_t{3} << 30), 0);
-    QString reason;
-    QVERIFY(!fileio::readFile(paths::configuration(), &reason));
-    QCOMPARE(reason, errorText(EFBIG));
+    for (const off_t size : {off_t{TextEncoding::longestText} + 1, off_t{3} << 30}) {
+        QCOMPARE(truncate(local(paths::configuration()).constData(), size), 0);
+        QString reason;
+        QVERIFY(!fileio::readFile(paths::configuration(), &reason));
+        QCOMPARE(reason, errorText(EFBIG));
+    }
 }
 
 void FileIoTest::refusesAFileWithoutPermission()

@@ -370,11 +370,14 @@ void DhcpdConfigModelTest::readRefuses_data()
     QTest::addRow("missing folder") << QStringLiteral("/missing/dhcpd.conf");
     QTest::addRow("folder") << QStringLiteral("/etc/dhcp");
     QTest::addRow("blocks nested too deep") << QStringLiteral("/deep.conf");
+    QTest::addRow("too long for a text") << QStringLiteral("/long.conf");
 }
 
 void DhcpdConfigModelTest::readRefuses()
 {
     writeTestFile(m_root->path(QStringLiteral("/deep.conf")), QByteArray{"a {"}.repeated(501));
+    writeTestFile(m_root->path(QStringLiteral("/long.conf")), "a b;\n");
+    QVERIFY(QFile::resize(m_root->path(QStringLiteral("/long.conf")), qint64{1} << 30)); // of holes
     QFETCH(QString, path);
     path = m_root->path(path);
     const Signals sent{*m_model};
