@@ -60,18 +60,59 @@ def server_is_running():
 
 
 def server_pid():
-    return int(pathlib.Path("/run/dhcpd.pid").read_text())
+    """None while there is none."""
+    try:
+        return int(pathlib.Path("/run/dhcpd.pid").read_text())
+    except (FileNotFoundError, ValueError):
+        return None
+
+
+def server_command():
+    """The words that the server was started with; none when it is not there."""
+    try:
+        return pathlib.Path(f"/proc/{server_pid()}/cmdline").read_text().split("\0")[:-1]
+    except FileNotFoundError:
+        return []
+
+
+def journal():
+    """What the service has logged."""
+    path = SERVICE_RECORD / "journal"
+    return path.read_text() if path.exists() else ""
 
 
 # --- Its clients
 
 
-def network_client(verb, mac, *arguments):
-    """Has a machine on a wire join, ask, leave or tell its address; what it prints."""
-    result = run("network-client", verb, mac, *arguments)
-    if result.returncode:
-        raise AssertionError(f"network-client {verb} {mac}: {result.stdout}")
-    return result.stdout.strip()
+class Client:
+    """A machine on the wire of one of the server's interfaces. It asks for an address as soon as it is there."""
+
+    def __init__(self, mac, interface, host_name=None):
+        self.mac = mac
+        self.host_name = host_name
+        self.tell("join", interface, *([host_name] if host_name else []))
+
+    def tell(self, verb, *arguments):
+        result = run("network-client", verb, self.mac, *arguments)
+        if result.returncode:
+            raise AssertionError(f"network-client {verb} {self.mac}: {result.stdout}")
+        return result.stdout.strip()
+
+    def ask(self):
+        """Asks anew, for the address that it last had."""
+        self.tell("ask")
+
+    def leave(self):
+        self.tell("leave")
+
+    @property
+    def address(self):
+        """Its address; empty while it has none."""
+        return self.tell("address")
+
+    @property
+    def log(self):
+        return self.tell("log")
 
 
 # --- Files

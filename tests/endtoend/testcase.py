@@ -60,6 +60,24 @@ class ProgramTest(PictureTest):
     def tree(self):
         return self.main.find("tree", "Topology")
 
+    @property
+    def server_state(self):
+        """What the status bar says of the server."""
+        return self.main.find("status bar").find("label").name
+
+    def wait_for_server(self, state):
+        self.wait(lambda: self.server_state == f"DHCP-server is {state}", f"a server that is {state}")
+
+    def client(self, mac, interface, host_name=None):
+        """A machine that has newly come onto a wire, where it is for as long as the test."""
+        client = machine.Client(mac, interface, host_name)
+        self.addCleanup(client.leave)
+        return client
+
+    def wait_for_address(self, client):
+        """The address that the server gives to a client."""
+        return self.wait(lambda: client.address, f"an address for {client.mac}: {client.log}")
+
     def wait(self, condition, what):
         """Waits until the condition holds; WHAT names it where that does not happen."""
         return self.program.wait(condition, lambda: what)
