@@ -171,6 +171,9 @@ void FMain::setUpSearch()
 {
     m_ui->searchLease->addAction(themeIcon("edit-find"), QLineEdit::LeadingPosition);
     m_ui->searchLease->setClearButtonEnabled(true);
+    // Qt leaves its button without a text that could be said.
+    if (auto *clear = m_ui->searchLease->findChild<QAction *>(QStringLiteral("_q_qlineeditclearaction")))
+        clear->setText(tr("Clear the search"));
     connect(m_ui->searchLease, &QLineEdit::textChanged, this, &FMain::searchLease);
 
     struct StepButton

@@ -18,7 +18,11 @@ MultipleIpInputDialog::MultipleIpInputDialog(QWidget *parent)
 
 MultipleIpInputDialog::~MultipleIpInputDialog() = default;
 
-void MultipleIpInputDialog::setLabel(const QString &text) { m_ui->ipGroup->setTitle(text); }
+void MultipleIpInputDialog::setLabel(const QString &text)
+{
+    m_ui->ipGroup->setTitle(text);
+    m_ui->ipList->setAccessibleName(text);
+}
 
 void MultipleIpInputDialog::setIps(const QString &text)
 {

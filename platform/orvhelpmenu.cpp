@@ -27,6 +27,7 @@ void OrvHelpMenu::showManual()
         m_manual->setAttribute(Qt::WA_DeleteOnClose);
         m_manual->setWindowTitle(tr("Manual"));
         auto *text{new QTextBrowser};
+        text->setAccessibleName(m_manual->windowTitle());
         text->setHtml(manualPageHtml());
         auto *buttons{new QDialogButtonBox{QDialogButtonBox::Close}};
         connect(buttons, &QDialogButtonBox::rejected, m_manual, &QDialog::reject);

@@ -638,6 +638,10 @@ Möchten Sie fortfahren?</translation>
         <source>Add parameter</source>
         <translation>Parameter hinzufügen</translation>
     </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Suche leeren</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -929,6 +933,18 @@ Füllen Sie sie aus, um eine weitere hinzuzufügen.</translation>
     <message>
         <source> s</source>
         <translation> s</translation>
+    </message>
+    <message>
+        <source>Hours</source>
+        <translation>Stunden</translation>
+    </message>
+    <message>
+        <source>Minutes</source>
+        <translation>Minuten</translation>
+    </message>
+    <message>
+        <source>Seconds</source>
+        <translation>Sekunden</translation>
     </message>
 </context>
 <context>

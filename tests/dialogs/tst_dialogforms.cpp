@@ -105,6 +105,8 @@ private slots:
     void statementEditor();
     void tabGoesInReadingOrder_data();
     void tabGoesInReadingOrder();
+    void screenReaderSaysEveryField_data();
+    void screenReaderSaysEveryField();
     void fieldsShowWholeTexts_data();
     void fieldsShowWholeTexts();
     void routeColumnsShowWholeAddresses();
@@ -457,6 +459,23 @@ void DialogFormsTest::tabGoesInReadingOrder()
         driver::press(Qt::Key_Tab);
     }
     QCOMPARE(QApplication::focusWidget()->objectName(), fields.constFirst());
+}
+
+void DialogFormsTest::screenReaderSaysEveryField_data() { tabGoesInReadingOrder_data(); }
+
+void DialogFormsTest::screenReaderSaysEveryField()
+{
+    QFETCH(Maker, maker);
+    QFETCH(QStringList, fields);
+    const auto dialog = maker();
+    QSet<QString> said;
+    for (const QString &field : qAsConst(fields)) {
+        const auto *interface = QAccessible::queryAccessibleInterface(driver::find<QWidget>(*dialog, field));
+        const QString name = interface->text(QAccessible::Name);
+        QVERIFY2(std::any_of(name.begin(), name.end(), [](QChar sign) { return sign.isLetter(); }), qPrintable(field));
+        said.insert(name);
+    }
+    QCOMPARE(said.size(), fields.size());
 }
 
 void DialogFormsTest::fieldsShowWholeTexts_data()
