@@ -92,7 +92,7 @@ private:
 
     QProcess *m_process;
     ServerStates m_state{Updating};
-    QStringList m_fileLines;
+    QStringList m_fileLines; // with their terminators
     QMap<QString, bool> m_interfaces;
     TextEncoding m_fileEncoding;
     bool m_fileWasRead{};

@@ -15,21 +15,32 @@ namespace {
 
 const QLatin1String interfacesKey{"INTERFACESv4"};
 
-// The lines of `text` without their terminators, LF or CR LF; what follows the last terminator is a line if not empty.
-QStringList linesOf(QString text)
+// The lines of `text` with their terminators; what follows the last terminator is a line if not empty.
+QStringList linesOf(const QString &text)
 {
-    text.replace(QLatin1String("\r\n"), QLatin1String("\n"));
-    QStringList lines = text.split(QLatin1Char('\n'));
-    if (lines.constLast().isEmpty())
-        lines.removeLast();
+    QStringList lines;
+    for (int begin = 0; begin < text.size(); begin += lines.constLast().size()) {
+        const int end = text.indexOf(QLatin1Char('\n'), begin);
+        lines.append(text.mid(begin, end < 0 ? -1 : end + 1 - begin));
+    }
     return lines;
+}
+
+// What ends `line`: LF, CR LF, or nothing at the end of the file.
+QString terminatorOf(const QString &line)
+{
+    for (const QLatin1String terminator : {QLatin1String("\r\n"), QLatin1String("\n")}) {
+        if (line.endsWith(terminator))
+            return terminator;
+    }
+    return {};
 }
 
 // Replaces `pieces` by the names between the first quotes after the first equals sign of `line`. Where the line lacks
 // one of them it returns false and leaves in `pieces` what there is of the last split.
 bool splitInterfacesLine(const QString &line, QStringList &pieces)
 {
-    pieces = line.split(QLatin1Char('='));
+    pieces = line.chopped(terminatorOf(line).size()).split(QLatin1Char('='));
     if (pieces.size() < 2)
         return false;
     pieces = pieces.at(1).split(QLatin1Char('"'));
@@ -115,14 +126,10 @@ void DhcpServerManager::writeDHCPServerConfig(const QString &path)
     // Commented lines with the key are deliberately replaced too.
     for (QString &line : m_fileLines) {
         if (line.contains(interfacesKey))
-            line = interfacesLine(m_interfaces);
+            line = interfacesLine(m_interfaces) + terminatorOf(line);
     }
-    QString text = m_fileLines.join(QLatin1Char('\n'));
-    if (!m_fileLines.isEmpty())
-        text += QLatin1Char('\n');
-
     const bool wouldLoseFile = !m_fileWasRead && QFileInfo::exists(path);
-    if (wouldLoseFile || !fileio::replaceFile(path, m_fileEncoding.encode(text))) {
+    if (wouldLoseFile || !fileio::replaceFile(path, m_fileEncoding.encode(m_fileLines.join(QString{})))) {
         updateInterfaces();
         emit error(QObject::tr("Unable to open file '%1' for write").arg(path));
     }

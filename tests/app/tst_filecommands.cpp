@@ -632,7 +632,7 @@ void FileCommandsTest::servedInterfaces()
     QFETCH(bool, saved);
     // Names that come after those of any machine: only the last of all is written without a space behind it.
     const QByteArray before = "# kept\nINTERFACESv4=\"zz7 zz8\"  \nINTERFACESv6=\"\"";
-    const QByteArray after = "# kept\nINTERFACESv4=\"zz8\"\nINTERFACESv6=\"\"\n";
+    const QByteArray after = "# kept\nINTERFACESv4=\"zz8\"\nINTERFACESv6=\"\"";
     writeTestFile(paths::serverDefaults(), before);
     const Site site{*m_machine, *m_boxes};
 

@@ -233,9 +233,14 @@ void TestServedInterfaces::writesChoice_data()
     row("no key", "X=1\n", {{a, true}}, "X=1\n");
     row("empty file", "", {{a, true}}, "");
     row("empty lines at the end", "INTERFACESv4=\"\"\n\n\n", {{a, true}}, "INTERFACESv4=\"srv0\"\n\n\n");
-    row("no terminator at the end", "INTERFACESv4=\"\"\nX=1", {{a, true}}, "INTERFACESv4=\"srv0\"\nX=1\n");
-    row("CR LF becomes LF", "X=1\r\nINTERFACESv4=\"\"\r\n\r\n", {{a, true}}, "X=1\nINTERFACESv4=\"srv0\"\n\n");
-    row("CR inside a line stays", "# a\rb\r\r\nINTERFACESv4=\"\"\n", {{a, true}}, "# a\rb\r\nINTERFACESv4=\"srv0\"\n");
+    row("no terminator at the end", "INTERFACESv4=\"\"\nX=1", {{a, true}}, "INTERFACESv4=\"srv0\"\nX=1");
+    row("no terminator of the line with the key", "X=1\nINTERFACESv4=\"\"", {{a, true}}, "X=1\nINTERFACESv4=\"srv0\"");
+    row("CR LF stays", "X=1\r\nINTERFACESv4=\"\"\r\n\r\n", {{a, true}}, "X=1\r\nINTERFACESv4=\"srv0\"\r\n\r\n");
+    row("each line keeps its terminator", "X=1\r\nINTERFACESv4=\"\"\nY=2\r\n#INTERFACESv4=\"\"\r\nZ=3\n", {{a, true}},
+        "X=1\r\nINTERFACESv4=\"srv0\"\nY=2\r\nINTERFACESv4=\"srv0\"\r\nZ=3\n");
+    row("CR inside a line stays", "# a\rb\r\r\nINTERFACESv4=\"\"\n", {{a, true}},
+        "# a\rb\r\r\nINTERFACESv4=\"srv0\"\n");
+    row("lost line before the end", "X=1\r\nINTERFACESv4=eth9", {{a, true}}, "X=1\r\n");
     row("UTF-8 stays", "# B\xc3\xbcro\nINTERFACESv4=\"\"\n", {{QStringLiteral("b\u00fcro"), true}},
         "# B\xc3\xbcro\nINTERFACESv4=\"b\xc3\xbcro\"\n");
     row("Latin-1 stays", "# B\xfcro\nINTERFACESv4=\"\"\n", {{a, true}}, "# B\xfcro\nINTERFACESv4=\"srv0\"\n");
@@ -265,6 +270,8 @@ void TestServedInterfaces::writesLinesThatItRead_data()
     QTest::addRow("null byte") << QByteArray{"# a\0b\n", 6};
     QTest::addRow("long line") << QByteArray{200'000, 'x'} + '\n';
     QTest::addRow("many lines") << QByteArray{"line\n"}.repeated(20'000);
+    QTest::addRow("CR LF") << QByteArray{"# x\r\n\r\n"};
+    QTest::addRow("CR only") << QByteArray{"\r\r# x\r\n"};
 }
 
 void TestServedInterfaces::writesLinesThatItRead()
