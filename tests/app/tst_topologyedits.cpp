@@ -166,6 +166,8 @@ private slots:
     void cancelledEditChangesNothing();
     void refusedEditSaysWhy_data();
     void refusedEditSaysWhy();
+    void leaseTimesOfAnySizeAreKept_data();
+    void leaseTimesOfAnySizeAreKept();
     void addressOfABareHostIsAdded();
     void nameWithASpaceIsQuoted();
     void editNeedsItsKindOfStatement_data();
@@ -423,6 +425,30 @@ void TestTopologyEdits::refusedEditSaysWhy()
     QCOMPARE(window.changes(), QStringList{});
     QCOMPARE(window.notices(), 0);
     QVERIFY(!window.offersSave());
+}
+
+// The dialog holds a little more than a year.
+void TestTopologyEdits::leaseTimesOfAnySizeAreKept_data()
+{
+    QTest::addColumn<QByteArray>("seconds");
+    QTest::addColumn<QString>("shown");
+    for (const char *seconds : {"2147483647", "2147483648", "4294967295", "9223372036854775807"})
+        QTest::addRow("%s", seconds) << QByteArray{seconds} << text("12 | 15 | 3 h | 14 m | 7 s");
+    for (const char *seconds : {"-2147483649", "-9223372036854775808", "9223372036854775808"})
+        QTest::addRow("%s", seconds) << QByteArray{seconds} << text("0 | 0 | 0 h | 0 m | 0 s");
+}
+
+void TestTopologyEdits::leaseTimesOfAnySizeAreKept()
+{
+    QFETCH(QByteArray, seconds);
+    QFETCH(QString, shown);
+    const TopologyWindow window{"max-lease-time " + seconds + ";\n"};
+    const Input input = time("Edit max lease time", qPrintable(shown));
+    edit(window, text("max-lease-time"), input);
+    QCOMPARE(window.changes(), QStringList{});
+    edit(window, text("max-lease-time"), with(input, type(list("0 | 0 | 0 | 0 | 7"))));
+    QCOMPARE(window.changes(),
+             (QStringList{text("-max-lease-time %1;").arg(QString::fromLatin1(seconds)), text("+max-lease-time 7;")}));
 }
 
 void TestTopologyEdits::addressOfABareHostIsAdded()

@@ -45,6 +45,8 @@ private slots:
     void knowsTheUsualLayout();
     void isShownAsItStands_data();
     void isShownAsItStands();
+    void isShownInAnyYear_data();
+    void isShownInAnyYear();
     void isShownInTheDefaultLocale_data();
     void isShownInTheDefaultLocale();
     void hasNoTextIfInvalid();
@@ -136,6 +138,34 @@ void TestLeaseTime::isShownAsItStands()
         QCOMPARE(time.time(), QTime(2, 30));
         QVERIFY(LeaseTimeTexts{}.text(time).startsWith(QLatin1String{"02:30:00"}));
     }
+}
+
+/// Also where a number of seconds since 1970 would be negative, or more than 31 or 32 bits hold.
+void TestLeaseTime::isShownInAnyYear_data()
+{
+    QTest::addColumn<QByteArray>("date");
+    QTest::addColumn<QByteArray>("time");
+    QTest::addColumn<QString>("text");
+    const auto addRow{[](const char *date, const char *time, const char *text) {
+        QTest::addRow("%s %s", date, time) << QByteArray{date} << QByteArray{time} << QString::fromUtf8(text);
+    }};
+    addRow("0001/01/01", "00:00:00", "00:00:00 UTC 1 Jan 0001");
+    addRow("1901/12/13", "20:45:51", "20:45:51 UTC 13 Dec 1901");
+    addRow("1969/12/31", "23:59:59", "23:59:59 UTC 31 Dec 1969");
+    addRow("1970/01/01", "00:00:00", "00:00:00 UTC 1 Jan 1970");
+    addRow("2038/01/19", "03:14:08", "03:14:08 UTC 19 Jan 2038");
+    addRow("2106/02/07", "06:28:16", "06:28:16 UTC 7 Feb 2106");
+    addRow("9999/12/31", "23:59:59", "23:59:59 UTC 31 Dec 9999");
+    addRow("0000/01/01", "00:00:00", "");
+}
+
+void TestLeaseTime::isShownInAnyYear()
+{
+    QFETCH(const QByteArray, date);
+    QFETCH(const QByteArray, time);
+    QFETCH(const QString, text);
+    QCOMPARE(LeaseTimeTexts{}.text(parsed(date, time)), text);
+    QCOMPARE(LeaseTimeTexts{}.text(LeaseTime::fromUsualLayout((date + ' ' + time).constData())), text);
 }
 
 void TestLeaseTime::isShownInTheDefaultLocale_data()
