@@ -524,6 +524,7 @@ void TestTopologyCommands::rangeIsOfferedForTheSubnet_data()
     QTest::addRow("/32") << QByteArray{"10.0.0.1 netmask 255.255.255.255"} << list("10.0.0.2 | 10.0.0.1");
     QTest::addRow("/0") << QByteArray{"0.0.0.0 netmask 0.0.0.0"} << list("0.0.0.1 | 255.255.255.254");
     QTest::addRow("not an address") << QByteArray{"lan netmask 255.255.255.0"} << QStringList{QString{}, QString{}};
+    QTest::addRow("no netmask") << QByteArray{"10.0.0.0"} << QStringList{QString{}, QString{}};
     QTest::addRow("not a netmask") << QByteArray{"10.0.0.0 netmask lan"} << QStringList{QString{}, QString{}};
     QTest::addRow("without words") << QByteArray{} << QStringList{QString{}, QString{}};
 }
