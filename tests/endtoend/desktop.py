@@ -23,9 +23,8 @@ PATIENCE = 90  # seconds until what never comes fails the test
 POLL = 0.02  # seconds between two looks
 DOUBLE_CLICK = 0.5  # seconds within which a second click at the same place would be one
 
-# The roles of windows, and of what is never searched for controls since it may have a million of them.
+# The roles of menus, and of what is never searched for controls since it may have a million of them.
 MENU = "popup menu"
-WINDOWS = ("frame", "dialog", "alert")
 VIEWS = ("tree", "table")
 
 
@@ -87,6 +86,12 @@ class Display:
         window = self.root.query_pointer().child
         return self.box_of(window) if window else None
 
+    def pixels(self, box):
+        """The colours there, row by row: red, green and blue from 0 to 255."""
+        x, y, width, height = box
+        image = self.root.get_image(x, y, width, height, Xlib.X.ZPixmap, 0xFFFFFFFF)
+        return [(red, green, blue) for blue, green, red, _ in zip(*[iter(image.data)] * 4)]
+
     def has_keyboard(self, window):
         return self.connection.get_input_focus().focus == window
 
@@ -133,6 +138,11 @@ class Control:
         return self.accessible.queryText().getText(0, -1)
 
     @property
+    def value(self):
+        """What is typed to have the field hold what it holds."""
+        return self.text
+
+    @property
     def states(self):
         return {state.value_nick for state in self.accessible.getState().getStates()}
 
@@ -169,13 +179,13 @@ class Control:
     @property
     def window(self):
         """The window or menu that it is in."""
-        control = self
-        while control.role not in (*WINDOWS, MENU):
-            control = control.parent
+        control, parent = self, self.parent
+        while control.role != MENU and parent.role != "application":
+            control, parent = parent, parent.parent
         return control
 
     def wrap(self, accessible):
-        kind = {"tree": Tree, "table": Table}.get(accessible.getRoleName(), Control)
+        kind = {"tree": Tree, "table": Table, "spin button": SpinBox}.get(accessible.getRoleName(), Control)
         return kind(self.program, accessible)
 
     def below(self):
@@ -231,7 +241,7 @@ class Control:
         self.focus()
         self.program.keys("ctrl+a", "Delete")
         self.program.type(text)
-        self.program.wait(lambda: self.text == text, lambda: f"{self} with {text!r}; it has {self.text!r}")
+        self.program.wait(lambda: self.value == text, lambda: f"{self} with {text!r}; it has {self.text!r}")
 
     def open_menu(self):
         """The menu of an entry that has one, opened by a click."""
@@ -250,6 +260,14 @@ class Control:
         return self.program.menu()
 
 
+class SpinBox(Control):
+    """A field for a number, which may show a unit behind it."""
+
+    @property
+    def value(self):
+        return str(int(self.accessible.queryValue().currentValue))
+
+
 class Window(Control):
     """A main window or dialog."""
 
@@ -262,7 +280,7 @@ class Window(Control):
         return self.path in {window.path for window in self.program.windows()}
 
     def wait_closed(self):
-        self.program.wait(lambda: not self.is_open, lambda: f"{self} closed", alone=False)
+        self.program.wait(lambda: not self.is_open, lambda: f"{self} closed", alive=False, alone=False)
 
     def take_keyboard(self):
         """There is no window manager that would give the window the keyboard at first or when a dialog has closed."""
@@ -287,6 +305,15 @@ class Window(Control):
 
     def button(self, name):
         return self.find("push button", name)
+
+    def field(self, name):
+        """The field for a text or number with the name."""
+
+        def found():
+            fields = [control for role in ("text", "spin button") for control in self.all(role, name)]
+            return fields[0] if len(fields) == 1 else None
+
+        return self.program.wait(found, lambda: f"one field {name!r} in {self}; there are {list(self.below())}")
 
     def choose(self, *entries):
         """Walks through the menu bar with the mouse: choose("File", "Save")."""

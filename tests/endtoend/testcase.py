@@ -21,8 +21,8 @@ def keeping_picture(test):
     return run
 
 
-class PictureTest(unittest.TestCase):
-    """Keeps a picture of the display when a test fails."""
+class DesktopTest(unittest.TestCase):
+    """Starts the program. Keeps a picture of the display when a test fails."""
 
     def __init_subclass__(cls, **options):
         super().__init_subclass__(**options)
@@ -30,11 +30,31 @@ class PictureTest(unittest.TestCase):
             if name.startswith("test"):
                 setattr(cls, name, keeping_picture(test))
 
+    def launch(self):
+        """Starts the program for as long as the test."""
+        self.program = desktop.Program()
+        self.addCleanup(self.program.end)
+
     def finish(self):
         """What is checked at the end of every test."""
+        self.assertEqual([self.program.describe(window) for window in self.program.unknown()], [])
+
+    def wait(self, condition, what):
+        """Waits until the condition holds; WHAT names it where that does not happen."""
+        return self.program.wait(condition, lambda: what)
+
+    def message(self, title, text, *, informative_text="", buttons=("OK",), default="OK"):
+        """A message box that has opened, which must be as described."""
+        box = self.program.window(title)
+        self.assertEqual(box.role, "alert")
+        self.assertEqual(box.text, text)
+        self.assertEqual(box.informative_text, informative_text)
+        self.assertEqual(box.buttons, list(buttons))
+        self.assertEqual(box.default_button, default)
+        return box
 
 
-class ProgramTest(PictureTest):
+class ProgramTest(DesktopTest):
     """Each test has the machine as it was at first, and the program freshly started on it.
 
     A class or test that needs the machine otherwise than at first changes it in prepare().
@@ -49,12 +69,8 @@ class ProgramTest(PictureTest):
         """What happens to the machine before the program starts."""
 
     def start(self):
-        self.program = desktop.Program()
-        self.addCleanup(self.program.end)
+        self.launch()
         self.main = self.program.window(desktop.MAIN_TITLE)
-
-    def finish(self):
-        self.assertEqual([self.program.describe(window) for window in self.program.unknown()], [])
 
     @property
     def tree(self):
@@ -77,17 +93,3 @@ class ProgramTest(PictureTest):
     def wait_for_address(self, client):
         """The address that the server gives to a client."""
         return self.wait(lambda: client.address, f"an address for {client.mac}: {client.log}")
-
-    def wait(self, condition, what):
-        """Waits until the condition holds; WHAT names it where that does not happen."""
-        return self.program.wait(condition, lambda: what)
-
-    def message(self, title, text, *, informative_text="", buttons=("OK",), default="OK"):
-        """A message box that has opened, which must be as described."""
-        box = self.program.window(title)
-        self.assertEqual(box.role, "alert")
-        self.assertEqual(box.text, text)
-        self.assertEqual(box.informative_text, informative_text)
-        self.assertEqual(box.buttons, list(buttons))
-        self.assertEqual(box.default_button, default)
-        return box
