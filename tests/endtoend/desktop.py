@@ -7,6 +7,8 @@ seen instead when that does not happen. A window that nobody expected fails it a
 """
 
 import os
+import pathlib
+import re
 import signal
 import subprocess
 import tempfile
@@ -562,6 +564,18 @@ class Program:
     @property
     def is_running(self):
         return self.process.poll() is None
+
+    def child_processes(self):
+        """The numbers of the processes that it has started and that have not ended."""
+        return subprocess.run(
+            ["pgrep", "--parent", str(self.process.pid)], check=False, capture_output=True, text=True
+        ).stdout.split()
+
+    def watches(self, path):
+        """The numbers of its watches on a file or folder; it gets a new one whenever it watches anew."""
+        kept = pathlib.Path(f"/proc/{self.process.pid}/fdinfo")
+        watch = re.compile(rf"^inotify wd:(\w+) ino:{os.stat(path).st_ino:x} ", re.MULTILINE)
+        return {number for info in kept.iterdir() for number in watch.findall(info.read_text())}
 
     def wait_ended(self):
         """Its exit status."""

@@ -1,0 +1,74 @@
+# SPDX-License-Identifier: GPL-3.0-or-later
+"""Closing the window with and without unsaved changes."""
+
+import machine
+from test_saving import CANNOT_WRITE, CONFIGURATION, NEW_LEASE_TIME, SAVED, SavingTest
+
+
+class Closing(SavingTest):
+    def confirmation(self):
+        return self.message(
+            "Confirmation", "There are unsaved changes, save?", buttons=["Yes", "No", "Cancel"], default="Yes"
+        )
+
+    def assert_ended(self):
+        self.assertEqual(self.program.wait_ended(), 0)
+
+    def test_asks_nothing_without_changes(self):
+        for close in (self.main.close, lambda: self.main.choose("File", "Exit")):
+            with self.subTest(close):
+                close()
+                self.assert_ended()
+                self.start()
+        self.assert_not_saved()
+
+    def test_without_saving(self):
+        self.edit()
+        self.main.choose("File", "Exit")
+        self.confirmation().answer("No")
+        self.assert_ended()
+        self.assert_not_saved()
+
+    def test_can_be_cancelled(self):
+        self.edit()
+        for answer in (lambda box: box.answer("Cancel"), lambda box: box.press("Escape"), lambda box: box.close()):
+            self.main.close()
+            box = self.confirmation()
+            answer(box)
+            box.wait_closed()
+            self.tree.row(*NEW_LEASE_TIME)
+        self.assert_not_saved()
+        self.save()
+
+    def test_with_saving(self):
+        self.edit()
+        self.main.close()
+        self.confirmation().answer("Yes")
+        self.question().answer("Save")
+        self.assert_ended()
+        self.assert_saved()
+
+    def test_with_saving_that_is_cancelled(self):
+        self.edit()
+        self.main.choose("File", "Exit")
+        self.confirmation().answer("Yes")
+        self.question().answer("Cancel")
+        self.assert_ended()
+        self.assert_not_saved()
+
+    def test_keeps_a_copy_of_what_could_not_be_written(self):
+        self.edit()
+        with self.read_only_folder():
+            self.main.close()
+            self.confirmation().answer("Yes")
+            self.question().answer("Save")
+            self.message("Error", CANNOT_WRITE).answer("OK")
+            self.assert_ended()
+        self.assertEqual(machine.CONFIGURATION.read_text(), CONFIGURATION)
+        self.assertIn(SAVED, [backup.read_text() for backup in machine.backups()])
+
+    def test_after_a_save_asks_nothing(self):
+        self.edit()
+        self.save()
+        self.main.close()
+        self.assert_ended()
