@@ -29,6 +29,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <string_view>
 #include <tuple>
 
 namespace {
@@ -44,8 +45,11 @@ QString noMac() { return QStringLiteral("00:00:00:00:00:00"); }
 QStringList wordsFrom(const Statement &statement, int first)
 {
     QStringList words;
-    for (int i = first; i < statement.wordCount(); ++i)
-        words.append(statement.word(i));
+    int index{};
+    for (const std::string_view word : statement.words()) {
+        if (index++ >= first)
+            words.append(decodedWord(word));
+    }
     return words;
 }
 
