@@ -6,6 +6,7 @@ the keyboard. Nothing waits for a fixed time: every step waits until it can be t
 seen instead when that does not happen. A window that nobody expected fails it at once.
 """
 
+import contextlib
 import os
 import pathlib
 import re
@@ -96,6 +97,16 @@ class Display:
 
     def has_keyboard(self, window):
         return self.connection.get_input_focus().focus == window
+
+    def cover(self, box):
+        """Puts an empty window over everything there, for as long as this is connected."""
+        x, y, width, height = box
+        self.root.create_window(x, y, width + 1, height + 1, 0, Xlib.X.CopyFromParent).map()
+        self.connection.sync()
+
+    def resize(self, window, width, height):
+        window.configure(width=width, height=height)
+        self.connection.sync()
 
     def ask_to_close(self, window):
         """What the button of the frame that a window manager puts around a window does."""
@@ -588,6 +599,7 @@ class Program:
             self.process.send_signal(signal.SIGTERM)
         self.process.wait()
         self.errors.close()
+        self.display.connection.close()
 
     # --- Looking
 
@@ -622,8 +634,9 @@ class Program:
 
     def note_menu(self, event):
         source = event.source
-        if event.detail1 and source and source.getRoleName() == MENU:
-            self.menus = [menu for menu in self.menus if menu.path != source.path] + [source]
+        with contextlib.suppress(GLib.Error):  # it may have gone
+            if event.detail1 and source and source.getRoleName() == MENU:
+                self.menus = [menu for menu in self.menus if menu.path != source.path] + [source]
 
     def accessible(self):
         desktop = pyatspi.Registry.getDesktop(0)

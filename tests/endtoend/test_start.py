@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
-"""The program's start."""
+"""The start by the superuser: what the window shows, and what it keeps to itself."""
 
+import desktop
+import machine
 from testcase import ProgramTest
 
 SITE = """\
@@ -73,17 +75,79 @@ class Start(ProgramTest):
     def test_shows_the_configuration(self):
         self.assertEqual(self.tree.headers, ["Topology", "Value"])
         self.assertEqual("\n".join(self.tree.lines()) + "\n", SITE)
+        self.assertTrue(self.tree.row("All network").is_current)
 
-    def test_offers_commands_on_the_network(self):
-        menu = self.tree.row("All network").context_menu()
-        self.assertEqual(menu.entries[:2], ["Add shared network", "Add subnet"])
-        options = menu.submenu("Add parameter").submenu("Add option")
-        self.assertIn("Add DNS servers", options.entries)
-        self.main.press("Escape", "Escape", "Escape")
-
-    def test_asks_before_it_reads_the_file_again(self):
-        self.main.choose("File", "Reload")
-        question = self.message(
-            "Information", "Do you want to reload configuration from file?", buttons=["Yes", "No"], default="Yes"
+    def test_shows_the_window(self):
+        self.assertEqual([window.title for window in self.program.windows()], [desktop.MAIN_TITLE])
+        self.assertEqual([tab.name for tab in self.main.all("page tab")], ["Topology", "Leases"])
+        self.assertEqual([entry.name for entry in self.main.find("menu bar").children], ["File", "Server", "Help"])
+        self.assertEqual(
+            [button.name for button in self.main.find("tool bar").all("push button")],
+            [
+                "Start DHCP-server",
+                "Restart DHCP-server",
+                "Save",
+                "Reload",
+                "Add shared network",
+                "Add subnet",
+                "Add host",
+            ],
         )
-        question.answer("No")
+        self.wait_for_server("stopped")
+
+    def test_has_these_menus(self):
+        for name, entries in {
+            "File": ["Reload", "Save", None, "Exit"],
+            "Server": ["Start DHCP-server", "Restart DHCP-server", None, "Select interfaces"],
+            "Help": ["Manual", None, "About orv-admin-dhcp", "About Qt"],
+        }.items():
+            self.assertEqual(self.main.find("menu item", name).open_menu().entries, entries)
+            self.main.press("Escape")
+
+    def test_gives_the_window_its_last_size(self):
+        size = 1001, 555
+        self.assertNotEqual(self.main.box[2:], size)
+        self.program.display.resize(self.program.display.window_at(self.main.box), *size)
+        self.wait(lambda: self.main.box[2:] == size, "a window of another size")
+        self.main.close()
+        self.assertEqual(self.program.wait_ended(), 0)
+        self.start()
+        self.assertEqual(self.main.box[2:], size)
+
+
+class SecondStart(ProgramTest):
+    def test_brings_the_first_window_back_and_ends(self):
+        display = self.program.display
+        self.main.find("status bar").reach()
+        display.cover(self.main.box)
+        self.assertNotEqual(display.box_below_mouse(), self.main.box)
+        self.assertFalse(display.has_keyboard(display.window_at(self.main.box)))
+        second = desktop.Program()
+        self.addCleanup(second.end)
+        self.assertEqual(second.wait_ended(), 1)
+        self.assertEqual(second.output(), "")
+        self.wait(lambda: display.box_below_mouse() == self.main.box, "the first window in front")
+        self.wait(lambda: display.has_keyboard(display.window_at(self.main.box)), "the first window with the keyboard")
+        self.assertEqual(len(self.tree.rows), len(SITE.splitlines()))
+
+
+class StartWithoutConfiguration(ProgramTest):
+    def prepare(self):
+        machine.CONFIGURATION.unlink()
+
+    def start(self):
+        self.launch()
+        self.message("Error", "Unable to open file '/etc/dhcp/dhcpd.conf' for read").answer("OK")
+        self.main = self.program.window(desktop.MAIN_TITLE)
+
+    def test_shows_an_empty_tree(self):
+        self.assertEqual(self.tree.lines(), [])
+
+
+class StartWithRunningServer(ProgramTest):
+    def prepare(self):
+        self.assertEqual(machine.systemctl("start").returncode, 0)
+
+    def test_tells_that_it_runs(self):
+        self.wait_for_server("running")
+        self.main.button("Stop DHCP-server")
