@@ -90,6 +90,7 @@ class Client:
     def __init__(self, mac, interface, host_name=None):
         self.mac = mac
         self.host_name = host_name
+        self.has_left = False
         self.tell("join", interface, *([host_name] if host_name else []))
 
     def tell(self, verb, *arguments):
@@ -103,7 +104,10 @@ class Client:
         self.tell("ask")
 
     def leave(self):
-        self.tell("leave")
+        """Gives its address back and goes, unless it has left before."""
+        if not self.has_left:
+            self.tell("leave")
+        self.has_left = True
 
     @property
     def address(self):
