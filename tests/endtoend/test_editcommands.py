@@ -1,0 +1,387 @@
+# SPDX-License-Identifier: GPL-3.0-or-later
+"""The commands of the topology tree's context menus that change statements or take them away."""
+
+import dataclasses
+
+from commandtest import (
+    CHANGES,
+    CommandTest,
+    Dialog,
+    GROUP,
+    Lines,
+    NOTHING,
+    Place,
+    ROOT,
+    SUBNET,
+    addresses,
+    cell,
+    form,
+    time_form,
+    with_block,
+    without_first_address,
+    words_form,
+)
+
+
+@dataclasses.dataclass(frozen=True)
+class Edit:
+    """Statements that a dialog makes out of others."""
+
+    place: Place
+    before: Lines
+    dialog: Dialog
+    after: Lines
+
+    def __str__(self):
+        return self.before.tree
+
+    @property
+    def row(self):
+        return self.place.tree_lines(self.before)[0]
+
+
+SITE = """\
+min-lease-time 30;
+option classless-static-routes code 121 = array of unsigned integer 8;
+option ms-classless-static-routes code 249 = array of unsigned integer 8;
+shared-network attic {
+    subnet 10.2.0.0 netmask 255.255.255.0 {
+    }
+}
+subnet 10.1.0.0 netmask 255.255.255.0 {
+    range 10.1.0.10 10.1.0.19;
+    range dynamic-bootp 10.1.0.30 10.1.0.39;
+}
+subnet 10.3.0.0 netmask 255.255.255.0 {
+}
+group printers {
+    default-lease-time 600;
+    max-lease-time 7200;
+    option routers 10.1.0.1, 10.1.0.2;
+    option domain-name-servers 10.1.0.3;
+    option ntp-servers 10.1.0.4;
+    option domain-name "example.org";
+    option classless-static-routes 24, 192,168,1,0, 10,1,0,1;
+    option ms-classless-static-routes 16, 172,16,0,0, 10,1,0,2;
+    option time-offset 3600;
+}
+class "phones" {
+    match hardware;
+}
+subclass "phones" 1:00:11:22:33:44:55;
+host plotter {
+    hardware ethernet 00:11:22:33:44:55;
+    fixed-address 10.1.0.5;
+}
+host scanner {
+    hardware ethernet 00:11:22:33:44:66;
+}
+host camera {
+    hardware ethernet 00:11:22:33:44:77;
+    fixed-address 10.1.0.7;
+}
+"""
+
+CAMERA = ROOT.below("Host: camera", "host camera")
+
+
+def edited(title, name, text, becomes):
+    return form(title, {name: text}, {name: becomes})
+
+
+def routes_edited(shown, ms, fill):
+    return Dialog("Edit static route", {"Static routes": [shown], "Route for MS systems": ms}, fill, button="Yes")
+
+
+def host_edited(shown, texts):
+    return form("Edit host", dict(zip(("Name:", "MAC address:", "Fixed IP:"), shown)), texts)
+
+
+EDITS = (
+    Edit(
+        ROOT,
+        Lines("min-lease-time: 30 seconds", "min-lease-time 30;"),
+        time_form("Edit time", ("0", "0", "0 h", "0 m", "30 s"), {"Minutes": "1"}),
+        Lines("min-lease-time: 1 minutes 30 seconds", "min-lease-time 90;"),
+    ),
+    Edit(
+        ROOT,
+        Lines(
+            "Static route MS: code 249 = array of unsigned integer 8",
+            "option ms-classless-static-routes code 249 = array of unsigned integer 8;",
+        ),
+        words_form(
+            "Edit static route",
+            "Parameter:",
+            "option ms-classless-static-routes code 249 = array of unsigned integer 8",
+            "option ms-classless-static-routes code 250 = array of unsigned integer 8",
+        ),
+        Lines(
+            "Static route MS: code 250 = array of unsigned integer 8",
+            "option ms-classless-static-routes code 250 = array of unsigned integer 8;",
+        ),
+    ),
+    Edit(
+        ROOT,
+        Lines(
+            """\
+Shared network: attic
+    Subnet: 10.2.0.0 / 255.255.255.0""",
+            """\
+shared-network attic {
+    subnet 10.2.0.0 netmask 255.255.255.0 {
+    }
+}""",
+        ),
+        edited("Edit shared network", "Name:", "attic", "big lab"),
+        Lines(
+            """\
+Shared network: "big lab"
+    Subnet: 10.2.0.0 / 255.255.255.0""",
+            """\
+shared-network "big lab" {
+    subnet 10.2.0.0 netmask 255.255.255.0 {
+    }
+}""",
+        ),
+    ),
+    Edit(
+        SUBNET,
+        Lines("Range: 10.1.0.10 - 10.1.0.19", "range 10.1.0.10 10.1.0.19;"),
+        form(
+            "Edit range",
+            {"Start IP:": "10.1.0.10", "End IP:": "10.1.0.19"},
+            {"Start IP:": "10.1.0.11", "End IP:": "10.1.0.12"},
+        ),
+        Lines("Range: 10.1.0.11 - 10.1.0.12", "range 10.1.0.11 10.1.0.12;"),
+    ),
+    Edit(
+        SUBNET,
+        Lines("Range: dynamic-bootp - 10.1.0.30", "range dynamic-bootp 10.1.0.30 10.1.0.39;"),
+        form(
+            "Edit range",
+            {"Start IP:": "10.1.0.30", "End IP:": "10.1.0.39"},
+            {"Start IP:": "10.1.0.31", "End IP:": "10.1.0.35"},
+        ),
+        Lines("Range: dynamic-bootp - 10.1.0.31", "range dynamic-bootp 10.1.0.31 10.1.0.35;"),
+    ),
+    Edit(
+        ROOT,
+        Lines("Subnet: 10.3.0.0 / 255.255.255.0", "subnet 10.3.0.0 netmask 255.255.255.0 {\n}"),
+        form(
+            "Edit subnet",
+            {"Address:": "10.3.0.0", "Netmask:": "255.255.255.0"},
+            {"Address:": "10.4.0.0", "Netmask:": "255.255.128.0"},
+        ),
+        Lines("Subnet: 10.4.0.0 / 255.255.128.0", "subnet 10.4.0.0 netmask 255.255.128.0 {\n}"),
+    ),
+    Edit(
+        GROUP,
+        Lines("Default lease time: 10 minutes", "default-lease-time 600;"),
+        time_form("Edit default lease time", ("0", "0", "0 h", "10 m", "0 s"), {"Hours": "1"}),
+        Lines("Default lease time: 1 hours 10 minutes", "default-lease-time 4200;"),
+    ),
+    Edit(
+        GROUP,
+        Lines("Max lease time: 2 hours", "max-lease-time 7200;"),
+        time_form("Edit max lease time", ("0", "0", "2 h", "0 m", "0 s"), {"Days:": "3"}),
+        Lines("Max lease time: 3 days 2 hours", "max-lease-time 266400;"),
+    ),
+    Edit(
+        GROUP,
+        Lines("Gateways: 10.1.0.1, 10.1.0.2", "option routers 10.1.0.1, 10.1.0.2;"),
+        Dialog("Edit gateways", {"Gateways:": ["10.1.0.1", "10.1.0.2"]}, without_first_address(addresses("10.1.0.9"))),
+        Lines("Gateways: 10.1.0.2, 10.1.0.9", "option routers 10.1.0.2, 10.1.0.9;"),
+    ),
+    Edit(
+        GROUP,
+        Lines("DNS servers: 10.1.0.3", "option domain-name-servers 10.1.0.3;"),
+        Dialog("Edit DNS servers", {"DNS servers:": ["10.1.0.3"]}, addresses("10.1.0.10")),
+        Lines("DNS servers: 10.1.0.3, 10.1.0.10", "option domain-name-servers 10.1.0.3, 10.1.0.10;"),
+    ),
+    Edit(
+        GROUP,
+        Lines("NTP servers: 10.1.0.4", "option ntp-servers 10.1.0.4;"),
+        Dialog("Edit NTP servers", {"NTP servers:": ["10.1.0.4"]}, addresses("10.1.0.11")),
+        Lines("NTP servers: 10.1.0.4, 10.1.0.11", "option ntp-servers 10.1.0.4, 10.1.0.11;"),
+    ),
+    Edit(
+        GROUP,
+        Lines('Domain name: "example.org"', 'option domain-name "example.org";'),
+        edited("Edit domain name", "Domain name:", "example.org", "print.example.org"),
+        Lines('Domain name: "print.example.org"', 'option domain-name "print.example.org";'),
+    ),
+    Edit(
+        GROUP,
+        Lines("Static route: 24, 192,168,1,0, 10,1,0,1", "option classless-static-routes 24, 192,168,1,0, 10,1,0,1;"),
+        routes_edited("255.255.255.0: 192.168.1.0: 10.1.0.1", False, cell(0, 2, "10.1.0.9")),
+        Lines("Static route: 24, 192,168,1,0, 10,1,0,9", "option classless-static-routes 24, 192,168,1,0, 10,1,0,9;"),
+    ),
+    Edit(
+        GROUP,
+        Lines(
+            "Static route MS: 16, 172,16,0,0, 10,1,0,2", "option ms-classless-static-routes 16, 172,16,0,0, 10,1,0,2;"
+        ),
+        routes_edited("255.255.0.0: 172.16.0.0: 10.1.0.2", True, cell(0, 0, "255.255.255.0")),
+        Lines(
+            "Static route MS: 24, 172,16,0,0, 10,1,0,2", "option ms-classless-static-routes 24, 172,16,0,0, 10,1,0,2;"
+        ),
+    ),
+    Edit(
+        GROUP,
+        Lines("time-offset: 3600", "option time-offset 3600;"),
+        words_form("Edit arbitrary parameter", "Parameter:", "option time-offset 3600", "ping-check true"),
+        Lines("ping-check: true", "ping-check true;"),
+    ),
+    Edit(
+        ROOT,
+        Lines(
+            """\
+class: "phones"
+    match: hardware""",
+            """\
+class "phones" {
+    match hardware;
+}""",
+        ),
+        words_form("Edit arbitrary declaration", "Declaration:", 'class "phones"', 'class "voip"'),
+        Lines(
+            """\
+class: "voip"
+    match: hardware""",
+            """\
+class "voip" {
+    match hardware;
+}""",
+        ),
+    ),
+    Edit(
+        ROOT,
+        Lines('subclass: "phones" 1:00:11:22:33:44:55', 'subclass "phones" 1:00:11:22:33:44:55;'),
+        words_form(
+            "Edit arbitrary declaration",
+            "Declaration:",
+            'subclass "phones" 1:00:11:22:33:44:55',
+            'subclass "voip" 1:00:11:22:33:44:66',
+        ),
+        Lines('subclass: "voip" 1:00:11:22:33:44:66', 'subclass "voip" 1:00:11:22:33:44:66;'),
+    ),
+    Edit(
+        ROOT,
+        Lines(
+            """\
+Host: plotter
+    MAC address: 00:11:22:33:44:55
+    Fixed address: 10.1.0.5""",
+            """\
+host plotter {
+    hardware ethernet 00:11:22:33:44:55;
+    fixed-address 10.1.0.5;
+}""",
+        ),
+        host_edited(
+            ("plotter", "00:11:22:33:44:55", "10.1.0.5"),
+            {"Name:": "plotter.lan", "MAC address:": "00:11:22:33:44:88", "Fixed IP:": "10.1.0.15"},
+        ),
+        Lines(
+            """\
+Host: plotter.lan
+    MAC address: 00:11:22:33:44:88
+    Fixed address: 10.1.0.15""",
+            """\
+host plotter.lan {
+    hardware ethernet 00:11:22:33:44:88;
+    fixed-address 10.1.0.15;
+}""",
+        ),
+    ),
+    Edit(
+        ROOT,
+        Lines(
+            """\
+Host: scanner
+    MAC address: 00:11:22:33:44:66""",
+            """\
+host scanner {
+    hardware ethernet 00:11:22:33:44:66;
+}""",
+        ),
+        host_edited(("scanner", "00:11:22:33:44:66", ""), {"Fixed IP:": "10.1.0.6"}),
+        Lines(
+            """\
+Host: scanner
+    MAC address: 00:11:22:33:44:66
+    Fixed address: 10.1.0.6""",
+            """\
+host scanner {
+    hardware ethernet 00:11:22:33:44:66;
+    fixed-address 10.1.0.6;
+}""",
+        ),
+    ),
+    Edit(
+        CAMERA,
+        Lines("MAC address: 00:11:22:33:44:77", "hardware ethernet 00:11:22:33:44:77;"),
+        edited("Edit MAC address", "MAC address:", "00:11:22:33:44:77", "aa:bb:cc:dd:ee:ff"),
+        Lines("MAC address: aa:bb:cc:dd:ee:ff", "hardware ethernet aa:bb:cc:dd:ee:ff;"),
+    ),
+    Edit(
+        CAMERA,
+        Lines("Fixed address: 10.1.0.7", "fixed-address 10.1.0.7;"),
+        edited("Edit fixed address", "IP:", "10.1.0.7", "10.1.0.8"),
+        Lines("Fixed address: 10.1.0.8", "fixed-address 10.1.0.8;"),
+    ),
+)
+
+
+class Changes(CommandTest):
+    SITE = SITE
+
+    def change(self, edits, change):
+        """Runs CHANGE for the edits, which returns what becomes of the statements."""
+        file = self.file
+        for edit in edits:
+            with self.running(edit, edit.place):
+                becomes = change(edit, self.tree.row(*edit.row))
+                self.expect_instead(edit, becomes)
+                file = with_block(file, edit.place.file_lines(edit.before), edit.place.file_lines(becomes))
+        self.assertEqual(self.save(), file)
+
+    def expect_instead(self, edit, becomes):
+        lines = with_block(self.lines, edit.place.tree_lines(edit.before), edit.place.tree_lines(becomes))
+        self.expect(lambda shown: shown == lines)
+
+    def edit(self, edit, row):
+        self.cancel(edit.dialog, row.double_click)
+        row.context_menu().choose("Edit")
+        self.accept(edit.dialog)
+        return edit.after
+
+    def remove(self, edit, row):
+        row.context_menu().choose("Remove")
+        self.wait(lambda: self.tree.row(*edit.place.row).is_current, f"{edit.place} current")
+        return NOTHING
+
+    def edit_in(self, place):
+        self.change([edit for edit in EDITS if edit.place == place], self.edit)
+
+    def test_edit_in_all_network(self):
+        self.edit_in(ROOT)
+
+    def test_edit_in_subnet(self):
+        self.edit_in(SUBNET)
+
+    def test_edit_in_group(self):
+        self.edit_in(GROUP)
+
+    def test_edit_in_host(self):
+        self.edit_in(CAMERA)
+
+    def test_remove(self):
+        self.change(EDITS, self.remove)
+
+    def test_all_entries_of_the_menus_are_run(self):
+        for edit in EDITS:
+            if "{" not in edit.before.file:  # those of blocks add as well, and are run by the tests of that
+                with self.running("the menu", edit.place):
+                    self.assertEqual(self.offered(self.tree.row(*edit.row).context_menu()), CHANGES)
