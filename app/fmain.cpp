@@ -169,7 +169,7 @@ void FMain::setUpLeases()
 
 void FMain::setUpSearch()
 {
-    m_ui->searchLease->addAction(themeIcon("edit-find"), QLineEdit::LeadingPosition);
+    m_ui->searchLease->addAction(themeIcon("edit-find"), QLineEdit::LeadingPosition)->setText(tr("Search"));
     m_ui->searchLease->setClearButtonEnabled(true);
     // Qt leaves its button without a text that could be said.
     if (auto *clear = m_ui->searchLease->findChild<QAction *>(QStringLiteral("_q_qlineeditclearaction")))
