@@ -151,7 +151,8 @@ def display(folder):
         yield "offscreen", {"QT_QPA_PLATFORM": "offscreen"}
         return
     read_end, write_end = os.pipe()
-    command = [xvfb, "-displayfd", str(write_end), "-screen", "0", "1280x900x24", "-nolisten", "tcp"]
+    command = [xvfb, "-displayfd", str(write_end), "-screen", "0", "1280x900x24", "-noreset",
+               "-nolisten", "tcp"]
     with open(os.path.join(folder, "Xvfb.log"), "wb") as log, \
             subprocess.Popen(command, pass_fds=[write_end], stdout=log, stderr=log) as server:
         os.close(write_end)

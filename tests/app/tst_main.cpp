@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 // The program as it is shipped, started as a process of its own, on a virtual display where somebody must press a key.
+#include <QDeadlineTimer>
 #include <QDir>
 #include <QFile>
 #include <QProcess>
@@ -30,16 +31,25 @@ QByteArray refusalOfNetwork()
                : "no private network: " + process.readAllStandardError();
 }
 
+/// A process whose messages are shown among those of the test.
+class LoudProcess final : public QProcess
+{
+public:
+    LoudProcess() { setProcessChannelMode(QProcess::ForwardedErrorChannel); }
+};
+
 /// A virtual display, and what a person does there.
 class Display final
 {
 public:
     Display()
     {
+        // Without -noreset the display starts anew when its last client leaves, and throws out who is just coming: the
+        // program, when the look for its window is quicker.
         m_server.start(QStringLiteral("Xvfb"),
                        {QStringLiteral("-displayfd"), QStringLiteral("1"), QStringLiteral("-ac"),
-                        QStringLiteral("-nolisten"), QStringLiteral("tcp"), QStringLiteral("-screen"),
-                        QStringLiteral("0"), QStringLiteral("1280x1024x24")});
+                        QStringLiteral("-noreset"), QStringLiteral("-nolisten"), QStringLiteral("tcp"),
+                        QStringLiteral("-screen"), QStringLiteral("0"), QStringLiteral("1280x1024x24")});
         while (!m_server.canReadLine() && m_server.waitForReadyRead(patience)) {
         }
         m_environment.insert(QStringLiteral("DISPLAY"),
@@ -55,11 +65,17 @@ public:
 
     const QProcessEnvironment &environment() const { return m_environment; }
 
-    /// The titles of the windows that can be seen.
-    QStringList titles() const
+    /// The titles of the windows that can be seen: as soon as they are the expected ones, else when the program has
+    /// ended or patience has.
+    QStringList awaitTitles(const QStringList &expected, const QProcess &running) const
     {
-        const QByteArray output = use("search --onlyvisible --name . getwindowname %@");
-        return QString::fromUtf8(output).split(QLatin1Char{'\n'}, Qt::SkipEmptyParts);
+        const QDeadlineTimer deadline{patience};
+        QStringList seen = titles();
+        while (seen != expected && running.state() != QProcess::NotRunning && !deadline.hasExpired()) {
+            QTest::qWait(50);
+            seen = titles();
+        }
+        return seen;
     }
 
     /// Gives the focus to the window with the title and presses the keys.
@@ -72,16 +88,22 @@ public:
     }
 
 private:
+    QStringList titles() const
+    {
+        const QByteArray output = use("search --onlyvisible --name . getwindowname %@");
+        return QString::fromUtf8(output).split(QLatin1Char{'\n'}, Qt::SkipEmptyParts);
+    }
+
     QByteArray use(const QByteArray &arguments) const
     {
-        QProcess xdotool;
+        LoudProcess xdotool;
         xdotool.setProcessEnvironment(m_environment);
         xdotool.start(QStringLiteral("xdotool"), QString::fromUtf8(arguments).split(QLatin1Char{' '}));
         xdotool.waitForFinished(patience);
         return xdotool.readAllStandardOutput();
     }
 
-    QProcess m_server;
+    LoudProcess m_server;
     QProcessEnvironment m_environment{QProcessEnvironment::systemEnvironment()};
 };
 
@@ -119,13 +141,15 @@ void MainTest::ordinaryUserIsRefused()
 
     const Display display;
     auto environment = display.environment();
+    environment.insert(QStringLiteral("DBUS_SESSION_BUS_ADDRESS"), QStringLiteral("disabled:"));
     for (const char *name : {"XDG_RUNTIME_DIR", "XDG_CONFIG_HOME", "XDG_CACHE_HOME", "HOME"})
         environment.insert(QString::fromLatin1(name), folder.path());
-    QProcess process;
+    LoudProcess process;
     process.setProcessEnvironment(environment);
     process.start(command.first(), command.mid(1));
-    QTRY_COMPARE_WITH_TIMEOUT(display.titles(), QStringList{QStringLiteral("Error")}, patience);
-    display.press(QStringLiteral("Error"), "Return");
+    const QString title = QStringLiteral("Error");
+    QCOMPARE(display.awaitTitles({title}, process), QStringList{title});
+    display.press(title, "Return");
     QTRY_COMPARE_WITH_TIMEOUT(process.state(), QProcess::NotRunning, patience);
     QCOMPARE(process.exitStatus(), QProcess::NormalExit);
     QCOMPARE(process.exitCode(), 1);
@@ -140,13 +164,13 @@ void MainTest::superuserGetsTheWindow()
         QSKIP(refusal.constData());
 
     const Display display;
-    QProcess process;
+    LoudProcess process;
     process.setProcessEnvironment(display.environment());
     process.start(privateNetwork,
                   {QStringLiteral("sh"), QStringLiteral("-c"),
                    QStringLiteral("\"$0\"; status=$?; cd \"$XDG_CONFIG_HOME\"; cat */*; exit $status"), program});
     const QString title = QStringLiteral("Configure DHCP server");
-    QTRY_COMPARE_WITH_TIMEOUT(display.titles(), QStringList{title}, patience);
+    QCOMPARE(display.awaitTitles({title}, process), QStringList{title});
     display.press(title, "alt+f Up Return"); // the last entry of the menu, Exit
     QTRY_COMPARE_WITH_TIMEOUT(process.state(), QProcess::NotRunning, patience);
     QCOMPARE(process.exitStatus(), QProcess::NormalExit);
@@ -160,9 +184,12 @@ void MainTest::secondStartEnds()
         QSKIP(refusal.constData());
     // The first instance has asked for the server's state, which the network's service manager notes down, when
     // it has long been the first.
-    QProcess process;
+    LoudProcess process;
     process.start(privateNetwork, {QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral(R"("$0" & first=$!
-                   until [ -e /run/private-network/service ]; do sleep 0.1; done
+                   until [ -e /run/private-network/service ]; do
+                       kill -0 $first || { wait $first; echo "first: $?"; exit; }
+                       sleep 0.1
+                   done
                    "$0"; echo "second: $?"
                    kill -0 $first && echo "first runs"
                    kill $first)"),
