@@ -325,6 +325,9 @@ class Server(LeasesTest):
         self.wait_for_address(first)
         self.show_leases()
         self.wait_for_addresses(first.address)
+        self.table.row(first.address).click()
+        current = first.address, first.address
+        self.wait(lambda: self.current() == current, "the first lease as the current one")
         before = machine.LEASES.stat().st_ino
         self.main.button("Restart DHCP-server").click()
         self.wait(lambda: machine.LEASES.stat().st_ino != before, "another file")
@@ -332,4 +335,5 @@ class Server(LeasesTest):
         second = self.client(*self.CLIENTS[1])
         self.wait_for_address(second)
         self.wait(lambda: sorted(self.addresses()) == sorted([first.address, second.address]), "both leases")
+        self.assertEqual(self.current(), current)
         self.assertEqual([row.texts for row in self.table.rows], rows_of_file())
