@@ -18,6 +18,7 @@ import time
 import pyatspi
 import Xlib.display
 import Xlib.error
+import Xlib.ext.xtest
 import Xlib.protocol.event
 from gi.repository import Gio, GLib
 
@@ -29,6 +30,9 @@ DOUBLE_CLICK = 0.5  # seconds within which a second click at the same place woul
 # The roles of menus, and of what is never searched for controls since it may have a million of them.
 MENU = "popup menu"
 VIEWS = ("tree", "table")
+
+# What is raised by looking at something that has just gone, or is not there yet.
+GONE = (GLib.Error, LookupError, subprocess.CalledProcessError, Xlib.error.XError)
 
 
 def xdotool(*arguments):
@@ -94,6 +98,20 @@ class Display:
         x, y, width, height = box
         image = self.root.get_image(x, y, width, height, Xlib.X.ZPixmap, 0xFFFFFFFF)
         return [(red, green, blue) for blue, green, red, _ in zip(*[iter(image.data)] * 4)]
+
+    def mouse(self):
+        """Where it is."""
+        pointer = self.root.query_pointer()
+        return pointer.root_x, pointer.root_y
+
+    def move_mouse(self, x, y):
+        Xlib.ext.xtest.fake_input(self.connection, Xlib.X.MotionNotify, x=x, y=y)
+        self.connection.sync()
+
+    def click(self, button):
+        for event in (Xlib.X.ButtonPress, Xlib.X.ButtonRelease):
+            Xlib.ext.xtest.fake_input(self.connection, event, button)
+        self.connection.sync()
 
     def has_keyboard(self, window):
         return self.connection.get_input_focus().focus == window
@@ -230,7 +248,7 @@ class Control:
             box, window = self.box, self.window
             if not self.is_showing or min(box[2:]) <= 0:
                 return False
-            xdotool("mousemove", *box.middle)
+            self.program.display.move_mouse(*box.middle)
             return self.program.display.box_below_mouse() == window.box and self.box == box
 
         self.program.wait(reached, lambda: f"the mouse over {self} at {self.box}")
@@ -493,7 +511,7 @@ class View(Control):
             if seen.contains((*box.middle, 1, 1)) and box[1] >= seen[1] and box[1] + box[3] <= seen[1] + seen[3]:
                 return True
             self.reach()
-            xdotool("click", 4 if box[1] < seen[1] else 5)
+            self.program.display.click(4 if box[1] < seen[1] else 5)
             return False
 
         self.program.wait(in_sight, lambda: f"{cell} at {cell.box} in sight of {self} at {self.box}")
@@ -614,19 +632,26 @@ class Program:
             try:
                 result = condition()
                 unknown = self.unknown() if alone else []
-            except (GLib.Error, LookupError, subprocess.CalledProcessError, Xlib.error.XError):
-                result, unknown = None, []  # what was looked at has just gone or is not there yet
+            except GONE:
+                result, unknown = None, []
             if unknown:
-                raise AssertionError(f"nobody expected {self.describe(unknown[0])}, waiting for {what()}")
+                raise AssertionError(self.report(lambda: f"nobody expected {self.describe(unknown[0])}", what))
             if result:
                 return result
             if alive and not self.is_running:
-                raise AssertionError(
-                    f"the program ended with {self.process.returncode} before this: {what()}\n{self.output()}"
-                )
+                raise AssertionError(self.report(lambda: f"the program ended with {self.process.returncode}", what))
             if time.monotonic() > deadline:
-                raise AssertionError(f"not seen: {what()}\nwindows: {self.windows()}\n{self.output()}")
+                raise AssertionError(self.report(lambda: f"nothing came but {self.windows()}", what))
             time.sleep(POLL)
+
+    def report(self, seen, what):
+        lines = []
+        for label, part in (("seen", seen), ("waiting for", what), ("output", self.output)):
+            try:
+                lines.append(f"{label}: {part()}")
+            except GONE:
+                lines.append(f"{label}: something that has gone")
+        return "\n".join(lines)
 
     def listen(self):
         while GLib.MainContext.default().iteration(False):
@@ -634,7 +659,7 @@ class Program:
 
     def note_menu(self, event):
         source = event.source
-        with contextlib.suppress(GLib.Error):  # it may have gone
+        with contextlib.suppress(*GONE):
             if event.detail1 and source and source.getRoleName() == MENU:
                 self.menus = [menu for menu in self.menus if menu.path != source.path] + [source]
 
@@ -689,10 +714,11 @@ class Program:
     # --- Acting
 
     def click(self, button, count):
-        place = (button, xdotool("getmouselocation", "--shell"))
+        place = (button, self.display.mouse())
         if place == self.last_click[0]:
             time.sleep(max(0.0, self.last_click[1] + DOUBLE_CLICK - time.monotonic()))
-        xdotool("click", "--repeat", count, "--delay", 20, button)
+        for _ in range(count):
+            self.display.click(button)
         self.last_click = (place, time.monotonic())
 
     def keys(self, *keys):
