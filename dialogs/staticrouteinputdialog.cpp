@@ -10,6 +10,7 @@
 #include <QMessageBox>
 #include <QRegularExpression>
 #include <QScrollBar>
+#include <QStyledItemDelegate>
 
 #include <algorithm>
 
@@ -32,6 +33,20 @@ QString optionWord(const QString &cell)
         return QString::number(prefixLength(cell));
     return QString{cell}.replace(QLatin1Char{'.'}, QLatin1Char{','});
 }
+
+/// Lets a screen reader say which column the cell is in that is being edited.
+class RouteDelegate final : public QStyledItemDelegate
+{
+public:
+    using QStyledItemDelegate::QStyledItemDelegate;
+
+    QWidget *createEditor(QWidget *parent, const QStyleOptionViewItem &option, const QModelIndex &index) const override
+    {
+        QWidget *editor{QStyledItemDelegate::createEditor(parent, option, index)};
+        editor->setAccessibleName(index.model()->headerData(index.column(), Qt::Horizontal).toString());
+        return editor;
+    }
+};
 
 /// Makes room for a whole address, also while it is edited, and for the title in every column, beside row numbers of up
 /// to three digits.
@@ -58,6 +73,7 @@ StaticRouteInputDialog::StaticRouteInputDialog(QWidget *parent)
 {
     m_ui->setupUi(this);
     m_ui->StaticRouteTable->setModel(m_model);
+    m_ui->StaticRouteTable->setItemDelegate(new RouteDelegate{m_ui->StaticRouteTable});
     m_ui->StaticRouteTable->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
     widenColumns(m_ui->StaticRouteTable);
     m_ui->addButton->setIcon(QIcon::fromTheme(QStringLiteral("list-add")));

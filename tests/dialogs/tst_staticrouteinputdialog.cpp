@@ -6,6 +6,7 @@
 #include "tests/support/modalboxes.h"
 #include "tests/support/temporaryroot.h"
 
+#include <QAccessible>
 #include <QApplication>
 #include <QCheckBox>
 #include <QDir>
@@ -77,6 +78,7 @@ private slots:
     void msRoutesAreTicked();
     void kindCanBeLocked();
     void routesAreTypedInPlace();
+    void screenReaderSaysWhichColumnIsEdited();
     void addAppendsAnEmptyRow();
     void emptyCellKeepsItOpen_data();
     void emptyCellKeepsItOpen();
@@ -175,6 +177,20 @@ void StaticRouteInputDialogTest::routesAreTypedInPlace()
     driver::click(dialog, QDialogButtonBox::Yes);
     QCOMPARE(dialog.result(), int{QDialog::Accepted});
     QCOMPARE(dialog.routes(), (QStringList{text("8"), text("10,0,0,0"), text("192,168,1,1")}));
+}
+
+void StaticRouteInputDialogTest::screenReaderSaysWhichColumnIsEdited()
+{
+    StaticRouteInputDialog dialog;
+    driver::open(dialog);
+    driver::click(button(dialog, "addButton"));
+    QStringList said;
+    for (int column{0}; column < table(dialog)->model()->columnCount(); ++column) {
+        typeInCell(dialog, 0, column, QString{});
+        said.append(QAccessible::queryAccessibleInterface(QApplication::focusWidget())->text(QAccessible::Name));
+        driver::press(Qt::Key_Escape);
+    }
+    QCOMPARE(said, (QStringList{text("Net mask"), text("IP net"), text("Gateway")}));
 }
 
 void StaticRouteInputDialogTest::addAppendsAnEmptyRow()
