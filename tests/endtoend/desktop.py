@@ -7,6 +7,7 @@ seen instead when that does not happen. A window that nobody expected fails it a
 """
 
 import contextlib
+import functools
 import os
 import pathlib
 import re
@@ -151,7 +152,7 @@ class Control:
 
     # --- Reading
 
-    @property
+    @functools.cached_property
     def role(self):
         return self.accessible.getRoleName()
 
