@@ -92,6 +92,16 @@ def shown_in(dialog):
     return {control.name: read[control.role](control) for control in dialog.below() if control.role in read}
 
 
+def steps(*fills):
+    """Does one after the other."""
+
+    def fill(dialog):
+        for step in fills:
+            step(dialog)
+
+    return fill
+
+
 def fields(texts):
     """Types texts into the fields of the names."""
 
@@ -119,16 +129,16 @@ def addresses(*texts):
     return fill
 
 
-def without_first_address(then):
-    """Takes the first address out of a list before THEN."""
+def without_first(role):
+    """Takes the first address out of a "list", or the first route out of a "table"."""
 
     def fill(dialog):
-        (view,) = dialog.all("list")
-        number = len(view.children)
-        view.children[0].click()
+        (view,) = dialog.all(role)
+        entries = view.cells if role == "table" else lambda: view.children
+        number = len(entries())
+        entries()[0].click()
         dialog.button("Remove").click()
-        dialog.program.wait(lambda: len(view.children) == number - 1, lambda: f"one less in {view}")
-        then(dialog)
+        dialog.program.wait(lambda: len(entries()) < number, lambda: f"less in {view}")
 
     return fill
 

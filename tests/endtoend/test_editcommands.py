@@ -16,9 +16,10 @@ from commandtest import (
     addresses,
     cell,
     form,
+    steps,
     time_form,
     with_block,
-    without_first_address,
+    without_first,
     words_form,
 )
 
@@ -61,7 +62,7 @@ group printers {
     option domain-name-servers 10.1.0.3;
     option ntp-servers 10.1.0.4;
     option domain-name "example.org";
-    option classless-static-routes 24, 192,168,1,0, 10,1,0,1;
+    option classless-static-routes 24, 192,168,1,0, 10,1,0,1, 16, 172,17,0,0, 10,1,0,1;
     option ms-classless-static-routes 16, 172,16,0,0, 10,1,0,2;
     option time-offset 3600;
 }
@@ -90,7 +91,7 @@ def edited(title, name, text, becomes):
 
 
 def routes_edited(shown, ms, fill):
-    return Dialog("Edit static route", {"Static routes": [shown], "Route for MS systems": ms}, fill, button="Yes")
+    return Dialog("Edit static route", {"Static routes": shown, "Route for MS systems": ms}, fill, button="Yes")
 
 
 def host_edited(shown, texts):
@@ -190,7 +191,11 @@ shared-network "big lab" {
     Edit(
         GROUP,
         Lines("Gateways: 10.1.0.1, 10.1.0.2", "option routers 10.1.0.1, 10.1.0.2;"),
-        Dialog("Edit gateways", {"Gateways:": ["10.1.0.1", "10.1.0.2"]}, without_first_address(addresses("10.1.0.9"))),
+        Dialog(
+            "Edit gateways",
+            {"Gateways:": ["10.1.0.1", "10.1.0.2"]},
+            steps(without_first("list"), addresses("10.1.0.9")),
+        ),
         Lines("Gateways: 10.1.0.2, 10.1.0.9", "option routers 10.1.0.2, 10.1.0.9;"),
     ),
     Edit(
@@ -213,16 +218,23 @@ shared-network "big lab" {
     ),
     Edit(
         GROUP,
-        Lines("Static route: 24, 192,168,1,0, 10,1,0,1", "option classless-static-routes 24, 192,168,1,0, 10,1,0,1;"),
-        routes_edited("255.255.255.0: 192.168.1.0: 10.1.0.1", False, cell(0, 2, "10.1.0.9")),
-        Lines("Static route: 24, 192,168,1,0, 10,1,0,9", "option classless-static-routes 24, 192,168,1,0, 10,1,0,9;"),
+        Lines(
+            "Static route: 24, 192,168,1,0, 10,1,0,1, 16, 172,17,0,0, 10,1,0,1",
+            "option classless-static-routes 24, 192,168,1,0, 10,1,0,1, 16, 172,17,0,0, 10,1,0,1;",
+        ),
+        routes_edited(
+            ["255.255.255.0: 192.168.1.0: 10.1.0.1", "255.255.0.0: 172.17.0.0: 10.1.0.1"],
+            False,
+            steps(without_first("table"), cell(0, 2, "10.1.0.9")),
+        ),
+        Lines("Static route: 16, 172,17,0,0, 10,1,0,9", "option classless-static-routes 16, 172,17,0,0, 10,1,0,9;"),
     ),
     Edit(
         GROUP,
         Lines(
             "Static route MS: 16, 172,16,0,0, 10,1,0,2", "option ms-classless-static-routes 16, 172,16,0,0, 10,1,0,2;"
         ),
-        routes_edited("255.255.0.0: 172.16.0.0: 10.1.0.2", True, cell(0, 0, "255.255.255.0")),
+        routes_edited(["255.255.0.0: 172.16.0.0: 10.1.0.2"], True, cell(0, 0, "255.255.255.0")),
         Lines(
             "Static route MS: 24, 172,16,0,0, 10,1,0,2", "option ms-classless-static-routes 24, 172,16,0,0, 10,1,0,2;"
         ),
