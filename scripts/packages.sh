@@ -11,7 +11,7 @@ util-linux xauth"
     [test]="at-spi2-core dpkg python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
     [fuzz]="clang libclang-rt-dev"
-    [lint]="clang-format clang-tidy clazy git shellcheck"
+    [lint]="black clang-format clang-tidy clazy flake8 git shellcheck"
 )
 
 # as_root COMMAND-LINE: has a shell of the superuser's run it, or prints it for somebody who can and fails.
