@@ -17,6 +17,7 @@
 #include <QCloseEvent>
 #include <QHeaderView>
 #include <QMessageBox>
+#include <QTextEdit>
 
 #include <utility>
 
@@ -124,6 +125,9 @@ bool FMain::confirmsSave(const QByteArray &content)
     connect(&check, &ConfigCheck::refused, &box, [&box](const QString &complaint, const QString &output) {
         box.setInformativeText(tr("The DHCP server refuses this configuration:\n%1").arg(complaint));
         box.setDetailedText(output);
+        // Qt leaves the field for it without a name that could be said.
+        if (auto *details = box.findChild<QTextEdit *>())
+            details->setAccessibleName(tr("Answer of the DHCP server"));
     });
     check.start(content);
     return box.exec() == QMessageBox::Save;

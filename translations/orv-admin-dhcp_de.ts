@@ -642,6 +642,10 @@ Möchten Sie fortfahren?</translation>
         <source>Clear the search</source>
         <translation>Suche leeren</translation>
     </message>
+    <message>
+        <source>Answer of the DHCP server</source>
+        <translation>Antwort des DHCP-Servers</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
