@@ -149,10 +149,7 @@ class ServedInterfaces(InterfacesTest):
         pid = machine.server_pid()
         self.choose("lan0", "lab0")
         self.assertEqual(machine.server_pid(), pid)
-        self.main.button("Restart DHCP-server").click()
-        self.wait(lambda: machine.server_pid() not in (None, pid), "another process")
-        self.wait_for_server("running")
-
+        self.restart_server()
         self.assertEqual(self.served(), ["lab0"])
         at_desk.ask()
         self.assertRegex(self.wait_for_address(at_bench), r"^10\.20\.30\.")

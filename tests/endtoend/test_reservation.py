@@ -59,12 +59,6 @@ class ReservationTest(ProgramTest):
         self.wait(lambda: not self.main.button("Save").is_enabled, "a saved configuration")
         self.assertEqual(machine.verdict(), "")
 
-    def restart_server(self):
-        pid = machine.server_pid()
-        self.main.button("Restart DHCP-server").click()
-        self.wait(lambda: machine.server_pid() not in (None, pid), "another process")
-        self.wait_for_server("running")
-
     def assert_in_file(self, name, mac, address):
         words, wanted = machine.CONFIGURATION.read_text().split(), declarations(name, mac, address)
         self.assertEqual(words.count(name), 1, words)

@@ -125,16 +125,13 @@ class RunningServer(ServiceTest):
 
     def test_is_restarted_by_the_tool_bar(self):
         self.main.button(RESTART).click()
-        self.wait_for_another_process()
+        self.wait_for_other_server(self.pid)
         self.assert_runs()
 
     def test_is_restarted_by_the_menu(self):
         self.main.choose("Server", RESTART)
-        self.wait_for_another_process()
+        self.wait_for_other_server(self.pid)
         self.assert_runs()
-
-    def wait_for_another_process(self):
-        self.wait(lambda: machine.server_pid() not in (None, self.pid), "another process")
 
     def test_that_somebody_else_stopped_is_left_stopped(self):
         machine.systemctl("stop")

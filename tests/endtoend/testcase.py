@@ -84,6 +84,16 @@ class ProgramTest(DesktopTest):
     def wait_for_server(self, state):
         self.wait(lambda: self.server_state == f"DHCP-server is {state}", f"a server that is {state}")
 
+    def wait_for_other_server(self, pid):
+        """Waits until the server runs as another process than that of before."""
+        self.wait(lambda: machine.server_pid() not in (None, pid), "another process of the server")
+        self.wait_for_server("running")
+
+    def restart_server(self):
+        pid = machine.server_pid()
+        self.main.button("Restart DHCP-server").click()
+        self.wait_for_other_server(pid)
+
     def client(self, mac, interface, host_name=None):
         """A machine that has newly come onto a wire, where it is for as long as the test."""
         client = machine.Client(mac, interface, host_name)
