@@ -262,11 +262,12 @@ class CommandTest(ProgramTest):
 
     def start(self):
         super().start()
+        self.topology = self.tree
         self.lines = self.shown_lines()
         self.file = file_lines(self.SITE)
 
     def shown_lines(self):
-        return tree_lines("\n".join(self.tree.lines()))
+        return tree_lines("\n".join(self.topology.lines()))
 
     def offered(self, menu):
         """The entries of an open menu and its submenus, each with the way to it."""
@@ -334,8 +335,8 @@ class CommandTest(ProgramTest):
         """The tree comes to hold these lines as well, in their order."""
         # What is below a new declaration is not shown before one opens its branch.
         for line, following in zip(lines, lines[1:]):
-            if following[:-1] == line and not self.tree.row(*line).is_expanded:
-                self.tree.row(*line).click()
+            if following[:-1] == line and not self.topology.row(*line).is_expanded:
+                self.topology.row(*line).click()
                 self.main.press("Right")
 
         def fits(shown):

@@ -28,8 +28,9 @@ PATIENCE = 90  # seconds until what never comes fails the test
 POLL = 0.02  # seconds between two looks
 DOUBLE_CLICK = 0.5  # seconds within which a second click at the same place would be one
 
-# The roles of menus, and of what is never searched for controls since it may have a million of them.
+# The roles of menus, of what is typed into, and of what is never searched for controls since it may have a million.
 MENU = "popup menu"
+FIELDS = ("text", "spin button")
 VIEWS = ("tree", "table")
 
 # What is raised by looking at something that has just gone, or is not there yet.
@@ -217,8 +218,10 @@ class Control:
         return control
 
     def wrap(self, accessible):
-        kind = {"tree": Tree, "table": Table, "spin button": SpinBox}.get(accessible.getRoleName(), Control)
-        return kind(self.program, accessible)
+        role = accessible.getRoleName()
+        control = {"tree": Tree, "table": Table, "spin button": SpinBox}.get(role, Control)(self.program, accessible)
+        control.role = role
+        return control
 
     def below(self):
         """All controls in it that can be seen, views with their cells left out."""
@@ -271,7 +274,8 @@ class Control:
     def enter(self, text):
         """Replaces what stands in a field by typing."""
         self.focus()
-        self.program.keys("ctrl+a", "Delete")
+        if self.text:
+            self.program.keys("ctrl+a", "Delete")
         self.program.type(text)
         self.program.wait(lambda: self.value == text, lambda: f"{self} with {text!r}; it has {self.text!r}")
 
@@ -342,7 +346,7 @@ class Window(Control):
         """The field for a text or number with the name."""
 
         def found():
-            fields = [control for role in ("text", "spin button") for control in self.all(role, name)]
+            fields = [control for control in self.below() if control.role in FIELDS and control.name == name]
             return fields[0] if len(fields) == 1 else None
 
         return self.program.wait(found, lambda: f"one field {name!r} in {self}; there are {list(self.below())}")
@@ -494,7 +498,9 @@ class View(Control):
         return [child for child in self.children if child.role == "table cell"]
 
     def cell_rows(self):
-        cells, columns = self.cells(), len(self.headers)
+        children = self.children
+        cells = [child for child in children if child.role == "table cell"]
+        columns = [child.role for child in children].count("table column header")
         return [cells[i : i + columns] for i in range(0, len(cells), columns)]
 
     @property

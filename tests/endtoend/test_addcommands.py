@@ -272,7 +272,7 @@ class Adds(CommandTest):
         """What the command adds to the file."""
 
         def choose():
-            self.tree.row(*place.row).context_menu().choose(*add.entries)
+            self.topology.row(*place.row).context_menu().choose(*add.entries)
 
         if place is add.places[0]:
             self.cancel(add.dialog, choose)
@@ -290,7 +290,7 @@ class Adds(CommandTest):
         for place in EVERYWHERE:
             run = {add.entries for add in ADDS if place in add.places} | (CHANGES if place != ROOT else set())
             with self.running("the menu", place):
-                self.assertEqual(self.offered(self.tree.row(*place.row).context_menu()), run)
+                self.assertEqual(self.offered(self.topology.row(*place.row).context_menu()), run)
 
     def test_all_network(self):
         self.add_to(ROOT, NEW_NETWORK)

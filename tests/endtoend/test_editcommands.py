@@ -354,7 +354,7 @@ class Changes(CommandTest):
         file = self.file
         for edit in edits:
             with self.running(edit, edit.place):
-                becomes = change(edit, self.tree.row(*edit.row))
+                becomes = change(edit, self.topology.row(*edit.row))
                 self.expect_instead(edit, becomes)
                 file = with_block(file, edit.place.file_lines(edit.before), edit.place.file_lines(becomes))
         self.assertEqual(self.save(), file)
@@ -371,7 +371,7 @@ class Changes(CommandTest):
 
     def remove(self, edit, row):
         row.context_menu().choose("Remove")
-        self.wait(lambda: self.tree.row(*edit.place.row).is_current, f"{edit.place} current")
+        self.wait(lambda: self.topology.row(*edit.place.row).is_current, f"{edit.place} current")
         return NOTHING
 
     def edit_in(self, place):
@@ -396,4 +396,4 @@ class Changes(CommandTest):
         for edit in EDITS:
             if "{" not in edit.before.file:  # those of blocks add as well, and are run by the tests of that
                 with self.running("the menu", edit.place):
-                    self.assertEqual(self.offered(self.tree.row(*edit.row).context_menu()), CHANGES)
+                    self.assertEqual(self.offered(self.topology.row(*edit.row).context_menu()), CHANGES)
