@@ -5,8 +5,17 @@
 #include "common/paths.h"
 
 #include <QFile>
+#include <QProcess>
 #include <QSettings>
+#include <QTabBar>
+#include <QTabWidget>
 #include <QTest>
+
+namespace {
+
+constexpr int patience = 60'000; // milliseconds until a command that does not end fails the test
+
+} // namespace
 
 FakePrograms::FakePrograms()
     : m_oldPath{qgetenv("PATH")}
@@ -44,4 +53,26 @@ std::unique_ptr<FMain> TestMachine::openWindow() const
     if (!QTest::qWaitForWindowActive(window.get()))
         QTest::qFail("the main window never became active", __FILE__, __LINE__);
     return window;
+}
+
+void clickTab(const FMain &window, int tab)
+{
+    auto *bar = window.findChild<QTabWidget *>(QStringLiteral("mainTabWidget"))->tabBar();
+    QTest::mouseClick(bar, Qt::LeftButton, {}, bar->tabRect(tab).center());
+}
+
+ModalBoxes::Box cannotRead()
+{
+    return errorBox(QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()));
+}
+
+void runOutside(const QString &path, const QByteArray &command, const QByteArray &input)
+{
+    QProcess shell;
+    shell.start(QStringLiteral("sh"),
+                {QStringLiteral("-ec"), QString::fromLatin1(command), QStringLiteral("sh"), path});
+    shell.write(input);
+    shell.closeWriteChannel();
+    QTRY_COMPARE_WITH_TIMEOUT(shell.state(), QProcess::NotRunning, patience);
+    QCOMPARE(shell.exitCode(), 0);
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "tests/support/fakesystemctl.h"
+#include "tests/support/modalboxes.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QByteArray>
@@ -52,3 +53,13 @@ private:
     FakeSystemctl m_systemctl;
     QTemporaryDir m_settings;
 };
+
+/// Clicks a tab of the window: 0 is the topology, 1 the leases.
+void clickTab(const FMain &window, int tab);
+
+/// The box that tells that the configuration could not be read.
+ModalBoxes::Box cannotRead();
+
+/// Runs a shell command with `path` as its argument and `input` as its input, while the windows go on. Fails the test
+/// when the command does.
+void runOutside(const QString &path, const QByteArray &command, const QByteArray &input = {});

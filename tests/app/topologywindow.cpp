@@ -325,8 +325,6 @@ void save(const QDialog &dialog)
     driver::click(dialog, accepting);
 }
 
-ModalBoxes::Box errorBox(const QString &text) { return {QMessageBox::Critical, QStringLiteral("Error"), text}; }
-
 ModalBoxes::Box advancedBox()
 {
     return {QMessageBox::Warning, QStringLiteral("Warning!"),

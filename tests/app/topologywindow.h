@@ -99,7 +99,6 @@ Fill typeInCell(int row, int column, const QString &text);
 /// Presses the button that accepts a dialog.
 void save(const QDialog &dialog);
 
-ModalBoxes::Box errorBox(const QString &text);
 /// The question of all commands on free text.
 ModalBoxes::Box advancedBox();
 

@@ -15,12 +15,9 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QHeaderView>
-#include <QProcess>
 #include <QPushButton>
 #include <QRegularExpression>
 #include <QSignalSpy>
-#include <QTabBar>
-#include <QTabWidget>
 #include <QTableView>
 #include <QTest>
 #include <QTreeView>
@@ -60,19 +57,9 @@ ModalBoxes::Box reloadQuestion()
             QMessageBox::Yes};
 }
 
-ModalBoxes::Box errorBox(const QString &text)
-{
-    return {QMessageBox::Critical, QStringLiteral("Error"), text, QMessageBox::Ok, QMessageBox::Ok};
-}
-
 ModalBoxes::Box cannotWrite()
 {
     return errorBox(QStringLiteral("Unable to open file '%1' for write").arg(paths::configuration()));
-}
-
-ModalBoxes::Box cannotRead()
-{
-    return errorBox(QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()));
 }
 
 /// The window on the configuration, and how often it is told of a change of the file.
@@ -136,21 +123,11 @@ struct Site final
     QSignalSpy notices;
 };
 
-/// Runs a shell command with the path of the configuration as its argument, while the window goes on.
-void runOutside(const QByteArray &command)
-{
-    QProcess shell;
-    shell.start(QStringLiteral("sh"),
-                {QStringLiteral("-ec"), QString::fromLatin1(command), QStringLiteral("sh"), paths::configuration()});
-    QTRY_COMPARE_WITH_TIMEOUT(shell.state(), QProcess::NotRunning, 60'000);
-    QCOMPARE(shell.exitCode(), 0);
-}
-
 /// A change of the file in one notice.
 void changeOutside(const Site &site)
 {
     const int before = site.notices.count();
-    runOutside(R"(echo '# by hand' >>"$1")");
+    runOutside(paths::configuration(), R"(echo '# by hand' >>"$1")");
     QTRY_VERIFY(site.notices.count() > before);
     site.settle();
 }
@@ -323,7 +300,7 @@ void FileCommandsTest::outsideChangeIsNoticed()
 {
     QFETCH(QByteArray, command);
     const Site site{*m_machine, *m_boxes};
-    runOutside(command);
+    runOutside(paths::configuration(), command);
     QTRY_VERIFY(site.notices.count() > 0);
     site.settle();
     changeOutside(site); // the file that is there now is watched
@@ -338,7 +315,7 @@ void FileCommandsTest::burstOfWritesIsFewNotices()
     Site site{*m_machine, *m_boxes};
     QElapsedTimer timer;
     timer.start();
-    runOutside(R"(i=0; while [ $i -lt 1000 ]; do echo '# again' >>"$1"; i=$((i + 1)); done)");
+    runOutside(paths::configuration(), R"(i=0; while [ $i -lt 1000 ]; do echo '# again' >>"$1"; i=$((i + 1)); done)");
     site.settle();
     QVERIFY(site.notices.count() > 0);
     // Each notice ends a tenth of a second, however long the writes took.
@@ -351,7 +328,8 @@ void FileCommandsTest::burstOfWritesIsFewNotices()
 void FileCommandsTest::steadyWritingIsNoticedMeanwhile()
 {
     const Site site{*m_machine, *m_boxes};
-    runOutside(R"(i=0; while [ $i -lt 100 ]; do echo '# again' >>"$1"; sleep 0.02; i=$((i + 1)); done)");
+    runOutside(paths::configuration(),
+               R"(i=0; while [ $i -lt 100 ]; do echo '# again' >>"$1"; sleep 0.02; i=$((i + 1)); done)");
     QVERIFY(site.notices.count() > 1);
 }
 
@@ -400,7 +378,7 @@ void FileCommandsTest::failedSaveChangesNothing()
 void FileCommandsTest::failedSaveKeepsChangedOutside()
 {
     const Site site{*m_machine, *m_boxes};
-    runOutside(R"(rm "$1"; mkdir "$1")");
+    runOutside(paths::configuration(), R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
     ModalBoxes &boxes = *m_boxes;
@@ -410,7 +388,7 @@ void FileCommandsTest::failedSaveKeepsChangedOutside()
     boxes.verify();
     QVERIFY(site.isModified());
     QVERIFY(QFileInfo{paths::configuration()}.isDir());
-    runOutside(R"(rmdir "$1")");
+    runOutside(paths::configuration(), R"(rmdir "$1")");
     site.settle();
     site.save(overwriteText);
     QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
@@ -525,8 +503,7 @@ void FileCommandsTest::reloadOfLeasesAsksNothing()
     // A directory that is not there at the start is not watched.
     QVERIFY(QDir{paths::leaseDirectory()}.removeRecursively());
     const Site site{*m_machine, *m_boxes};
-    auto *tabs = site.window->findChild<QTabWidget *>(QStringLiteral("mainTabWidget"))->tabBar();
-    QTest::mouseClick(tabs, Qt::LeftButton, {}, tabs->tabRect(1).center());
+    clickTab(*site.window, 1);
     QVERIFY(QDir{}.mkpath(paths::leaseDirectory()));
     writeTestFile(paths::leases(), "lease 10.0.0.10 {\n}\n");
     const auto *leases = site.window->findChild<QTableView *>(QStringLiteral("dhcpdLeaseTable"))->model();
@@ -599,7 +576,7 @@ void FileCommandsTest::closingQuestionHasNoDefault()
 void FileCommandsTest::unwrittenConfigurationIsKept()
 {
     const Site site{*m_machine, *m_boxes};
-    runOutside(R"(rm "$1"; mkdir "$1")");
+    runOutside(paths::configuration(), R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
     const QByteArray unsaved = site.model->fileContent();

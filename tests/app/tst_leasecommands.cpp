@@ -15,10 +15,8 @@
 #include <QFile>
 #include <QLineEdit>
 #include <QMenu>
-#include <QProcess>
 #include <QPushButton>
 #include <QScrollBar>
-#include <QTabBar>
 #include <QTableView>
 #include <QTest>
 #include <QToolButton>
@@ -48,17 +46,6 @@ host delta {
 }
 )";
 
-/// Runs a shell command with the path of the lease file as its argument, while the window goes on.
-void runOutside(const QString &command, const QByteArray &input = {})
-{
-    QProcess shell;
-    shell.start(QStringLiteral("sh"), {QStringLiteral("-ec"), command, QStringLiteral("sh"), paths::leases()});
-    shell.write(input);
-    shell.closeWriteChannel();
-    QTRY_COMPARE(shell.state(), QProcess::NotRunning);
-    QCOMPARE(shell.exitCode(), 0);
-}
-
 /// The window, with the leases in front, driven as by a user.
 struct Site final
 {
@@ -72,7 +59,7 @@ struct Site final
         , tree{window->findChild<QTreeView *>(QStringLiteral("topologyTree"))}
         , model{window->findChild<DhcpdConfigModel *>()}
     {
-        QTest::mouseClick(tabs->tabBar(), Qt::LeftButton, {}, tabs->tabBar()->tabRect(1).center());
+        clickTab(*window, 1);
     }
 
     QString cell(int row, int column) const { return table->model()->index(row, column).data().toString(); }
@@ -514,7 +501,7 @@ void LeaseCommandsTest::reservationOutlivesAReload()
     const Site site{*m_machine};
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>([&site](HostInputDialog *dialog) {
-        runOutside(QStringLiteral(R"(cat >"$1")"), lease("10.9.9.9", "other"));
+        runOutside(paths::leases(), R"(cat >"$1")", lease("10.9.9.9", "other"));
         QTRY_COMPARE(site.table->model()->rowCount(), 1);
         QCOMPARE(dialog->ip(), QStringLiteral("10.0.0.10"));
         save(dialog);
@@ -530,10 +517,7 @@ void LeaseCommandsTest::reservationNeedsAConfiguration()
 {
     QVERIFY(QFile::remove(paths::configuration()));
     ModalBoxes boxes;
-    boxes.expectBox({QMessageBox::Critical, QStringLiteral("Error"),
-                     QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()), QMessageBox::Ok,
-                     QMessageBox::Ok},
-                    QMessageBox::Ok);
+    boxes.expectBox(cannotRead(), QMessageBox::Ok);
     const Site site{*m_machine};
     boxes.verify();
     site.doubleClick("10.0.0.10");
@@ -552,17 +536,17 @@ void LeaseCommandsTest::reservationNeedsALease()
 
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data()
 {
-    QTest::addColumn<QString>("command");
-    QTest::addRow("appended to") << QStringLiteral(R"(cat >>"$1")");
-    QTest::addRow("replaced") << QStringLiteral(R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")");
+    QTest::addColumn<QByteArray>("command");
+    QTest::addRow("appended to") << QByteArray{R"(cat >>"$1")"};
+    QTest::addRow("replaced") << QByteArray{R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
     QTest::addRow("replaced, the old one kept")
-        << QStringLiteral(R"(ln -f "$1" "$1~"; cat "$1" - >"$1.new"; mv "$1.new" "$1")");
-    QTest::addRow("written anew") << QStringLiteral(R"({ cat "$1"; cat; } >"$1.all"; cat "$1.all" >"$1")");
+        << QByteArray{R"(ln -f "$1" "$1~"; cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
+    QTest::addRow("written anew") << QByteArray{R"({ cat "$1"; cat; } >"$1.all"; cat "$1.all" >"$1")"};
 }
 
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
 {
-    QFETCH(QString, command);
+    QFETCH(QByteArray, command);
     QByteArray leases;
     for (int i = 0; i < 400; ++i)
         leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
@@ -577,7 +561,7 @@ void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
     for (const char *address : {"9.0.0.1", "10.0.0.201", "10.0.0.202", "11.0.0.1"})
         more += lease(address, "more");
     for (int round = 0; round < 2; ++round) {
-        runOutside(command, more);
+        runOutside(paths::leases(), command, more);
         QTRY_COMPARE(site.table->model()->rowCount(), 404 + round);
         QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.100"));
         QCOMPARE(site.table->currentIndex().column(), 2);
@@ -593,7 +577,7 @@ void LeaseCommandsTest::leaseThatLeavesTheFilterHasNoSuccessor()
     const Site site{*m_machine};
     site.type(QStringLiteral("active"));
     site.click("10.0.0.2", 2);
-    runOutside(QStringLiteral(R"(cat >>"$1")"), lease("10.0.0.2", "b", "free"));
+    runOutside(paths::leases(), R"(cat >>"$1")", lease("10.0.0.2", "b", "free"));
     QTRY_COMPARE(site.table->model()->rowCount(), 2);
     QTRY_VERIFY(!site.table->currentIndex().isValid());
     QVERIFY(!site.table->selectionModel()->hasSelection());
@@ -620,11 +604,10 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
     site.press(site.next);
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.10"));
 
-    for (const QString &command :
-         {QStringLiteral(R"(cat >>"$1")"), QStringLiteral(R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")")}) {
+    for (const char *command : {R"(cat >>"$1")", R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")"}) {
         const int before = site.table->model()->rowCount();
         const QByteArray address = "9.0.0." + QByteArray::number(before);
-        runOutside(command, lease(address, "alphabet") + lease("8.0.0.1", "other"));
+        runOutside(paths::leases(), command, lease(address, "alphabet") + lease("8.0.0.1", "other"));
         QTRY_COMPARE(site.table->model()->rowCount(), before + 1); // the filter holds
         QCOMPARE(site.field->text(), QStringLiteral("bet"));
         QCOMPARE(site.field->styleSheet(), foundStyle);
@@ -637,7 +620,7 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
     QTest::keyClick(site.field, Qt::Key_A, Qt::ControlModifier);
     site.type(QStringLiteral("zeta"));
     QCOMPARE(site.field->styleSheet(), notFoundStyle);
-    runOutside(QStringLiteral(R"(cat >>"$1")"), lease("9.0.0.99", "zeta"));
+    runOutside(paths::leases(), R"(cat >>"$1")", lease("9.0.0.99", "zeta"));
     QTRY_COMPARE(site.addresses(), QStringList{QStringLiteral("9.0.0.99")});
     QCOMPARE(site.field->styleSheet(), notFoundStyle);
     QVERIFY(site.stepsAreDisabled());

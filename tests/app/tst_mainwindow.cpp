@@ -21,7 +21,6 @@
 #include <QSortFilterProxyModel>
 #include <QStackedWidget>
 #include <QStatusBar>
-#include <QTabBar>
 #include <QTableView>
 #include <QTest>
 #include <QToolBar>
@@ -71,12 +70,6 @@ void click(QTreeView *tree, const Place &place)
     QVERIFY(index.isValid());
     QTest::mouseClick(tree->viewport(), Qt::LeftButton, {}, tree->visualRect(index).center());
     QCOMPARE(tree->currentIndex(), index);
-}
-
-void clickTab(const FMain &window, int tab)
-{
-    auto *bar = window.findChild<QTabWidget *>(QStringLiteral("mainTabWidget"))->tabBar();
-    QTest::mouseClick(bar, Qt::LeftButton, {}, bar->tabRect(tab).center());
 }
 
 QTreeView *treeOf(const FMain &window) { return window.findChild<QTreeView *>(QStringLiteral("topologyTree")); }
@@ -211,11 +204,6 @@ private:
     QStringList m_formerPaths{QIcon::themeSearchPaths()};
     QString m_formerName{QIcon::themeName()};
 };
-
-ModalBoxes::Box errorBox(const QString &text)
-{
-    return {QMessageBox::Critical, QStringLiteral("Error"), text, QMessageBox::Ok, QMessageBox::Ok};
-}
 
 ModalBoxes::Box informationBox(const QString &text)
 {
@@ -916,8 +904,7 @@ void MainWindowTest::configurationThatCannotBeReadIsReported()
     if (directory)
         QVERIFY(QDir{}.mkpath(paths::configuration()));
     ModalBoxes boxes;
-    boxes.expectBox(errorBox(QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration())),
-                    QMessageBox::Ok);
+    boxes.expectBox(cannotRead(), QMessageBox::Ok);
     const FMain window;
     boxes.verify();
     QCOMPARE(treeOf(window)->model()->rowCount(), 0);

@@ -227,3 +227,5 @@ void ModalBoxes::compare(const Box &expected, const QMessageBox &box) const
     check("informative text", shown(box.informativeText()), shown(expected.informativeText));
     check("detailed text", shown(box.detailedText()), shown(expected.detailedText));
 }
+
+ModalBoxes::Box errorBox(const QString &text) { return {QMessageBox::Critical, QStringLiteral("Error"), text}; }

@@ -99,3 +99,6 @@ private:
     std::deque<Expected> m_expected;
     int m_open{0};
 };
+
+/// The box in which the program tells of an error.
+ModalBoxes::Box errorBox(const QString &text);
