@@ -85,7 +85,7 @@ def shown_in(dialog):
     read = {
         "text": lambda field: field.text,
         "spin button": lambda field: field.text,
-        "check box": lambda box: box.is_checked,
+        "check box": lambda box: box.states & {"checked", "enabled"},
         "list": lambda view: [item.name for item in view.children],
         "table": lambda table: table.labels(),
     }

@@ -77,7 +77,7 @@ def new_subnet(texts):
 
 
 def new_routes(fill):
-    shown = {"Static routes": [], "Route for MS systems": False}
+    shown = {"Static routes": [], "Route for MS systems": {"enabled"}}
     return Dialog("Add static route", shown, fill, button="Yes")
 
 

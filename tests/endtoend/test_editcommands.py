@@ -91,7 +91,8 @@ def edited(title, name, text, becomes):
 
 
 def routes_edited(shown, ms, fill):
-    return Dialog("Edit static route", {"Static routes": shown, "Route for MS systems": ms}, fill, button="Yes")
+    shown = {"Static routes": shown, "Route for MS systems": {"checked"} if ms else set()}
+    return Dialog("Edit static route", shown, fill, button="Yes")
 
 
 def host_edited(shown, texts):
