@@ -33,8 +33,8 @@ MENU = "popup menu"
 FIELDS = ("text", "spin button")
 VIEWS = ("tree", "table")
 
-# What is raised by looking at something that has just gone, or is not there yet.
-GONE = (GLib.Error, LookupError, subprocess.CalledProcessError, Xlib.error.XError)
+# What is raised by looking at something that has just gone, or is not there yet. What has gone has no interfaces.
+GONE = (GLib.Error, LookupError, NotImplementedError, subprocess.CalledProcessError, Xlib.error.XError)
 
 
 def xdotool(*arguments):

@@ -391,7 +391,11 @@ class Changes(CommandTest):
         self.edit_in(CAMERA)
 
     def test_remove(self):
-        self.change(EDITS, self.remove)
+        subnet = self.topology.row(*SUBNET.row)
+        subnet.click()
+        self.main.press("Left")
+        self.wait(lambda: not subnet.is_expanded, "a closed branch")
+        self.change(EDITS, self.remove)  # opens it again
 
     def test_all_entries_of_the_menus_are_run(self):
         for edit in EDITS:
