@@ -7,6 +7,7 @@
 
 #include <QByteArray>
 #include <QModelIndex>
+#include <QString>
 #include <QStringList>
 
 #include <functional>
@@ -17,6 +18,10 @@ class QAction;
 class QDialog;
 class QMenu;
 class QTreeView;
+
+inline QString text(const char *utf8) { return QString::fromUtf8(utf8); }
+/// The texts between " | ".
+inline QStringList list(const char *bars) { return text(bars).split(text(" | ")); }
 
 /// The main window on a configuration, whose topology tree is driven as by a user. The bind9 package is installed.
 ///

@@ -14,10 +14,6 @@
 
 namespace {
 
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
-
-QStringList list(const char *comma) { return text(comma).split(text(" | ")); }
-
 constexpr auto configuration = R"(default-lease-time 600;
 option domain-name "a.org";
 subnet 10.0.0.0 netmask 255.255.255.0 {

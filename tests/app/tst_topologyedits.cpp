@@ -11,10 +11,6 @@
 
 namespace {
 
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
-
-QStringList list(const char *bars) { return text(bars).split(text(" | ")); }
-
 // Much of it as only a hand writes it.
 constexpr auto configuration = R"(default-lease-time 600;
 max-lease-time 40000000;

@@ -15,8 +15,6 @@
 
 namespace {
 
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
-
 constexpr auto configuration = R"(authoritative;
 default-lease-time 600;
 MAX-Lease-Time 7200;

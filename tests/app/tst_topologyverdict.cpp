@@ -11,10 +11,6 @@
 
 namespace {
 
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
-
-QStringList list(const char *bars) { return text(bars).split(text(" | ")); }
-
 constexpr auto configuration = R"(authoritative;
 min-lease-time 60;
 subnet 10.0.0.0 netmask 255.255.255.0 {
