@@ -106,7 +106,8 @@ class Reservation(ReservationTest):
         self.restart_server()
         self.desk.ask()
         self.assertEqual(self.wait_for_address(self.desk), self.address)
-        self.assertIn(f"DHCPACK on {self.address} to {MAC}", machine.journal().split("Stopped")[-1])
+        granted = f"DHCPACK on {self.address} to {MAC}"
+        self.wait(lambda: granted in machine.journal().split("Stopped")[-1], f"the restarted server's {granted}")
         self.main.find("page tab", "Topology").click()
         self.assert_in_tree("desk", MAC, self.address)
 
