@@ -35,7 +35,9 @@ case ${1:-} in
 --screenshot)
     mode=screenshot
     [ $# -ge 2 ] || refuse "--screenshot needs the name of a file"
-    picture=$(cd "$OLDPWD" && realpath -- "$2")
+    if ! picture=$(cd "$OLDPWD" && realpath -- "$2" 2>/dev/null) || [ -d "$picture" ]; then
+        refuse "--screenshot needs the name of a file, in a folder that exists"
+    fi
     shift
     ;;
 -h | --help)
@@ -52,11 +54,14 @@ if [ "$mode" != screenshot ] && [ -z "${DISPLAY:-}${WAYLAND_DISPLAY:-}" ]; then
     exit 1
 fi
 
+groups=(build run)
 if [ "$mode" = screenshot ]; then
-    require_packages build run screenshot
-else
-    require_packages build run
+    groups+=(screenshot)
+elif [ -z "${DISPLAY:-}" ]; then
+    groups+=(wayland)
+    export QT_QPA_PLATFORM=${QT_QPA_PLATFORM:-wayland}
 fi
+require_packages "${groups[@]}"
 [ "$mode" = system ] || scripts/fetch-tools isc-dhcp-server isc-dhcp-client
 scripts/build release
 site=(scripts/private-network demo/open-site "$program")
@@ -65,7 +70,11 @@ site=(scripts/private-network demo/open-site "$program")
 session_variables() {
     local name
     export XAUTHORITY="${XAUTHORITY:-$HOME/.Xauthority}"
-    for name in DISPLAY XAUTHORITY LANG LANGUAGE LC_ALL; do
+    case ${WAYLAND_DISPLAY:-} in
+    "" | /*) ;;
+    *) WAYLAND_DISPLAY=${XDG_RUNTIME_DIR:-}/$WAYLAND_DISPLAY ;;
+    esac
+    for name in DISPLAY XAUTHORITY WAYLAND_DISPLAY QT_QPA_PLATFORM LANG LANGUAGE LC_ALL; do
         [ -z "${!name:-}" ] || echo "$name=${!name}"
     done
 }

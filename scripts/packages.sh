@@ -7,6 +7,7 @@ declare -A packages=(
     [build]="cmake g++ ninja-build qtbase5-dev qttools5-dev qttools5-dev-tools"
     [run]="breeze-icon-theme dbus-daemon fonts-dejavu-core iproute2 libqt5svg5 mount procps qttranslations5-l10n socat \
 util-linux xauth"
+    [wayland]="qtwayland5"
     [screenshot]="maim xauth xdotool xvfb"
     [test]="at-spi2-core dpkg python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
@@ -31,8 +32,9 @@ missing_packages() {
     local group package
     for group; do
         for package in ${packages[$group]}; do
-            [ "$(dpkg-query --show --showformat='${db:Status-Status}' "$package" 2>/dev/null)" = installed ] ||
-                echo "$package"
+            # A line for each architecture that it is known of.
+            dpkg-query --show --showformat='${db:Status-Status}\n' "$package" 2>/dev/null |
+                grep --quiet --line-regexp installed || echo "$package"
         done
     done
 }
