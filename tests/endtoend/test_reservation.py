@@ -155,7 +155,7 @@ class Reservation(ReservationTest):
     def test_goes_with_the_lease_that_the_menu_was_opened_for(self):
         menu = self.row(self.desk).context_menu()
         with machine.LEASES.open("a") as file:  # which fills the table anew while the menu is open
-            file.write("lease 10.20.10.2 {\n  hardware ethernet 02:00:00:00:10:02;\n  client-hostname \"before\";\n}\n")
+            file.write('lease 10.20.10.2 {\n  hardware ethernet 02:00:00:00:10:02;\n  client-hostname "before";\n}\n')
         self.wait(lambda: self.main.find("table", "Leases").row("before"), "the other lease")
         menu.choose(COMMAND)
         dialog = self.dialog()
