@@ -348,14 +348,6 @@ class CommandTest(ProgramTest):
 
     def save(self):
         """Saves. What the file holds then, which the server must accept and the tree must show."""
-        self.main.press("ctrl+s")
-        self.message(
-            "Information",
-            "Current configuration in file will be rewrited.\nDo you want to save changes?",
-            buttons=["Save", "Cancel"],
-            default="Save",
-        ).answer("Save")
-        self.wait(lambda: not self.main.button("Save").is_enabled, "a saved file")
-        self.assertEqual(machine.verdict(), "")
+        super().save()
         self.assertEqual(self.shown_lines(), self.lines)
         return file_lines(machine.CONFIGURATION.read_text())

@@ -3,6 +3,7 @@
 
 import machine
 from test_saving import CANNOT_WRITE, CONFIGURATION, NEW_LEASE_TIME, SAVED, SavingTest
+from testcase import CANCELLATIONS
 
 
 class Closing(SavingTest):
@@ -15,8 +16,9 @@ class Closing(SavingTest):
         self.assertEqual(self.program.wait_ended(), 0)
 
     def test_asks_nothing_without_changes(self):
-        for close in (self.main.close, lambda: self.main.choose("File", "Exit")):
-            with self.subTest(close):
+        commands = {"frame": lambda: self.main.close(), "menu": lambda: self.main.choose("File", "Exit")}
+        for name, close in commands.items():
+            with self.subTest(by=name):
                 close()
                 self.assert_ended()
                 self.start()
@@ -31,12 +33,13 @@ class Closing(SavingTest):
 
     def test_can_be_cancelled(self):
         self.edit()
-        for answer in (lambda box: box.answer("Cancel"), lambda box: box.press("Escape"), lambda box: box.close()):
-            self.main.close()
-            box = self.confirmation()
-            answer(box)
-            box.wait_closed()
-            self.tree.row(*NEW_LEASE_TIME)
+        for name, cancel in CANCELLATIONS.items():
+            with self.subTest(by=name):
+                self.main.close()
+                box = self.confirmation()
+                cancel(box)
+                box.wait_closed()
+                self.tree.row(*NEW_LEASE_TIME)
         self.assert_not_saved()
         self.save()
 
@@ -44,7 +47,7 @@ class Closing(SavingTest):
         self.edit()
         self.main.close()
         self.confirmation().answer("Yes")
-        self.question().answer("Save")
+        self.save_question().answer("Save")
         self.assert_ended()
         self.assert_saved()
 
@@ -52,7 +55,7 @@ class Closing(SavingTest):
         self.edit()
         self.main.choose("File", "Exit")
         self.confirmation().answer("Yes")
-        self.question().answer("Cancel")
+        self.save_question().answer("Cancel")
         self.assert_ended()
         self.assert_not_saved()
 
@@ -61,7 +64,7 @@ class Closing(SavingTest):
         with self.read_only_folder():
             self.main.close()
             self.confirmation().answer("Yes")
-            self.question().answer("Save")
+            self.save_question().answer("Save")
             self.message("Error", CANNOT_WRITE).answer("OK")
             self.assert_ended()
         self.assertEqual(machine.CONFIGURATION.read_text(), CONFIGURATION)

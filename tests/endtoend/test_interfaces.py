@@ -54,12 +54,7 @@ class InterfacesTest(ProgramTest):
         """Saves the choice of a dialog up to the question."""
         dialog.button("Save").click()
         dialog.wait_closed()
-        return self.message(
-            "Information",
-            "Current configuration in file will be rewrited.\nDo you want to save changes?",
-            buttons=["Save", "Cancel"],
-            default="Save",
-        )
+        return self.save_question()
 
     def choose(self, *names):
         """Changes whether these are served."""

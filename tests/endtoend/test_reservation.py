@@ -2,7 +2,7 @@
 """Reserving the address of a lease."""
 
 import machine
-from testcase import ProgramTest
+from testcase import CANCELLATIONS, ProgramTest
 
 COMMAND = "Reserve an IP address"
 MAC = "02:00:00:00:10:0a"
@@ -47,17 +47,6 @@ class ReservationTest(ProgramTest):
             default="Yes",
         )
         question.answer("Yes" if go_to_topology else "No")
-
-    def save(self):
-        self.main.choose("File", "Save")
-        self.message(
-            "Information",
-            "Current configuration in file will be rewrited.\nDo you want to save changes?",
-            buttons=["Save", "Cancel"],
-            default="Save",
-        ).answer("Save")
-        self.wait(lambda: not self.main.button("Save").is_enabled, "a saved configuration")
-        self.assertEqual(machine.verdict(), "")
 
     def assert_in_file(self, name, mac, address):
         words, wanted = machine.CONFIGURATION.read_text().split(), declarations(name, mac, address)
@@ -138,12 +127,7 @@ class Reservation(ReservationTest):
         self.assert_in_file("typed", OTHER_MAC, "10.20.10.60")
 
     def test_can_be_cancelled(self):
-        cancellations = {
-            "button": lambda dialog: dialog.button("Cancel").click(),
-            "key": lambda dialog: dialog.press("Escape"),
-            "frame": lambda dialog: dialog.close(),
-        }
-        for name, cancel in cancellations.items():
+        for name, cancel in CANCELLATIONS.items():
             with self.subTest(by=name):
                 self.row(self.desk).double_click()
                 dialog = self.dialog()

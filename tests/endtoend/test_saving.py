@@ -6,7 +6,7 @@ import os
 import stat
 
 import machine
-from testcase import ProgramTest
+from testcase import CANCELLATIONS, SAVE_QUESTION, ProgramTest
 
 CONFIGURATION = """\
 # The laboratory
@@ -24,7 +24,6 @@ SAVED_REFUSED = SAVED.replace("subnet", REFUSED + "subnet", 1)
 COMPLAINT = "line 2: semicolon expected."
 CHANGED_OUTSIDE = "default-lease-time 99;\n"
 
-QUESTION = "Current configuration in file will be rewrited.\nDo you want to save changes?"
 QUESTION_IF_CHANGED = "The configuration has been changed.\nDo you want to overwrite the configuration?"
 CANNOT_WRITE = "Unable to open file '/etc/dhcp/dhcpd.conf' for write"
 
@@ -58,24 +57,19 @@ class SavingTest(ProgramTest):
         dialog.wait_closed()
         self.tree.row(*NEW_LEASE_TIME)
 
-    def question(self, text=QUESTION):
-        """The question before saving, after the server has had nothing to say against it."""
-        box = self.message("Information", text, buttons=["Save", "Cancel"], default="Save")
+    def save_question(self, text=SAVE_QUESTION):
+        """As ever, and the server has nothing to say against it."""
+        box = super().save_question(text)
         self.wait(lambda: not self.program.child_processes(), "the end of the server's check")
         self.assertEqual(box.informative_text, "")
         return box
-
-    def save(self, text=QUESTION):
-        self.main.press("ctrl+s")
-        self.question(text).answer("Save")
-        self.wait_offered(False)
 
     @property
     def is_offered(self):
         return self.main.button("Save").is_enabled
 
-    def wait_offered(self, offered):
-        self.wait(lambda: self.is_offered == offered, f"a command to save that is {'' if offered else 'not '}offered")
+    def wait_until_offered(self):
+        self.wait(lambda: self.is_offered, "a command to save")
 
     def assert_saved(self):
         self.assertEqual(machine.CONFIGURATION.read_text(), SAVED)
@@ -93,35 +87,36 @@ class Saving(SavingTest):
         self.main.press("Escape")
         self.assertFalse(self.is_offered)
         self.edit()
-        self.wait_offered(True)
+        self.wait_until_offered()
         self.save()
         self.assertEqual(self.tree.lines()[1].strip(), NEW_LEASE_TIME[1])
 
     def test_from_the_menu_writes_what_the_server_accepts(self):
         self.edit()
         self.main.choose("File", "Save")
-        self.question().answer("Save")
-        self.wait_offered(False)
+        self.save_question().answer("Save")
+        self.wait_for_save()
         self.assert_saved()
 
     def test_by_keys_writes_what_the_server_accepts(self):
         self.edit()
         self.main.press("ctrl+s")
-        box = self.question()
+        box = self.save_question()
         box.press("Return")
         box.wait_closed()
-        self.wait_offered(False)
+        self.wait_for_save()
         self.assert_saved()
 
     def test_can_be_cancelled(self):
         self.edit()
-        for answer in (lambda box: box.answer("Cancel"), lambda box: box.press("Escape"), lambda box: box.close()):
-            self.main.press("ctrl+s")
-            box = self.question()
-            answer(box)
-            box.wait_closed()
-            self.assertTrue(self.is_offered)
-            self.assert_not_saved()
+        for name, cancel in CANCELLATIONS.items():
+            with self.subTest(by=name):
+                self.main.press("ctrl+s")
+                box = self.save_question()
+                cancel(box)
+                box.wait_closed()
+                self.assertTrue(self.is_offered)
+                self.assert_not_saved()
         self.tree.row(*NEW_LEASE_TIME)
 
     def test_keeps_the_replaced_version(self):
@@ -177,7 +172,7 @@ class SavingWhereThatFails(SavingTest):
         self.edit()
         with self.read_only_folder():
             self.main.press("ctrl+s")
-            self.question().answer("Save")
+            self.save_question().answer("Save")
             self.message("Error", CANNOT_WRITE).answer("OK")
         self.assertTrue(self.is_offered)
         self.tree.row(*NEW_LEASE_TIME)
@@ -195,7 +190,7 @@ class SavingWhatTheServerRefuses(SavingTest):
         self.main.press("ctrl+s")
         box = self.program.window("Information")
         self.wait(lambda: box.informative_text, "the server's verdict")
-        self.assertEqual(box.text, QUESTION)
+        self.assertEqual(box.text, SAVE_QUESTION)
         self.assertEqual(box.informative_text, "The DHCP server refuses this configuration:\n" + COMPLAINT)
         self.assertEqual(box.buttons, ["Save", "Cancel", "Show Details..."])
         self.assertEqual(box.default_button, "Save")
@@ -205,14 +200,14 @@ class SavingWhatTheServerRefuses(SavingTest):
         self.assertIn("colour green", details)
         self.assertIn("exiting", details)
         box.answer("Save")
-        self.wait_offered(False)
+        self.wait_for_save()
         self.assertEqual(machine.CONFIGURATION.read_text(), SAVED_REFUSED)
 
     def test_need_not_wait_for_the_verdict(self):
         self.edit()
         self.main.press("ctrl+s")
         self.program.window("Information").answer("Save")
-        self.wait_offered(False)
+        self.wait_for_save()
         self.assertEqual(machine.CONFIGURATION.read_text(), SAVED_REFUSED)
 
 
@@ -230,7 +225,7 @@ class SavingAfterOthersChangedTheFile(SavingTest):
         self.edit()
         self.change_outside()
         self.main.press("ctrl+s")
-        self.question(QUESTION_IF_CHANGED).answer("Cancel")
+        self.save_question(QUESTION_IF_CHANGED).answer("Cancel")
         self.assertEqual(machine.CONFIGURATION.read_text(), CHANGED_OUTSIDE)
         self.save(QUESTION_IF_CHANGED)
         self.assert_saved()
@@ -241,16 +236,14 @@ class SavingAfterOthersChangedTheFile(SavingTest):
         self.change_outside()
         self.save(QUESTION_IF_CHANGED)
         self.tree.row(*NEW_LEASE_TIME).context_menu().choose("Remove")
-        self.wait_offered(True)
+        self.wait_until_offered()
         self.save()
 
     def test_asks_so_even_if_the_file_was_read_again(self):
         self.change_outside()
         self.main.press("F5")
-        self.message(
-            "Information", "Do you want to reload configuration from file?", buttons=["Yes", "No"], default="Yes"
-        ).answer("Yes")
+        self.reload_question().answer("Yes")
         self.tree.row("All network", "Default lease time: 1 minutes 39 seconds").context_menu().choose("Remove")
-        self.wait_offered(True)
+        self.wait_until_offered()
         self.save(QUESTION_IF_CHANGED)
         self.assertEqual(machine.CONFIGURATION.read_text(), "")

@@ -20,11 +20,6 @@ class Reload(ProgramTest):
         """The tree for such a configuration."""
         return ["All network", f"    Default lease time: {minutes} minutes"]
 
-    def question(self):
-        return self.message(
-            "Information", "Do you want to reload configuration from file?", buttons=["Yes", "No"], default="Yes"
-        )
-
     def test_shows_what_is_in_the_file_by_now(self):
         commands = {
             "F5": lambda: self.main.press("F5"),
@@ -35,7 +30,7 @@ class Reload(ProgramTest):
             with self.subTest(command=name):
                 self.configure(minutes)
                 command()
-                question = self.question()
+                question = self.reload_question()
                 self.assertNotEqual(self.tree.lines(), self.lines(minutes))
                 question.answer("Yes")
                 self.wait(lambda: self.tree.lines() == self.lines(minutes), f"a lease time of {minutes} minutes")
@@ -53,7 +48,7 @@ class Reload(ProgramTest):
         for decline in (answer_no, press_escape):
             with self.subTest(decline=decline.__name__):
                 self.main.press("F5")
-                decline(self.question())
+                decline(self.reload_question())
                 self.assertEqual(self.tree.lines(), self.lines(3))
 
     def test_gives_changes_up(self):
@@ -64,7 +59,7 @@ class Reload(ProgramTest):
         dialog.wait_closed()
         self.tree.row("All network", "Host: guest")
         self.main.press("F5")
-        self.question().answer("Yes")
+        self.reload_question().answer("Yes")
         self.wait(lambda: self.tree.lines() == self.lines(3), "the configuration without the host")
 
 

@@ -7,6 +7,13 @@ import unittest
 import desktop
 import machine
 
+CANCELLATIONS = {
+    "button": lambda window: window.button("Cancel").click(),
+    "key": lambda window: window.press("Escape"),
+    "frame": lambda window: window.close(),
+}
+SAVE_QUESTION = "Current configuration in file will be rewrited.\nDo you want to save changes?"
+
 
 def keeping_picture(test):
     @functools.wraps(test)
@@ -75,6 +82,23 @@ class ProgramTest(DesktopTest):
     @property
     def tree(self):
         return self.main.find("tree", "Topology")
+
+    def reload_question(self):
+        question = "Do you want to reload configuration from file?"
+        return self.message("Information", question, buttons=["Yes", "No"], default="Yes")
+
+    def save_question(self, text=SAVE_QUESTION):
+        return self.message("Information", text, buttons=["Save", "Cancel"], default="Save")
+
+    def save(self, text=SAVE_QUESTION):
+        """Saves the configuration, which the server accepts."""
+        self.main.press("ctrl+s")
+        self.save_question(text).answer("Save")
+        self.wait_for_save()
+        self.assertEqual(machine.verdict(), "")
+
+    def wait_for_save(self):
+        self.wait(lambda: not self.main.button("Save").is_enabled, "a saved configuration")
 
     @property
     def server_state(self):
