@@ -5,7 +5,6 @@ A test is a table of commands: where each is chosen, what its dialog shows and i
 in the file. A menu with an entry that no row of the tables chooses fails.
 """
 
-import contextlib
 import dataclasses
 import difflib
 import typing
@@ -280,15 +279,6 @@ class CommandTest(ProgramTest):
         self.program.keys("Escape")
         self.wait(lambda: not menu.is_showing, f"{menu} closed")
         return found
-
-    @contextlib.contextmanager
-    def running(self, command, place):
-        """Tells of a failure which command it was."""
-        try:
-            yield
-        except Exception as error:
-            error.add_note(f"the command was: {command}, {' > '.join(place.row)}")
-            raise
 
     def open(self, dialog):
         """The dialog, after the question that may come before it."""

@@ -262,7 +262,7 @@ class Adds(CommandTest):
         for add in ADDS:
             for place in add.places:
                 if place in places:
-                    with self.running(add, place):
+                    with self.case(command=add, place=place.row):
                         lines += self.add(add, place)
         saved = self.save()
         self.assertEqual([line for line in saved if line in self.file], self.file)
@@ -289,7 +289,7 @@ class Adds(CommandTest):
     def test_all_entries_of_the_menus_are_run(self):
         for place in EVERYWHERE:
             run = {add.entries for add in ADDS if place in add.places} | (CHANGES if place != ROOT else set())
-            with self.running("the menu", place):
+            with self.case(command="the menu", place=place.row):
                 self.assertEqual(self.offered(self.topology.row(*place.row).context_menu()), run)
 
     def test_all_network(self):

@@ -18,7 +18,7 @@ class Closing(SavingTest):
     def test_asks_nothing_without_changes(self):
         commands = {"frame": lambda: self.main.close(), "menu": lambda: self.main.choose("File", "Exit")}
         for name, close in commands.items():
-            with self.subTest(by=name):
+            with self.case(by=name):
                 close()
                 self.assert_ended()
                 self.start()
@@ -34,7 +34,7 @@ class Closing(SavingTest):
     def test_can_be_cancelled(self):
         self.edit()
         for name, cancel in CANCELLATIONS.items():
-            with self.subTest(by=name):
+            with self.case(by=name):
                 self.main.close()
                 box = self.confirmation()
                 cancel(box)

@@ -354,7 +354,7 @@ class Changes(CommandTest):
         """Runs CHANGE for the edits, which returns what becomes of the statements."""
         file = self.file
         for edit in edits:
-            with self.running(edit, edit.place):
+            with self.case(command=edit, place=edit.place.row):
                 becomes = change(edit, self.topology.row(*edit.row))
                 self.expect_instead(edit, becomes)
                 file = with_block(file, edit.place.file_lines(edit.before), edit.place.file_lines(becomes))
@@ -400,5 +400,5 @@ class Changes(CommandTest):
     def test_all_entries_of_the_menus_are_run(self):
         for edit in EDITS:
             if "{" not in edit.before.file:  # those of blocks add as well, and are run by the tests of that
-                with self.running("the menu", edit.place):
+                with self.case(command="the menu", place=edit.place.row):
                     self.assertEqual(self.offered(self.topology.row(*edit.row).context_menu()), CHANGES)

@@ -86,7 +86,7 @@ class Interfaces(InterfacesTest):
             (["wlan0"], "wlan0"),
             (["lab0", "wlan0"], "lab0 "),  # a space follows each name but that of the machine's last interface
         ]:
-            with self.subTest(toggled=toggled):
+            with self.case(toggled=toggled):
                 self.choose(*toggled)
                 self.assertEqual(machine.DEFAULTS.read_text(), defaults(line))
 

@@ -157,7 +157,7 @@ class LeaseFile(LeasesTest):
             "tab": lambda: (self.main.find("page tab", "Topology").click(), self.show_leases()),
         }
         for name, command in commands.items():
-            with self.subTest(command=name):
+            with self.case(command=name):
                 self.table.row("door").click()
                 self.wait(lambda: self.current() == ("192.0.2.101", "192.0.2.101"), "the chosen row")
                 command()
@@ -179,7 +179,7 @@ class LeaseFile(LeasesTest):
             ("PHONE", [], None, False),
             (".*", [], None, False),
         ]:
-            with self.subTest(text=text):
+            with self.case(text=text):
                 self.search.enter(text)
                 self.wait_for_addresses(*shown)
                 self.assertEqual(self.current(), current)
@@ -228,7 +228,7 @@ class LeaseFile(LeasesTest):
 
         for clear in (by_keys, by_the_button):
             for text in ("door", "nothing"):
-                with self.subTest(clear=clear.__name__, text=text):
+                with self.case(clear=clear.__name__, text=text):
                     self.search.enter(text)
                     self.wait_for_addresses(*(["192.0.2.101"] if text == "door" else []))
                     clear()

@@ -128,7 +128,7 @@ class Reservation(ReservationTest):
 
     def test_can_be_cancelled(self):
         for name, cancel in CANCELLATIONS.items():
-            with self.subTest(by=name):
+            with self.case(by=name):
                 self.row(self.desk).double_click()
                 dialog = self.dialog()
                 dialog.field("Name:").enter("typed")

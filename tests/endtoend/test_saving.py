@@ -110,7 +110,7 @@ class Saving(SavingTest):
     def test_can_be_cancelled(self):
         self.edit()
         for name, cancel in CANCELLATIONS.items():
-            with self.subTest(by=name):
+            with self.case(by=name):
                 self.main.press("ctrl+s")
                 box = self.save_question()
                 cancel(box)

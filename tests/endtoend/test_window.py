@@ -27,7 +27,7 @@ class Reload(ProgramTest):
             "tool bar": lambda: self.main.button("Reload").click(),
         }
         for minutes, (name, command) in enumerate(commands.items(), start=4):
-            with self.subTest(command=name):
+            with self.case(command=name):
                 self.configure(minutes)
                 command()
                 question = self.reload_question()
@@ -46,7 +46,7 @@ class Reload(ProgramTest):
 
         self.configure(4)
         for decline in (answer_no, press_escape):
-            with self.subTest(decline=decline.__name__):
+            with self.case(decline=decline.__name__):
                 self.main.press("F5")
                 decline(self.reload_question())
                 self.assertEqual(self.tree.lines(), self.lines(3))
@@ -78,7 +78,7 @@ class ToolBar(ProgramTest):
             ([], ADDING),
             (["Default lease time: 2 minutes"], []),
         ]:
-            with self.subTest(path=path):
+            with self.case(path=path):
                 self.tree.row("All network", *path).click()
                 self.wait_for(*names)
 

@@ -1,6 +1,7 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """What the tests of the program in a private network have in common."""
 
+import contextlib
 import functools
 import unittest
 
@@ -49,6 +50,18 @@ class DesktopTest(unittest.TestCase):
     def wait(self, condition, what):
         """Waits until the condition holds; WHAT names it where that does not happen."""
         return self.program.wait(condition, lambda: what)
+
+    @contextlib.contextmanager
+    def case(self, **parameters):
+        """Tells of a failure in which case it was.
+
+        Other than after a failed subtest, the cases that follow are not run: what is on the display is in their way.
+        """
+        try:
+            yield
+        except Exception as error:
+            error.add_note(", ".join(f"{name}: {value}" for name, value in parameters.items()))
+            raise
 
     def message(self, title, text, *, informative_text="", buttons=("OK",), default="OK"):
         """A message box that has opened, which must be as described."""
