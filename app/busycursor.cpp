@@ -11,11 +11,16 @@ constexpr qint64 momentaryBytes = qint64{4} << 20U;
 
 } // namespace
 
-BusyCursor::BusyCursor(const QString &path)
-    : m_shown{QFileInfo{path}.size() > momentaryBytes}
+BusyCursor::BusyCursor(qint64 bytes)
+    : m_shown{bytes > momentaryBytes}
 {
     if (m_shown)
         QGuiApplication::setOverrideCursor(QCursor{Qt::WaitCursor});
+}
+
+BusyCursor::BusyCursor(const QString &path)
+    : BusyCursor{QFileInfo{path}.size()}
+{
 }
 
 BusyCursor::~BusyCursor()

@@ -5,10 +5,12 @@
 
 class QString;
 
-/// Shows the busy cursor while it exists, for work on a file that is large enough to take longer than a moment.
+/// Shows the busy cursor while it exists, for work on so many bytes that it takes longer than a moment.
 class BusyCursor final
 {
 public:
+    explicit BusyCursor(qint64 bytes);
+    /// For work on the whole file at `path`.
     explicit BusyCursor(const QString &path);
     ~BusyCursor();
     Q_DISABLE_COPY_MOVE(BusyCursor)

@@ -38,6 +38,7 @@ void FMain::leaseReload()
 {
     QTableView &table = *m_ui->dhcpdLeaseTable;
     const LeasePlace place{table};
+    const BusyCursor busy{m_leasesModel->bytesToRead(paths::leases())};
     m_leasesModel->update(paths::leases());
     place.restoreIn(table);
 }

@@ -69,6 +69,12 @@ std::unique_ptr<LeaseSearch> DhcpdLeasesModel::search(const LeaseNeedle &needle)
     return std::make_unique<LeaseSearch>(m_table, m_timeTexts, needle);
 }
 
+qint64 DhcpdLeasesModel::bytesToRead(const QString &path) const
+{
+    const LeaseFile file{path};
+    return m_reader.continues(file) ? file.size() - m_reader.position() : file.size();
+}
+
 void DhcpdLeasesModel::reload(const QString &path)
 {
     beginResetModel();

@@ -40,6 +40,9 @@ public:
     /// A search in the texts that the model shows; not to be used after the model is gone.
     std::unique_ptr<LeaseSearch> search(const LeaseNeedle &needle) const;
 
+    /// How much update() has to read: what was appended to the file at `path`, or all of it.
+    qint64 bytesToRead(const QString &path) const;
+
 signals:
     /// The file could not be read, and the model is empty; `message` is for the user.
     void error(const QString &message);

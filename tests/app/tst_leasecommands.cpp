@@ -173,6 +173,8 @@ private slots:
     void placeIsKeptOverAutomaticReloads();
     void searchIsKeptOverAutomaticReloads();
     void leaseThatLeavesTheFilterHasNoSuccessor();
+    void busyCursorShowsWhileMuchIsRead_data();
+    void busyCursorShowsWhileMuchIsRead();
     void clientsNameAddsNoStatements();
 
 private:
@@ -581,6 +583,51 @@ void LeaseCommandsTest::leaseThatLeavesTheFilterHasNoSuccessor()
     QTRY_COMPARE(site.table->model()->rowCount(), 2);
     QTRY_VERIFY(!site.table->currentIndex().isValid());
     QVERIFY(!site.table->selectionModel()->hasSelection());
+}
+
+void LeaseCommandsTest::busyCursorShowsWhileMuchIsRead_data()
+{
+    QTest::addColumn<int>("before"); // leases
+    QTest::addColumn<QByteArray>("command");
+    QTest::addColumn<int>("written");
+    QTest::addColumn<int>("after");
+    QTest::addColumn<bool>("busy");
+    const QByteArray replace = R"(cat >"$1.new"; mv "$1.new" "$1")";
+    const int many = 32'000;
+    QTest::addRow("few, replaced") << 1 << replace << 2 << 2 << false;
+    QTest::addRow("few, replaced by many") << 1 << replace << many << many << true;
+    QTest::addRow("many, replaced") << many << replace << many - 1 << many - 1 << true;
+    QTest::addRow("many, appended to") << many << QByteArray{R"(sed s/10.0/9.0/ >>"$1")"} << 1 << many + 1 << false;
+}
+
+void LeaseCommandsTest::busyCursorShowsWhileMuchIsRead()
+{
+    QFETCH(int, before);
+    QFETCH(QByteArray, command);
+    QFETCH(int, written);
+    QFETCH(int, after);
+    QFETCH(bool, busy);
+    const auto leases = [](int count) {
+        QByteArray text;
+        for (int i = 0; i < count; ++i)
+            text += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
+        return text;
+    };
+    writeTestFile(paths::leases(), leases(before));
+    const Site site{*m_machine};
+
+    bool wasBusy = false;
+    const auto look = [&wasBusy] {
+        const QCursor *cursor = QGuiApplication::overrideCursor();
+        wasBusy = cursor && cursor->shape() == Qt::WaitCursor;
+    };
+    const QAbstractItemModel *model = site.table->model();
+    connect(model, &QAbstractItemModel::modelReset, this, look);
+    connect(model, &QAbstractItemModel::rowsInserted, this, look);
+    runOutside(paths::leases(), command, leases(written));
+    QTRY_COMPARE(model->rowCount(), after);
+    QCOMPARE(wasBusy, busy);
+    QVERIFY(!QGuiApplication::overrideCursor());
 }
 
 void LeaseCommandsTest::clientsNameAddsNoStatements()

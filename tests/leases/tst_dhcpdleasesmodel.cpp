@@ -63,6 +63,7 @@ private slots:
     void readsFilesLargerThanAPiece();
 
     void updatesWithWhatWasAppended();
+    void tellsHowMuchAnUpdateReads();
     void updateTakesBackAnEndThatTurnsOutToBeNone();
     void updateAnnouncesNewAndChangedRows();
     void updateAnnouncesMuchAsAReset();
@@ -307,6 +308,24 @@ void TestDhcpdLeasesModel::updatesWithWhatWasAppended()
     QCOMPARE(model.rowCount(), 3);
     // Only when the brace that ended the block stood without its line feed it could still have become another line.
     QCOMPARE(resets.size(), 2);
+}
+
+void TestDhcpdLeasesModel::tellsHowMuchAnUpdateReads()
+{
+    DhcpdLeasesModel model;
+    const QByteArray block{leaseBlock(0, 1, 1)};
+    writeTestFile(m_path, block);
+    QCOMPARE(model.bytesToRead(m_path), qint64{block.size()});
+    model.reload(m_path);
+    QCOMPARE(model.bytesToRead(m_path), qint64{0});
+    const QByteArray more{leaseBlock(0, 2, 2)};
+    appendTo(m_path, more);
+    QCOMPARE(model.bytesToRead(m_path), qint64{more.size()});
+    const QByteArray anew{leaseBlock(0, 3, 3) + leaseBlock(0, 4, 4) + leaseBlock(0, 5, 5)};
+    writeTestFile(m_path, anew);
+    QCOMPARE(model.bytesToRead(m_path), qint64{anew.size()});
+    QVERIFY(QFile::remove(m_path));
+    QCOMPARE(model.bytesToRead(m_path), qint64{0});
 }
 
 void TestDhcpdLeasesModel::updateTakesBackAnEndThatTurnsOutToBeNone()
