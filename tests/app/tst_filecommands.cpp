@@ -14,6 +14,7 @@
 #include <QDialogButtonBox>
 #include <QDir>
 #include <QElapsedTimer>
+#include <QFileSystemWatcher>
 #include <QHeaderView>
 #include <QPushButton>
 #include <QRegularExpression>
@@ -22,6 +23,7 @@
 #include <QTest>
 #include <QTreeView>
 
+#include <algorithm>
 #include <csignal>
 #include <sys/resource.h>
 
@@ -132,6 +134,15 @@ void changeOutside(const Site &site)
     site.settle();
 }
 
+/// What tells the window's watch that the system has seen a change of `file`.
+const QFileSystemWatcher *watcherOf(const FMain &window, const QString &file)
+{
+    const auto watchers = window.findChildren<QFileSystemWatcher *>();
+    const auto found = std::find_if(watchers.begin(), watchers.end(),
+                                    [&file](const auto *watcher) { return watcher->files().contains(file); });
+    return found == watchers.end() ? nullptr : *found;
+}
+
 /// Every write fails while this object lives, with no file or directory changed for it.
 class FullDisk final
 {
@@ -185,6 +196,8 @@ private slots:
     void changeDuringTheQuestionIsIgnored();
     void failedSaveChangesNothing();
     void failedSaveKeepsChangedOutside();
+    void changeWhileAFailureIsShownIsNoticed();
+    void noticeOfTheReplacedVersionIsDropped();
     void nothingIsSavedFromNothing_data();
     void nothingIsSavedFromNothing();
     void bytesSurvive_data();
@@ -194,11 +207,15 @@ private slots:
     void reloadCanBeDeclined();
     void reloadKeepsChangedOutside();
     void reloadOfLeasesAsksNothing();
+    void busyCursorShowsWhileMuchIsLoaded_data();
+    void busyCursorShowsWhileMuchIsLoaded();
+    void refusedLoadIsToldWithoutTheBusyCursor();
 
     void closing_data();
     void closing();
     void closingQuestionHasNoDefault();
     void unwrittenConfigurationIsKept();
+    void nothingIsKeptOfNothing();
 
     void servedInterfaces_data();
     void servedInterfaces();
@@ -394,6 +411,46 @@ void FileCommandsTest::failedSaveKeepsChangedOutside()
     QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
 }
 
+void FileCommandsTest::changeWhileAFailureIsShownIsNoticed()
+{
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    ModalBoxes &boxes = *m_boxes;
+    std::unique_ptr<FullDisk> disk;
+    boxes.expectDialog<QMessageBox>([&disk](QMessageBox *box) {
+        disk = std::make_unique<FullDisk>();
+        QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
+    });
+    boxes.expectDialog<QMessageBox>([&disk, &site](QMessageBox *box) {
+        disk.reset();
+        QCOMPARE(box->text(), cannotWrite().text);
+        changeOutside(site); // taken for the program's own
+        changeOutside(site);
+        QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
+    });
+    site.pressSave();
+    boxes.verify();
+    site.save(overwriteText);
+}
+
+void FileCommandsTest::noticeOfTheReplacedVersionIsDropped()
+{
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    ModalBoxes &boxes = *m_boxes;
+    boxes.expectDialog<QMessageBox>([&site](QMessageBox *box) {
+        // Saved as soon as the system tells of the change, before that becomes a notice.
+        QSignalSpy told{watcherOf(*site.window, paths::configuration()), &QFileSystemWatcher::fileChanged};
+        writeTestFile(paths::configuration(), "# by hand\n");
+        QVERIFY(told.wait());
+        QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
+    });
+    site.pressSave();
+    boxes.verify();
+    site.settle();
+    site.save(rewriteText);
+}
+
 void FileCommandsTest::nothingIsSavedFromNothing_data()
 {
     QTest::addColumn<bool>("missingAtStart");
@@ -418,6 +475,13 @@ void FileCommandsTest::nothingIsSavedFromNothing()
         site.pressReload();
     }
     boxes.verify();
+    QCOMPARE(site.model->rowCount(), 0);
+
+    // No command adds anything to it, or opens a dialog that could.
+    for (QAction *action : site.window->findChildren<QAction *>(QRegularExpression{QStringLiteral("^aAdd")})) {
+        action->setEnabled(true);
+        action->trigger();
+    }
     QCOMPARE(site.model->rowCount(), 0);
 
     writeTestFile(paths::configuration(), configuration); // somebody puts it back
@@ -512,6 +576,49 @@ void FileCommandsTest::reloadOfLeasesAsksNothing()
     QCOMPARE(leases->rowCount(), 1);
 }
 
+void FileCommandsTest::busyCursorShowsWhileMuchIsLoaded_data()
+{
+    QTest::addColumn<int>("size");
+    QTest::addColumn<bool>("busy");
+    QTest::addRow("small") << 1'000 << false;
+    QTest::addRow("large") << 5'000'000 << true;
+}
+
+void FileCommandsTest::busyCursorShowsWhileMuchIsLoaded()
+{
+    QFETCH(int, size);
+    QFETCH(bool, busy);
+    writeTestFile(paths::configuration(), configuration + '#' + QByteArray(size, 'x') + '\n');
+    const Site site{*m_machine, *m_boxes};
+    bool wasBusy = false;
+    connect(site.model, &DhcpdConfigModel::dataChanged, this, [&wasBusy] {
+        const QCursor *cursor = QGuiApplication::overrideCursor();
+        wasBusy = cursor && cursor->shape() == Qt::WaitCursor;
+    });
+    ModalBoxes &boxes = *m_boxes;
+    boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
+    site.pressReload();
+    boxes.verify();
+    QCOMPARE(wasBusy, busy);
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void FileCommandsTest::refusedLoadIsToldWithoutTheBusyCursor()
+{
+    const Site site{*m_machine, *m_boxes};
+    writeTestFile(paths::configuration(), QByteArray{"group {\n"}.repeated(600'000)); // nested too deep
+    ModalBoxes &boxes = *m_boxes;
+    boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
+    boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
+        QCOMPARE(box->text(), cannotRead().text);
+        QCOMPARE(QGuiApplication::overrideCursor()->shape(), Qt::ArrowCursor);
+        QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
+    });
+    site.pressReload();
+    boxes.verify();
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
 void FileCommandsTest::closing_data()
 {
     QTest::addColumn<bool>("modified");
@@ -589,6 +696,28 @@ void FileCommandsTest::unwrittenConfigurationIsKept()
     boxes.verify();
     QVERIFY(!site.window->isVisible());
     QCOMPARE(backups(), QList<QByteArray>{unsaved});
+}
+
+void FileCommandsTest::nothingIsKeptOfNothing()
+{
+    const Site site{*m_machine, *m_boxes};
+    ModalBoxes &boxes = *m_boxes;
+    QVERIFY(QFile::remove(paths::configuration()));
+    boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
+    boxes.expectBox(cannotRead(), QMessageBox::Ok);
+    site.pressReload();
+    boxes.verify();
+    QVERIFY(site.isModified());
+    site.settle();
+    boxes.expectDialog<QMessageBox>(
+        [](QMessageBox *box) { QTest::mouseClick(box->button(QMessageBox::Yes), Qt::LeftButton); });
+    boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
+    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    site.window->close();
+    boxes.verify();
+    QVERIFY(!site.window->isVisible());
+    QCOMPARE(backups(), QList<QByteArray>{});
+    QVERIFY(!QFile::exists(paths::configuration()));
 }
 
 void FileCommandsTest::servedInterfaces_data()
