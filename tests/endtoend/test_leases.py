@@ -134,9 +134,7 @@ class LeaseFile(LeasesTest):
         self.wait(lambda: self.table.row("appended"), "the new lease")
         self.assertEqual([row.texts for row in self.table.rows], rows_of_file())
 
-        other = machine.LEASES.with_name("other")
-        other.write_text(lease("203.0.113.1", "00:00:5e:00:53:01", "replaced"))
-        other.rename(machine.LEASES)
+        self.replace_file(lease("203.0.113.1", "00:00:5e:00:53:01", "replaced"))
         self.wait_for_addresses("203.0.113.1")
 
         with machine.LEASES.open("a") as file:
@@ -248,6 +246,19 @@ class LeaseFile(LeasesTest):
         self.assertEqual(self.search.text, "phone")
         self.wait_for_red(False)
 
+    def test_keeps_the_search_when_it_is_replaced(self):
+        self.search.enter("phone")
+        self.next.click()
+        self.wait(lambda: self.current() == ("198.51.100.1", "phone-192.0.2.10"), "the second match")
+        self.replace_file(
+            lease("192.0.2.1", "00:00:5e:00:53:01", "display"),
+            lease("192.0.2.2", "00:00:5e:00:53:02", "phone-of-a-guest"),
+            lease("192.0.2.3", "00:00:5e:00:53:03", "scales"),
+            lease("198.51.100.1", "00:00:5e:00:53:f1", "phone-192.0.2.10"),
+        )
+        self.wait_for_addresses("192.0.2.2", "198.51.100.1")
+        self.assertEqual(self.current(), ("198.51.100.1", "phone-192.0.2.10"))
+
     def test_keeps_a_search_without_matches_while_it_is_followed(self):
         self.search.enter("guest")
         self.wait_for_red(True)
@@ -259,6 +270,11 @@ class LeaseFile(LeasesTest):
 
     def assert_steps(self, enabled):
         self.assertEqual([button.is_enabled for button in (self.previous, self.next)], [enabled] * 2)
+
+    def replace_file(self, *blocks):
+        """Does it as the server does, which keeps the old file under another name."""
+        machine.LEASES.rename(machine.LEASES.with_name("dhcpd.leases~"))
+        machine.LEASES.write_text("".join(blocks))
 
     def wait_for_red(self, expected):
         """Whether what stands in the search field, between its buttons, is red."""
