@@ -4,6 +4,7 @@
 import os
 import pathlib
 import shutil
+import socket
 import subprocess
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
@@ -75,10 +76,16 @@ def server_command():
         return []
 
 
-def journal():
-    """What the service has logged."""
+def interfaces_listened_on():
+    """Those on which the server, which alone does this here, gets what comes from the wire."""
+    sockets = pathlib.Path("/proc/net/packet").read_text().splitlines()[1:]
+    return sorted(socket.if_indextoname(int(line.split()[4])) for line in sockets)
+
+
+def server_log():
+    """What the server has logged since it was started last. A line may come later than what it tells."""
     path = SERVICE_RECORD / "journal"
-    return path.read_text() if path.exists() else ""
+    return path.read_text().split(f"Starting {SERVICE}.service")[-1] if path.exists() else ""
 
 
 # --- Its clients
