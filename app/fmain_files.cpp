@@ -143,8 +143,11 @@ void FMain::closeEvent(QCloseEvent *event)
     const auto answer = QMessageBox::question(this, tr("Confirmation"), tr("There are unsaved changes, save?"),
                                               QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
     // After a Yes the window closes whatever became of the save, deliberately; what could not be written is kept.
-    if (answer == QMessageBox::Yes && saveConfiguration() == SaveOutcome::Failed && m_configModel->rowCount() > 0)
-        fileio::keepCopy(paths::configuration(), m_configModel->fileContent());
+    if (answer == QMessageBox::Yes && saveConfiguration() == SaveOutcome::Failed) {
+        const QByteArray content = m_configModel->fileContent();
+        if (!content.isNull())
+            fileio::keepCopy(paths::configuration(), content);
+    }
     event->setAccepted(answer == QMessageBox::Yes || answer == QMessageBox::No);
 }
 

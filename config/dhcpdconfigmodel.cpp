@@ -96,6 +96,8 @@ bool DhcpdConfigModel::parse(const QString &text) { return parseUtf8(text.toUtf8
 
 QByteArray DhcpdConfigModel::fileContent() const
 {
+    if (m_topNode->childCount() == 0)
+        return {};
     const QByteArray text{serialize(*m_topNode)};
     return text.isEmpty() ? text : m_encoding.fromUtf8(text);
 }
@@ -123,7 +125,7 @@ bool DhcpdConfigModel::write(const QString &confFile)
 {
     // A tree without a top row was never read: nothing of it may replace a file that does hold something. Nor may a
     // text that could not be read again.
-    const QByteArray content{m_topNode->childCount() > 0 ? fileContent() : QByteArray{}};
+    const QByteArray content{fileContent()};
     if (!content.isNull() && fileio::replaceFile(confFile, content))
         return true;
     return refuse(tr("Unable to open file '%1' for write").arg(confFile));

@@ -42,7 +42,7 @@ public:
 
     /// Appends what `text` holds; false, with nothing appended, when its blocks are nested too deep.
     bool parse(const QString &text);
-    /// The bytes that write() puts into the file; null when they could not be read again.
+    /// The bytes that write() puts into the file; null when nothing was read, or they could not be read again.
     QByteArray fileContent() const;
 
     // The operations below add statements at the end of those of their sort under the statement of `parent`. What they
