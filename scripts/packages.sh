@@ -9,7 +9,7 @@ declare -A packages=(
 util-linux xauth"
     [wayland]="qtwayland5"
     [screenshot]="maim xauth xdotool xvfb"
-    [test]="at-spi2-core dpkg python3-pyatspi python3-xlib"
+    [test]="at-spi2-core debootstrap dpkg python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
     [fuzz]="clang libclang-rt-dev"
     [lint]="black clang-format clang-tidy clazy flake8 git shellcheck"

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/dhcpservermanager.h"
+#include "tests/server/managerevents.h"
 #include "tests/support/contexttranslator.h"
 #include "tests/support/fakesystemctl.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QDir>
-#include <QMetaEnum>
 #include <QMetaMethod>
 #include <QRegularExpression>
 #include <QTest>
@@ -16,27 +16,21 @@
 
 namespace {
 
+using said::alreadyRunning;
+using said::alreadyStopped;
+using said::busy;
+using said::running;
+using said::stopped;
+using said::updating;
+
 using Slot = void (DhcpServerManager::*)();
 
-QString nameOf(DhcpServerManager::ServerStates state)
-{
-    return QString::fromLatin1(QMetaEnum::fromType<DhcpServerManager::ServerStates>().valueToKey(state));
-}
-
-QString failedOperation(const char *detail)
-{
-    return QStringLiteral("error: Operation with DHCP-server failed\n") + QString::fromUtf8(detail);
-}
+QString failedOperation(const char *detail) { return said::failedOperation(QString::fromUtf8(detail)); }
 
 QString failedQuery(const char *detail)
 {
     return QStringLiteral("error: Checking DHCP-server status failed\n") + QString::fromUtf8(detail);
 }
-
-const QString busy = QStringLiteral("error: Some operation with DHCP-server already executes");
-const QString updating = QStringLiteral("Updating");
-const QString running = QStringLiteral("Running");
-const QString stopped = QStringLiteral("Stopped");
 
 // A manager on a machine of its own, and everything that it has said in order.
 struct Machine
@@ -45,12 +39,7 @@ struct Machine
         : systemctl{state}
         , manager{std::make_unique<DhcpServerManager>()}
     {
-        QObject::connect(manager.get(), &DhcpServerManager::serverStateChanged, &context,
-                         [this](DhcpServerManager::ServerStates newState) { events.append(nameOf(newState)); });
-        QObject::connect(manager.get(), &DhcpServerManager::error, &context,
-                         [this](const QString &message) { events.append(QStringLiteral("error: ") + message); });
-        QObject::connect(manager.get(), &DhcpServerManager::information, &context,
-                         [this](const QString &message) { events.append(QStringLiteral("information: ") + message); });
+        said::record(*manager, events);
     }
 
     // As Machine, but the manager knows the state of the service and nothing is recorded yet.
@@ -429,8 +418,6 @@ void TestDhcpServerManager::informsThatOperationIsNotNeeded_data()
     QTest::addColumn<QString>("information");
     const Slot start{&DhcpServerManager::runServer};
     const Slot stop{&DhcpServerManager::stopServer};
-    const QString alreadyRunning = QStringLiteral("information: DHCP-server already running");
-    const QString alreadyStopped = QStringLiteral("information: DHCP-server already stopped");
     QTest::addRow("start") << start << FakeSystemctl::Running << FakeSystemctl::Running << alreadyRunning;
     QTest::addRow("start, started meanwhile")
         << start << FakeSystemctl::Stopped << FakeSystemctl::Running << alreadyRunning;
@@ -514,8 +501,7 @@ void TestDhcpServerManager::staysUpdatingWhenOutcomeIsUnclear()
     machine->systemctl.setState(FakeSystemctl::Running);
     machine->manager->checkRunning();
     machine->manager->runServer();
-    QCOMPARE(machine->events.mid(3),
-             (QStringList{running, running, QStringLiteral("information: DHCP-server already running")}));
+    QCOMPARE(machine->events.mid(3), (QStringList{running, running, alreadyRunning}));
 }
 
 void TestDhcpServerManager::sendsCommandWhenQueryIsUnclear()

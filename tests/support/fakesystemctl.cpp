@@ -39,10 +39,13 @@ constexpr std::array<Status, 6> statusOfStates{{
        Docs: man:systemd-sysv-generator(8)
     Process: 812 ExecStart=/etc/init.d/isc-dhcp-server start (code=exited, status=0/SUCCESS)
      CGroup: /system.slice/isc-dhcp-server.service
-             └─829 /usr/sbin/dhcpd -4 -q -cf /etc/dhcp/dhcpd.conf eth0
+             └─829 /usr/sbin/dhcpd -4 -q -cf /etc/dhcp/dhcpd.conf lan0
 
 Mar 02 08:14:29 gate systemd[1]: Starting isc-dhcp-server.service - LSB: DHCP server...
+Mar 02 08:14:29 gate isc-dhcp-server[812]: Launching IPv4 server only.
+Mar 02 08:14:29 gate dhcpd[829]: Wrote 0 leases to leases file.
 Mar 02 08:14:29 gate dhcpd[829]: Server starting service.
+Mar 02 08:14:31 gate isc-dhcp-server[812]: Starting ISC DHCPv4 server: dhcpd.
 Mar 02 08:14:31 gate systemd[1]: Started isc-dhcp-server.service - LSB: DHCP server.
 )",
      ""},
@@ -54,7 +57,13 @@ Mar 02 08:14:31 gate systemd[1]: Started isc-dhcp-server.service - LSB: DHCP ser
     Process: 812 ExecStart=/etc/init.d/isc-dhcp-server start (code=exited, status=0/SUCCESS)
     Process: 1207 ExecStop=/etc/init.d/isc-dhcp-server stop (code=exited, status=0/SUCCESS)
 
+Mar 02 08:14:29 gate isc-dhcp-server[812]: Launching IPv4 server only.
+Mar 02 08:14:29 gate dhcpd[829]: Wrote 0 leases to leases file.
+Mar 02 08:14:29 gate dhcpd[829]: Server starting service.
+Mar 02 08:14:31 gate isc-dhcp-server[812]: Starting ISC DHCPv4 server: dhcpd.
+Mar 02 08:14:31 gate systemd[1]: Started isc-dhcp-server.service - LSB: DHCP server.
 Mar 02 10:20:02 gate systemd[1]: Stopping isc-dhcp-server.service - LSB: DHCP server...
+Mar 02 10:20:02 gate isc-dhcp-server[1207]: Stopping ISC DHCPv4 server: dhcpd.
 Mar 02 10:20:02 gate systemd[1]: isc-dhcp-server.service: Deactivated successfully.
 Mar 02 10:20:02 gate systemd[1]: Stopped isc-dhcp-server.service - LSB: DHCP server.
 )",
@@ -66,7 +75,14 @@ Mar 02 10:20:02 gate systemd[1]: Stopped isc-dhcp-server.service - LSB: DHCP ser
        Docs: man:systemd-sysv-generator(8)
     Process: 1311 ExecStart=/etc/init.d/isc-dhcp-server start (code=exited, status=1/FAILURE)
 
+Mar 02 10:21:40 gate dhcpd[1326]: If you think you have received this message due to a bug rather
+Mar 02 10:21:40 gate dhcpd[1326]: than a configuration issue please read the section on submitting
+Mar 02 10:21:40 gate dhcpd[1326]: bugs on either our web page at www.isc.org or in the README file
+Mar 02 10:21:40 gate dhcpd[1326]: before submitting a bug.  These pages explain the proper
+Mar 02 10:21:40 gate dhcpd[1326]: process and the information we find helpful for debugging.
+Mar 02 10:21:40 gate dhcpd[1326]:
 Mar 02 10:21:40 gate dhcpd[1326]: exiting.
+Mar 02 10:21:40 gate systemd[1]: isc-dhcp-server.service: Control process exited, code=exited, status=1/FAILURE
 Mar 02 10:21:40 gate systemd[1]: isc-dhcp-server.service: Failed with result 'exit-code'.
 Mar 02 10:21:40 gate systemd[1]: Failed to start isc-dhcp-server.service - LSB: DHCP server.
 )",
@@ -88,7 +104,16 @@ Mar 02 10:22:10 gate systemd[1]: Starting isc-dhcp-server.service - LSB: DHCP se
        Docs: man:systemd-sysv-generator(8)
     Process: 1402 ExecStart=/etc/init.d/isc-dhcp-server start (code=exited, status=0/SUCCESS)
   Cntrl PID: 1451 (isc-dhcp-server)
+     CGroup: /system.slice/isc-dhcp-server.service
+             ├─1419 /usr/sbin/dhcpd -4 -q -cf /etc/dhcp/dhcpd.conf lan0
+             └─1451 /bin/sh /etc/init.d/isc-dhcp-server stop
 
+Mar 02 10:22:10 gate systemd[1]: Starting isc-dhcp-server.service - LSB: DHCP server...
+Mar 02 10:22:10 gate isc-dhcp-server[1402]: Launching IPv4 server only.
+Mar 02 10:22:10 gate dhcpd[1419]: Wrote 0 leases to leases file.
+Mar 02 10:22:10 gate dhcpd[1419]: Server starting service.
+Mar 02 10:22:12 gate isc-dhcp-server[1402]: Starting ISC DHCPv4 server: dhcpd.
+Mar 02 10:22:12 gate systemd[1]: Started isc-dhcp-server.service - LSB: DHCP server.
 Mar 02 10:23:24 gate systemd[1]: Stopping isc-dhcp-server.service - LSB: DHCP server...
 )",
      ""},
