@@ -239,7 +239,7 @@ void TestTopologyCommands::addCases()
     row("domain name again", {{},
                               option("Add domain name"),
                               domainInput(list("b.net")),
-                              list("-option domain-name \"a.org\"; | +option domain-name \"b.net\" ;")});
+                              list(R"(-option domain-name "a.org"; | +option domain-name "b.net" ;)")});
     row("default lease time",
         {text("shared-network"), parameter("Add default lease time"),
          timeInput("Add default lease time", list("0 | 1 | 2 | 3 | 4")),

@@ -247,7 +247,7 @@ void TestTopologyEdits::changeCases()
         "-min-lease-time -1; | +min-lease-time 60;");
     row("domain name", "option domain-name \"",
         with(named("Edit domain name", "Domain name:", "a.org"), type(list("b.example.net"))),
-        "-option domain-name \"a.org\"; | +option domain-name \"b.example.net\";");
+        R"(-option domain-name "a.org"; | +option domain-name "b.example.net";)");
     row("DNS servers", "option domain-name-servers",
         with(addresses("Edit DNS servers", "DNS servers:", "10.0.0.1, 10.0.0.2, 10.0.0.3"),
              addAddresses(list("10.0.0.4"))),
@@ -282,7 +282,7 @@ void TestTopologyEdits::changeCases()
     row("subclass", "subclass",
         with(declaration("subclass \"phones\" 1:00:11:22:33:44:55"),
              type(list("subclass \"phones\" 1:00:11:22:33:44:66"))),
-        "-subclass \"phones\" 1:00:11:22:33:44:55; | +subclass \"phones\" 1:00:11:22:33:44:66;");
+        R"(-subclass "phones" 1:00:11:22:33:44:55; | +subclass "phones" 1:00:11:22:33:44:66;)");
     row("address of a subnet", "subnet 10.4", with(subnet("10.4.0.0", "255.255.255.0"), type(list("10.5.0.0/16"))),
         "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.5.0.0 netmask 255.255.0.0");
     row("netmask of a subnet", "subnet 10.4",
@@ -311,10 +311,10 @@ void TestTopologyEdits::changeCases()
         "-shared-network lab | +shared-network \"big lab\"");
     row("fixed address", "fixed-address 10.0.0.7",
         with(named("Edit fixed address", "IP:", "10.0.0.7, 10.0.0.8"), type(list("10.0.0.9"))),
-        "-host \"my pc\" > fixed-address 10.0.0.7, 10.0.0.8; | +host \"my pc\" > fixed-address 10.0.0.9;");
+        R"(-host "my pc" > fixed-address 10.0.0.7, 10.0.0.8; | +host "my pc" > fixed-address 10.0.0.9;)");
     row("MAC address", "hardware ethernet 0011",
         with(named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"), type(list("aabbccddeeff"))),
-        "-host \"my pc\" > hardware ethernet 0011.2233.4455; | +host \"my pc\" > hardware ethernet aa:bb:cc:dd:ee:ff;");
+        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet aa:bb:cc:dd:ee:ff;)");
 
     const Input full = host("full", "00:11:22:33:44:55", "10.0.0.5");
     row("host, all", "host full", with(full, type(list("a.lan | 001122334477 | 10.0.0.9"))),
@@ -338,7 +338,7 @@ void TestTopologyEdits::changeCases()
         "+host hard > fixed-address 10.0.0.9;");
     row("host in quotes, MAC", "host \"",
         with(host("\"my pc\"", "00:11:22:33:44:55", "10.0.0.7, 10.0.0.8"), type({same, text("001122334477")})),
-        "-host \"my pc\" > hardware ethernet 0011.2233.4455; | +host \"my pc\" > hardware ethernet 00:11:22:33:44:77;");
+        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet 00:11:22:33:44:77;)");
 }
 
 void TestTopologyEdits::changedFieldReachesTheStatement()

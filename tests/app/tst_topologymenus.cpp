@@ -180,6 +180,8 @@ void TestTopologyMenus::submenusAreShared()
             dismiss(menu);
         });
     }
+    if (!shared)
+        QFAIL("no menu has the submenu");
     QCOMPARE(entriesOf(*shared).join(QLatin1Char{' '}),
              text(">Add option - aAddDefaultLeaseTime aAddMaxLeaseTime - aAddParam"));
     QCOMPARE(entriesOf(*submenuOf(*shared)).join(QLatin1Char{' '}),

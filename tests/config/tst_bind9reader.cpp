@@ -185,7 +185,7 @@ void TestBind9Reader::keepsZonesAndKeys_data()
     row("slash in a word without quotes", "key k { algorithm a; secret YS9i/Yw==; };",
         "key|k|algorithm|a|secret|\"YS9i/Yw==\"");
     row("zone named like a keyword",
-        "zone file { allow-update { key k; }; }; zone \"type\" { }; zone zone { }; zone \"allow-update.\" IN { };",
+        R"(zone file { allow-update { key k; }; }; zone "type" { }; zone zone { }; zone "allow-update." IN { };)",
         "zone|file.|primary|127.0.0.1|key|k|zone|type.|primary|127.0.0.1|zone|zone.|primary|127.0.0.1"
         "|zone|allow-update.|primary|127.0.0.1");
     row("key named like a keyword",

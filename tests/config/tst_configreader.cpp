@@ -98,9 +98,9 @@ void ConfigReaderTest::reads_data()
     addRow("quoted text is split at spaces", "option domain-name \"my domain\";",
            allNetwork({node("option|domain-name|\"my|domain\"")}));
     addRow("quoted runs of spaces", "a \"b  \t c\";", allNetwork({node("a|\"b|c\"")}));
-    addRow("semicolon in quotes", "a \"b;c\";", allNetwork({node("a|\"b"), node("c\"|")}));
-    addRow("braces in quotes", "a \"b{c\";}\"d e;", allNetwork({node("\"d|e")}, {block("a|\"b", {node("c\"|")})}));
-    addRow("escaped quote is a quote", "a \"b\\\" # c;\nd;", allNetwork({node("a|\"b\\\"|d")}));
+    addRow("semicolon in quotes", R"(a "b;c";)", allNetwork({node("a|\"b"), node("c\"|")}));
+    addRow("braces in quotes", R"(a "b{c";}"d e;)", allNetwork({node("\"d|e")}, {block("a|\"b", {node("c\"|")})}));
+    addRow("escaped quote is a quote", "a \"b\\\" # c;\nd;", allNetwork({node(R"(a|"b\"|d)")}));
     addRow("unbalanced quote takes comment signs in", "a \";# b\n c;d \" #e;\nf;",
            allNetwork({node("a|\""), node("#|b|c"), node("d|\"|f")}));
     addRow("quotes in comments do not count", "a; # \"\nb; # c;\nd;", allNetwork({node("a|"), node("b|"), node("d|")}));

@@ -152,7 +152,7 @@ void DhcpdConfigModelTest::cleanup()
 
 QString DhcpdConfigModelTest::readSample()
 {
-    const QString path{m_root->path(QStringLiteral("/sample.conf"))};
+    QString path{m_root->path(QStringLiteral("/sample.conf"))};
     writeTestFile(path, sample);
     m_model->read(path);
     return path;
@@ -435,7 +435,7 @@ void DhcpdConfigModelTest::readsFileThatChangesMeanwhile()
     std::atomic<bool> stop{false};
     std::thread other{[&] {
         const QByteArray name{QFile::encodeName(path)};
-        for (off_t size{}; !stop; size = (size + 300'007) % (2 * content.size()))
+        for (off_t size{}; !stop; size = (size + 300'007) % (off_t{2} * content.size()))
             if (::truncate(name.constData(), size) != 0)
                 return;
     }};
