@@ -372,9 +372,9 @@ void TestDeclarationEdits::addsLinesToTheDeepestBlock()
 void TestDeclarationEdits::computesDefaultRange_data()
 {
     QTest::addColumn<QString>("subnet");
-    QTest::addColumn<QString>("range");
+    QTest::addColumn<QString>("expected");
 
-    for (const auto &[subnet, range] : {
+    for (const auto &[subnet, expected] : {
              std::pair{"192.168.1.0/24", "192.168.1.1|192.168.1.254"},
              std::pair{"192.168.1.77/24", "192.168.1.1|192.168.1.254"},
              std::pair{"192.168.1.0/255.255.255.0", "192.168.1.1|192.168.1.254"},
@@ -392,14 +392,14 @@ void TestDeclarationEdits::computesDefaultRange_data()
              std::pair{"abc", "|"},
              std::pair{"", "|"},
          })
-        QTest::addRow("%s", subnet) << text(subnet) << text(range);
+        QTest::addRow("%s", subnet) << text(subnet) << text(expected);
 }
 
 void TestDeclarationEdits::computesDefaultRange()
 {
     QFETCH(QString, subnet);
-    QFETCH(QString, range);
-    QCOMPARE(DhcpdConfigModel::defaultRange(subnet).join(QLatin1Char{'|'}), range);
+    QFETCH(QString, expected);
+    QCOMPARE(DhcpdConfigModel::defaultRange(subnet).join(QLatin1Char{'|'}), expected);
 }
 
 void TestDeclarationEdits::removesStatement()
