@@ -175,6 +175,18 @@ QList<QByteArray> backups()
     return contents;
 }
 
+// Closes the window with its changes saved, which fails.
+void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
+{
+    boxes.expectDialog<QMessageBox>(
+        [](QMessageBox *box) { QTest::mouseClick(box->button(QMessageBox::Yes), Qt::LeftButton); });
+    boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
+    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    site.window->close();
+    boxes.verify();
+    QVERIFY(!site.window->isVisible());
+}
+
 } // namespace
 
 class FileCommandsTest final : public QObject
@@ -687,14 +699,7 @@ void FileCommandsTest::unwrittenConfigurationIsKept()
     site.settle();
     site.modify();
     const QByteArray unsaved = site.model->fileContent();
-    ModalBoxes &boxes = *m_boxes;
-    boxes.expectDialog<QMessageBox>(
-        [](QMessageBox *box) { QTest::mouseClick(box->button(QMessageBox::Yes), Qt::LeftButton); });
-    boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
-    site.window->close();
-    boxes.verify();
-    QVERIFY(!site.window->isVisible());
+    closeAlthoughNothingCanBeSaved(site, *m_boxes);
     QCOMPARE(backups(), QList<QByteArray>{unsaved});
 }
 
@@ -709,13 +714,7 @@ void FileCommandsTest::nothingIsKeptOfNothing()
     boxes.verify();
     QVERIFY(site.isModified());
     site.settle();
-    boxes.expectDialog<QMessageBox>(
-        [](QMessageBox *box) { QTest::mouseClick(box->button(QMessageBox::Yes), Qt::LeftButton); });
-    boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
-    site.window->close();
-    boxes.verify();
-    QVERIFY(!site.window->isVisible());
+    closeAlthoughNothingCanBeSaved(site, boxes);
     QCOMPARE(backups(), QList<QByteArray>{});
     QVERIFY(!QFile::exists(paths::configuration()));
 }
