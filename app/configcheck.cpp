@@ -42,11 +42,18 @@ int makeMemoryFile(const QByteArray &content)
 class CheckProcess final : public QProcess
 {
 public:
-    explicit CheckProcess(int descriptor)
-        : m_descriptor{descriptor}
+    CheckProcess(int descriptor, QObject *parent)
+        : QProcess{parent}
+        , m_descriptor{descriptor}
     {
     }
-    ~CheckProcess() override { ::close(m_descriptor); }
+    ~CheckProcess() override
+    {
+        // A process object takes it for a mistake to be destroyed before its child has gone.
+        kill();
+        waitForFinished();
+        ::close(m_descriptor);
+    }
     Q_DISABLE_COPY_MOVE(CheckProcess)
 
 protected:
@@ -88,7 +95,7 @@ ConfigCheck::~ConfigCheck()
 {
     if (!m_process)
         return;
-    // Not waited for: the process object goes when the child has gone.
+    // Not waited for: the process object goes when the child has gone, or with its parent.
     m_process->disconnect(this);
     if (m_process->state() == QProcess::NotRunning) {
         delete m_process;
@@ -105,7 +112,7 @@ void ConfigCheck::start(const QByteArray &content)
     if (descriptor < 0)
         return;
     m_candidate = QStringLiteral("/proc/self/fd/%1").arg(descriptor);
-    m_process = new CheckProcess{descriptor};
+    m_process = new CheckProcess{descriptor, parent()};
     m_process->setProcessChannelMode(QProcess::MergedChannels);
     m_process->setStandardInputFile(QProcess::nullDevice());
     connect(m_process, qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this, &ConfigCheck::judge);

@@ -9,14 +9,14 @@ class QProcess;
 ///
 /// The text is handed over in a memory file that the child inherits, so nothing is staged on disk. Where the server is
 /// not found, or the check dies or does not come to a verdict, nothing is told. The destructor ends a check that still
-/// runs.
+/// runs, without waiting: what is left of it goes with the parent at the latest.
 class ConfigCheck final : public QObject
 {
     Q_OBJECT
     Q_DISABLE_COPY_MOVE(ConfigCheck)
 
 public:
-    explicit ConfigCheck(QObject *parent = nullptr);
+    explicit ConfigCheck(QObject *parent);
     ~ConfigCheck() override;
 
     /// Starts the check of `content`, once.

@@ -122,7 +122,7 @@ bool FMain::confirmsSave(const QByteArray &content)
     QMessageBox box{QMessageBox::Information, tr("Information"), text, QMessageBox::Save | QMessageBox::Cancel, this};
     box.setDefaultButton(QMessageBox::Save);
 
-    ConfigCheck check;
+    ConfigCheck check{this};
     connect(&check, &ConfigCheck::refused, &box, [&box](const QString &complaint, const QString &output) {
         box.setInformativeText(tr("The DHCP server refuses this configuration:\n%1").arg(complaint));
         box.setDetailedText(output);
