@@ -35,9 +35,24 @@ Kind kindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
 // Keywords that make a declaration of a statement without a block.
 constexpr std::string_view declarationKeywords[]{"range", "subclass", "fixed-address"};
 
+// Whether a word with that first byte may be one of them: most words are told apart by it. Beyond ASCII there are case
+// variants of ASCII letters.
+constexpr std::array<bool, 256> firstBytes{[] {
+    std::array<bool, 256> table{};
+    for (const std::string_view keyword : declarationKeywords) {
+        constexpr int toUpper{'A' - 'a'};
+        const auto first = static_cast<unsigned char>(keyword.front());
+        table[first] = table[first + toUpper] = true;
+    }
+    for (std::size_t byte{0x80}; byte < table.size(); ++byte)
+        table[byte] = true;
+    return table;
+}()};
+
 bool isDeclarationKeyword(std::string_view word)
 {
-    return std::any_of(std::begin(declarationKeywords), std::end(declarationKeywords),
+    return firstBytes[static_cast<unsigned char>(word.front())] &&
+           std::any_of(std::begin(declarationKeywords), std::end(declarationKeywords),
                        [word](std::string_view keyword) { return equalsIgnoringCase(word, keyword); });
 }
 

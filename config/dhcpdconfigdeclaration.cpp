@@ -4,6 +4,13 @@
 #include <algorithm>
 #include <utility>
 
+namespace {
+
+// What fits into the smallest block of memory that there is: most blocks have few statements.
+constexpr std::size_t firstCapacity{3};
+
+} // namespace
+
 DhcpdConfigDeclaration::DhcpdConfigDeclaration(const QStringList &words, DhcpdConfigDeclaration *parent)
     : DhcpdConfigDeclaration{WordList{WordList::Buffer{words}}, parent}
 {
@@ -117,6 +124,8 @@ template<class List>
 typename List::value_type::pointer DhcpdConfigDeclaration::append(List &list, typename List::value_type child)
 {
     Q_ASSERT(child->parent() == this);
+    if (list.empty())
+        list.reserve(firstCapacity);
     child->m_indexInList = static_cast<int>(list.size());
     list.push_back(std::move(child));
     return list.back().get();

@@ -72,12 +72,12 @@ bool DhcpdConfigStatement::setWordsFrom(int position, const QStringList &words)
 void DhcpdConfigStatement::setParent(DhcpdConfigDeclaration *parent)
 {
     m_parent = parent;
-    m_depth = parent ? parent->depth() + 1 : topDepth;
+    m_depth = static_cast<qint16>(parent ? parent->depth() + 1 : topDepth);
 }
 
 QString DhcpdConfigStatement::indent() const { return {indentWidth(), QLatin1Char{' '}}; }
 
-int DhcpdConfigStatement::indentWidth() const { return std::max(0, m_depth) * indentUnit; }
+int DhcpdConfigStatement::indentWidth() const { return std::max(0, depth()) * indentUnit; }
 
 QString DhcpdConfigStatement::joinedWordsFrom(int position) const
 {

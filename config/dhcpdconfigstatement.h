@@ -117,8 +117,8 @@ private:
 
     DhcpdConfigDeclaration *m_parent{};
     WordList m_words;
-    int m_depth{};
     int m_indexInList{-1};
+    qint16 m_depth{}; // small, and last: a declaration's flag fits in behind it
 };
 
 template<std::size_t size>
