@@ -175,6 +175,12 @@ QList<QByteArray> backups()
     return contents;
 }
 
+bool isCursorBusy()
+{
+    const QCursor *cursor = QGuiApplication::overrideCursor();
+    return cursor && cursor->shape() == Qt::WaitCursor;
+}
+
 // Closes the window with its changes saved, which fails.
 void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
 {
@@ -221,6 +227,8 @@ private slots:
     void reloadOfLeasesAsksNothing();
     void busyCursorShowsWhileMuchIsLoaded_data();
     void busyCursorShowsWhileMuchIsLoaded();
+    void busyCursorShowsWhileMuchIsSaved_data() { busyCursorShowsWhileMuchIsLoaded_data(); }
+    void busyCursorShowsWhileMuchIsSaved();
     void refusedLoadIsToldWithoutTheBusyCursor();
 
     void closing_data();
@@ -603,13 +611,33 @@ void FileCommandsTest::busyCursorShowsWhileMuchIsLoaded()
     writeTestFile(paths::configuration(), configuration + '#' + QByteArray(size, 'x') + '\n');
     const Site site{*m_machine, *m_boxes};
     bool wasBusy = false;
-    connect(site.model, &DhcpdConfigModel::dataChanged, this, [&wasBusy] {
-        const QCursor *cursor = QGuiApplication::overrideCursor();
-        wasBusy = cursor && cursor->shape() == Qt::WaitCursor;
-    });
+    connect(site.model, &DhcpdConfigModel::dataChanged, this, [&wasBusy] { wasBusy = isCursorBusy(); });
     ModalBoxes &boxes = *m_boxes;
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     site.pressReload();
+    boxes.verify();
+    QCOMPARE(wasBusy, busy);
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void FileCommandsTest::busyCursorShowsWhileMuchIsSaved()
+{
+    QFETCH(int, size);
+    QFETCH(bool, busy);
+    writeTestFile(paths::configuration(), configuration + '#' + QByteArray(size, 'x') + '\n');
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    const FullDisk full; // so that something is told while the file is written
+    bool wasBusy = false;
+    connect(site.model, &DhcpdConfigModel::error, this, [&wasBusy] { wasBusy = isCursorBusy(); });
+    ModalBoxes &boxes = *m_boxes;
+    boxes.expectBox(saveQuestion(), QMessageBox::Save);
+    boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
+        QCOMPARE(box->text(), cannotWrite().text);
+        QVERIFY(!isCursorBusy());
+        QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
+    });
+    site.pressSave();
     boxes.verify();
     QCOMPARE(wasBusy, busy);
     QVERIFY(!QGuiApplication::overrideCursor());
