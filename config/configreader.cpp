@@ -40,9 +40,9 @@ constexpr std::string_view declarationKeywords[]{"range", "subclass", "fixed-add
 constexpr std::array<bool, 256> firstBytes{[] {
     std::array<bool, 256> table{};
     for (const std::string_view keyword : declarationKeywords) {
-        constexpr int toUpper{'A' - 'a'};
-        const auto first = static_cast<unsigned char>(keyword.front());
-        table[first] = table[first + toUpper] = true;
+        constexpr std::size_t caseDistance{'a' - 'A'};
+        const std::size_t first{static_cast<unsigned char>(keyword.front())};
+        table[first] = table[first - caseDistance] = true;
     }
     for (std::size_t byte{0x80}; byte < table.size(); ++byte)
         table[byte] = true;
