@@ -4,6 +4,7 @@
 #include "config/dhcpdconfigdeclaration.h"
 
 #include <algorithm>
+#include <limits>
 #include <utility>
 
 namespace {
@@ -71,8 +72,9 @@ bool DhcpdConfigStatement::setWordsFrom(int position, const QStringList &words)
 
 void DhcpdConfigStatement::setParent(DhcpdConfigDeclaration *parent)
 {
+    static_assert(maximumBlockDepth < std::numeric_limits<decltype(m_depth)>::max());
     m_parent = parent;
-    m_depth = static_cast<qint16>(parent ? parent->depth() + 1 : topDepth);
+    m_depth = static_cast<decltype(m_depth)>(parent ? parent->depth() + 1 : topDepth);
 }
 
 QString DhcpdConfigStatement::indent() const { return {indentWidth(), QLatin1Char{' '}}; }
