@@ -4,7 +4,9 @@
 #include "app/fmain.h"
 #include "common/paths.h"
 
+#include <QCursor>
 #include <QFile>
+#include <QGuiApplication>
 #include <QProcess>
 #include <QSettings>
 #include <QTabBar>
@@ -59,6 +61,12 @@ void clickTab(const FMain &window, int tab)
 {
     auto *bar = window.findChild<QTabWidget *>(QStringLiteral("mainTabWidget"))->tabBar();
     QTest::mouseClick(bar, Qt::LeftButton, {}, bar->tabRect(tab).center());
+}
+
+bool isCursorBusy()
+{
+    const QCursor *cursor = QGuiApplication::overrideCursor();
+    return cursor && cursor->shape() == Qt::WaitCursor;
 }
 
 ModalBoxes::Box cannotRead()

@@ -57,6 +57,9 @@ private:
 /// Clicks a tab of the window: 0 is the topology, 1 the leases.
 void clickTab(const FMain &window, int tab);
 
+/// Whether every window shows that the program is busy.
+bool isCursorBusy();
+
 /// The box that tells that the configuration could not be read.
 ModalBoxes::Box cannotRead();
 

@@ -175,12 +175,6 @@ QList<QByteArray> backups()
     return contents;
 }
 
-bool isCursorBusy()
-{
-    const QCursor *cursor = QGuiApplication::overrideCursor();
-    return cursor && cursor->shape() == Qt::WaitCursor;
-}
-
 // Closes the window with its changes saved, which fails.
 void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
 {

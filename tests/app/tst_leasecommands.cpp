@@ -617,10 +617,7 @@ void LeaseCommandsTest::busyCursorShowsWhileMuchIsRead()
     const Site site{*m_machine};
 
     bool wasBusy = false;
-    const auto look = [&wasBusy] {
-        const QCursor *cursor = QGuiApplication::overrideCursor();
-        wasBusy = cursor && cursor->shape() == Qt::WaitCursor;
-    };
+    const auto look = [&wasBusy] { wasBusy = isCursorBusy(); };
     const QAbstractItemModel *model = site.table->model();
     connect(model, &QAbstractItemModel::modelReset, this, look);
     connect(model, &QAbstractItemModel::rowsInserted, this, look);
