@@ -1,29 +1,24 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/fmain.h"
 
-#include "app/pathwatch.h"
-#include "app/topologymenus.h"
-#include "app/treeexpansion.h"
+#include "app/configurationfile.h"
+#include "app/leasepage.h"
+#include "app/servicecontrols.h"
+#include "app/topologypage.h"
+#include "common/fileio.h"
 #include "common/paths.h"
-#include "config/dhcpdconfigdeclaration.h"
 #include "config/dhcpdconfigmodel.h"
-#include "leases/dhcpdleasesmodel.h"
-#include "leases/leaseproxymodel.h"
 #include "platform/orvhelpmenu.h"
 #include "platform/packagemanager.h"
 #include "ui_fmain.h"
 
+#include <QCloseEvent>
 #include <QGuiApplication>
-#include <QHeaderView>
-#include <QLabel>
-#include <QMenu>
 #include <QMessageBox>
 #include <QSettings>
 
 namespace {
 
-constexpr int statusIndent = 5;
-constexpr int measuredRows = 50; // of the lease table, for the widths of its columns
 constexpr auto sizeKey = "MainWindow/Size";
 
 /// An action of the form, its theme icon, and the slot of the window that it triggers (none when another object's).
@@ -35,7 +30,7 @@ struct ActionRow
 };
 
 // The "Edit" action deliberately carries the "list-add" icon.
-const ActionRow actionTable[] = {
+const ActionRow actionTable[]{
     {&Ui::FMain::aReload, "view-refresh", &FMain::reload},
     {&Ui::FMain::aSave, "document-save", &FMain::save},
     {&Ui::FMain::aExit, "application-exit", nullptr},
@@ -51,18 +46,10 @@ const ActionRow actionTable[] = {
     {&Ui::FMain::actionEdit, "list-add", &FMain::handleEdit},
     {&Ui::FMain::actionRemove, "list-remove", nullptr},
     {&Ui::FMain::aAddFixedIp, "preferences-system-network", &FMain::handleAddFixedAddress},
-    {&Ui::FMain::aAddDns, "configure", &FMain::handleAddDns},
-    {&Ui::FMain::aAddDomainName, "configure", &FMain::handleAddDomainName},
-    {&Ui::FMain::aAddRouters, "configure", &FMain::handleAddRouters},
-    {&Ui::FMain::aAddNtpServers, "configure", &FMain::handleAddNtp},
-    {&Ui::FMain::aAddDefaultLeaseTime, "configure", &FMain::handleAddDefaultLeaseTime},
-    {&Ui::FMain::aAddMaxLeaseTime, "configure", &FMain::handleAddMaxLeaseTime},
     {&Ui::FMain::aAddReserveIP, "computer", &FMain::handleReserveIp},
     {&Ui::FMain::aAddStaticRoute, "computer", &FMain::handleAddStaticRoute},
     {&Ui::FMain::aAddDHCPDynamicUpdate, "configure", &FMain::handleAddBind9Settings},
 };
-
-QIcon themeIcon(const char *name) { return QIcon::fromTheme(QLatin1String{name}); }
 
 } // namespace
 
@@ -73,13 +60,11 @@ FMain::FMain(QWidget *parent)
     m_ui->setupUi(this);
     m_ui->menubar->addMenu(new OrvHelpMenu{this});
     setUpActions();
-    setUpServer();
+    setUpService();
     setUpTopology();
     setUpLeases();
-    m_topologyMenus = std::make_unique<TopologyMenus>(*m_ui, this);
-    setUpSearch();
     connect(m_ui->mainTabWidget, &QTabWidget::currentChanged, this, &FMain::currentTabChanged);
-    restoreSize();
+    resize(QSettings{}.value(QLatin1String{sizeKey}, size()).toSize());
 }
 
 FMain::~FMain() { QSettings{}.setValue(QLatin1String{sizeKey}, size()); }
@@ -87,171 +72,103 @@ FMain::~FMain() { QSettings{}.setValue(QLatin1String{sizeKey}, size()); }
 void FMain::setUpActions()
 {
     for (const ActionRow &row : actionTable) {
-        QAction *action = m_ui.get()->*row.action;
-        action->setIcon(themeIcon(row.icon));
+        QAction *action{m_ui.get()->*row.action};
+        action->setIcon(QIcon::fromTheme(QLatin1String{row.icon}));
         if (row.slot)
             connect(action, &QAction::triggered, this, row.slot);
     }
     connect(m_ui->aExit, &QAction::triggered, this, &FMain::close);
-    connect(m_ui->actionRemove, &QAction::triggered, this, &FMain::removeCurrentStatement);
 }
 
-void FMain::setUpServer()
+void FMain::setUpService()
 {
-    m_statusLabel = new QLabel{this};
-    m_statusLabel->setIndent(statusIndent);
-    m_ui->statusBar->addWidget(m_statusLabel);
-
-    m_serverManager = std::make_unique<DhcpServerManager>(nullptr);
-    m_statusLabel->setText(m_serverManager->serverStateText());
-    DhcpServerManager *manager = m_serverManager.get();
-    connect(manager, &DhcpServerManager::error, this, &FMain::showError);
+    m_service = std::make_unique<ServiceControls>(*m_ui, this);
+    DhcpServerManager *manager{&m_service->manager()};
+    connect(manager, &DhcpServerManager::error, this, [this](const QString &message) { showError(message); });
     connect(manager, &DhcpServerManager::information, this, &FMain::showInformation);
     connect(manager, &DhcpServerManager::serverStateChanged, this, &FMain::handleServerStateChanged);
-    connect(m_ui->actionRestart, &QAction::triggered, manager, &DhcpServerManager::restartServer);
     manager->checkRunning();
 }
 
 void FMain::setUpTopology()
 {
     m_configModel = new DhcpdConfigModel{{tr("Topology"), tr("Value")}, this};
-    connect(m_configModel, &DhcpdConfigModel::error, this, &FMain::showError);
+    connect(m_configModel, &DhcpdConfigModel::error, this, [this](const QString &message) { showError(message); });
     connect(m_configModel, &DhcpdConfigModel::dataChanged, this,
             [this] { m_ui->aSave->setEnabled(m_configModel->isModified()); });
+    m_file = std::make_unique<ConfigurationFile>(m_configModel, this);
 
-    m_configModel->read();
-    QTreeView *tree = m_ui->topologyTree;
-    tree->setModel(m_configModel);
-    m_treeExpansion = new TreeExpansion{tree};
+    const QTreeView *tree{m_ui->topologyTree};
+    m_topology = std::make_unique<TopologyPage>(*m_ui, m_configModel, this);
     connect(tree->selectionModel(), &QItemSelectionModel::currentRowChanged, this, &FMain::handleTreeItemChanged);
-    showWholeTopology();
-    tree->setContextMenuPolicy(Qt::CustomContextMenu);
     connect(tree, &QTreeView::customContextMenuRequested, this, &FMain::handleTreeContextMenuRequested);
     connect(tree, &QTreeView::doubleClicked, this, &FMain::handleTreeDoubleClicked);
+    connect(m_file.get(), &ConfigurationFile::reloaded, m_topology.get(), &TopologyPage::showAll);
+    connect(m_topology.get(), &TopologyPage::requested, this,
+            [this] { m_ui->mainTabWidget->setCurrentIndex(TopologyTab); });
+    m_topology->showAll();
 
-    m_configWatch = new PathWatch{paths::configuration(), paths::configurationDirectory(), this};
-    connect(m_configWatch, &PathWatch::changed, this, &FMain::configChanged);
-
-    m_bind9Versions = OrvAdmin::PackageManager::getInstalledPackagesVersions(QStringLiteral("bind9"));
-    m_ui->aAddDHCPDynamicUpdate->setEnabled(!m_bind9Versions.isEmpty());
+    const auto bind9Versions = OrvAdmin::PackageManager::getInstalledPackagesVersions(QStringLiteral("bind9"));
+    m_ui->aAddDHCPDynamicUpdate->setEnabled(!bind9Versions.isEmpty());
 }
 
 void FMain::setUpLeases()
 {
-    m_leaseWatch = new PathWatch{paths::leases(), paths::leaseDirectory(), this};
-    connect(m_leaseWatch, &PathWatch::changed, this, &FMain::leaseReload);
-
-    // The model's error signal is deliberately not connected: a missing lease file is an empty table, not a message.
-    m_leasesModel = std::make_unique<DhcpdLeasesModel>(nullptr);
-    readLeases();
-
-    QTableView *table = m_ui->dhcpdLeaseTable;
-    table->setSelectionMode(QAbstractItemView::SingleSelection);
-    table->setSelectionBehavior(QAbstractItemView::SelectRows);
-    table->setContextMenuPolicy(Qt::CustomContextMenu);
-    table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
-    table->horizontalHeader()->setResizeContentsPrecision(measuredRows);
-    table->verticalHeader()->setDefaultSectionSize(table->verticalHeader()->minimumSectionSize());
+    m_leases = std::make_unique<LeasePage>(*m_ui, this);
+    const QTableView *table{m_ui->dhcpdLeaseTable};
     connect(table, &QTableView::customContextMenuRequested, this, &FMain::handleTableContextMenuRequested);
     connect(table, &QTableView::doubleClicked, this, &FMain::handleTableDoubleClicked);
-
-    m_leaseMenu = new QMenu{tr("Actions"), this};
-    m_leaseMenu->addAction(m_ui->aAddReserveIP);
-    // Queued: the menu hides before it triggers what was chosen.
-    connect(
-        m_leaseMenu, &QMenu::aboutToHide, this, [this] { m_menuLease.reset(); }, Qt::QueuedConnection);
-
-    m_leaseProxy = std::make_unique<LeaseProxyModel>(nullptr);
-    m_leaseProxy->setSourceModel(m_leasesModel.get());
-    m_leaseProxy->setFilterKeyColumn(-1);
-    table->setModel(m_leaseProxy.get());
-}
-
-void FMain::setUpSearch()
-{
-    m_ui->searchLease->addAction(themeIcon("edit-find"), QLineEdit::LeadingPosition)->setText(tr("Search"));
-    m_ui->searchLease->setClearButtonEnabled(true);
-    // Qt leaves its button without a text that could be said.
-    if (auto *clear = m_ui->searchLease->findChild<QAction *>(QStringLiteral("_q_qlineeditclearaction")))
-        clear->setText(tr("Clear the search"));
     connect(m_ui->searchLease, &QLineEdit::textChanged, this, &FMain::searchLease);
-
-    struct StepButton
-    {
-        QToolButton *button;
-        const char *icon;
-        void (FMain::*slot)();
-    };
-    for (const StepButton &step : {StepButton{m_ui->searchPrevLease, "previous", &FMain::selectPrevLease},
-                                   StepButton{m_ui->searchNextLease, "next", &FMain::selectNextLease}}) {
-        step.button->setIcon(themeIcon(step.icon));
-        step.button->setAutoRaise(true);
-        step.button->setEnabled(false);
-        connect(step.button, &QToolButton::clicked, this, step.slot);
-    }
+    connect(m_ui->searchPrevLease, &QToolButton::clicked, this, &FMain::selectPrevLease);
+    connect(m_ui->searchNextLease, &QToolButton::clicked, this, &FMain::selectNextLease);
+    connect(m_leases.get(), &LeasePage::reservationRequested, m_topology.get(), &TopologyPage::reserve);
 }
 
-void FMain::restoreSize() { resize(QSettings{}.value(QLatin1String{sizeKey}, size()).toSize()); }
-
-void FMain::showError(const QString &text)
+void FMain::reload()
 {
-    if (m_heldErrors) {
-        m_heldErrors->append(text);
+    if (m_ui->mainTabWidget->currentIndex() == LeasesTab) {
+        m_leases->reload();
         return;
     }
+    const auto answer =
+        QMessageBox::information(this, tr("Information"), tr("Do you want to reload configuration from file?"),
+                                 QMessageBox::Yes | QMessageBox::No, QMessageBox::Yes);
+    if (answer == QMessageBox::Yes)
+        m_file->reload();
+}
+
+void FMain::save() { m_file->save(); }
+
+void FMain::closeEvent(QCloseEvent *event)
+{
+    if (!m_configModel->isModified()) {
+        event->accept();
+        return;
+    }
+    const auto answer = QMessageBox::question(this, tr("Confirmation"), tr("There are unsaved changes, save?"),
+                                              QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
+    if (answer == QMessageBox::Yes) {
+        // The window closes whatever becomes of the save, deliberately; what could not be written is kept.
+        const SaveResult result{m_file->save()};
+        if (!result.unwritten.isNull())
+            fileio::keepCopy(paths::configuration(), result.unwritten);
+    }
+    event->setAccepted(answer == QMessageBox::Yes || answer == QMessageBox::No);
+}
+
+void FMain::showError(const QString &text, const QString &reason)
+{
+    QMessageBox box{QMessageBox::Critical, tr("Error"), text, QMessageBox::Ok, this};
+    box.setInformativeText(reason);
     // A failed load reports from under the busy cursor.
     QGuiApplication::setOverrideCursor(QCursor{Qt::ArrowCursor});
-    QMessageBox::critical(this, tr("Error"), text, QMessageBox::Ok);
+    box.exec();
     QGuiApplication::restoreOverrideCursor();
 }
 
 void FMain::showInformation(const QString &text)
 {
     QMessageBox::information(this, tr("Information"), text, QMessageBox::Ok);
-}
-
-void FMain::startStopServer()
-{
-    if (m_serverManager->isServerRunning())
-        m_serverManager->stopServer();
-    else
-        m_serverManager->runServer();
-}
-
-void FMain::handleServerStateChanged(DhcpServerManager::ServerStates state)
-{
-    m_statusLabel->setText(m_serverManager->serverStateText());
-
-    QAction *action = m_ui->actionStartStopServer;
-    const auto offer = [action](const char *icon, const QString &text) {
-        action->setEnabled(true);
-        action->setIcon(themeIcon(icon));
-        action->setText(text);
-        action->setToolTip(text);
-    };
-    switch (state) {
-    case DhcpServerManager::Running:
-        offer("media-playback-stop", tr("Stop DHCP-server"));
-        break;
-    case DhcpServerManager::Stopped:
-        offer("media-playback-start", tr("Start DHCP-server"));
-        break;
-    case DhcpServerManager::Updating:
-        action->setEnabled(false);
-        break;
-    }
-}
-
-void FMain::handleTreeItemChanged(QModelIndex current)
-{
-    const auto *statement = static_cast<DhcpdConfigStatement *>(current.internalPointer());
-    if (!statement || m_ui->mainTabWidget->currentIndex() != TopologyTab)
-        return;
-    const bool root = statement->isDeclaration() && statement->isRoot();
-    const bool sharedNetwork = statement->isDeclaration() && statement->isSharedNetwork();
-    m_ui->aAddSharedNetwork->setEnabled(root);
-    m_ui->aAddSubnet->setEnabled(root || sharedNetwork);
-    m_ui->aAddHost->setEnabled(root);
 }
 
 void FMain::currentTabChanged(int index)
@@ -261,5 +178,99 @@ void FMain::currentTabChanged(int index)
     for (QAction *action : {m_ui->aAddHost, m_ui->aAddSubnet, m_ui->aAddSharedNetwork})
         action->setEnabled(index == TopologyTab);
     if (index == LeasesTab)
-        readLeases();
+        m_leases->reload();
 }
+
+void FMain::handleTreeItemChanged(QModelIndex current)
+{
+    if (m_ui->mainTabWidget->currentIndex() == TopologyTab)
+        m_topology->enableAddActions(current);
+}
+
+void FMain::configChanged() { m_file->noteChange(); }
+
+void FMain::getInterfaces() { m_service->chooseInterfaces(); }
+
+void FMain::startStopServer() { m_service->startOrStop(); }
+
+void FMain::handleServerStateChanged(DhcpServerManager::ServerStates state) { m_service->showState(state); }
+
+void FMain::handleTreeContextMenuRequested(QPoint /*position*/) { m_topology->openMenu(); }
+
+void FMain::handleTreeDoubleClicked(QModelIndex index) { m_topology->edit(index); }
+
+void FMain::handleEdit() { m_topology->editCurrent(); }
+
+void FMain::handleAddArbitraryDeclaration() { m_topology->declarations().addArbitrary(); }
+
+void FMain::handleEditArbitraryDeclaration() { m_topology->declarations().editArbitrary(); }
+
+void FMain::handleAddArbitraryParam() { m_topology->parameters().addArbitrary(); }
+
+void FMain::handleEditArbitraryParam() { m_topology->parameters().editArbitrary(); }
+
+void FMain::handleAddSharedNetwork() { m_topology->declarations().addSharedNetwork(); }
+
+void FMain::handleEditSharedNetwork() { m_topology->declarations().editSharedNetwork(); }
+
+void FMain::handleAddSubnet() { m_topology->declarations().addSubnet(); }
+
+void FMain::handleEditSubnet() { m_topology->declarations().editSubnet(); }
+
+void FMain::handleAddRange() { m_topology->declarations().addRange(); }
+
+void FMain::handleEditRange() { m_topology->declarations().editRange(); }
+
+void FMain::handleAddHost() { m_topology->declarations().addHost(); }
+
+void FMain::handleEditHost() { m_topology->declarations().editHost(); }
+
+void FMain::handleAddFixedAddress() { m_topology->declarations().addFixedAddress(); }
+
+void FMain::handleEditFixedAddress() { m_topology->declarations().editFixedAddress(); }
+
+void FMain::handleAddRouters() { m_topology->parameters().add("routers"); }
+
+void FMain::handleEditRouters() { m_topology->parameters().edit("routers"); }
+
+void FMain::handleAddDns() { m_topology->parameters().add("domain-name-servers"); }
+
+void FMain::handleEditDns() { m_topology->parameters().edit("domain-name-servers"); }
+
+void FMain::handleAddNtp() { m_topology->parameters().add("ntp-servers"); }
+
+void FMain::handleEditNtp() { m_topology->parameters().edit("ntp-servers"); }
+
+void FMain::handleAddDomainName() { m_topology->parameters().add("domain-name"); }
+
+void FMain::handleEditDomainName() { m_topology->parameters().edit("domain-name"); }
+
+void FMain::handleAddMaxLeaseTime() { m_topology->parameters().add("max-lease-time"); }
+
+void FMain::handleEditMaxLeaseTime() { m_topology->parameters().edit("max-lease-time"); }
+
+void FMain::handleAddDefaultLeaseTime() { m_topology->parameters().add("default-lease-time"); }
+
+void FMain::handleEditDefaultLeaseTime() { m_topology->parameters().edit("default-lease-time"); }
+
+void FMain::handleEditMacAddress() { m_topology->parameters().edit("hardware"); }
+
+void FMain::handleAddStaticRoute() { m_topology->declarations().addStaticRoute(); }
+
+void FMain::handleEditStaticRoute() { m_topology->declarations().editStaticRoute(); }
+
+void FMain::handleAddBind9Settings() { m_topology->declarations().addBind9Settings(); }
+
+void FMain::leaseReload() { m_leases->update(); }
+
+void FMain::handleTableContextMenuRequested(QPoint position) { m_leases->openMenu(position); }
+
+void FMain::handleReserveIp() { m_leases->reserveCurrent(); }
+
+void FMain::handleTableDoubleClicked(QModelIndex index) { m_leases->reserve(index); }
+
+void FMain::searchLease(const QString &name) { m_leases->search(name); }
+
+void FMain::selectNextLease() { m_leases->step(1); }
+
+void FMain::selectPrevLease() { m_leases->step(-1); }

@@ -4,31 +4,25 @@
 #include "server/dhcpservermanager.h"
 
 #include <QMainWindow>
-#include <QModelIndexList>
+#include <QModelIndex>
 
 #include <memory>
-#include <optional>
 
+class ConfigurationFile;
 class DhcpdConfigModel;
-class DhcpdConfigStatement;
-class DhcpdLeasesModel;
-class LeaseProxyModel;
-class PathWatch;
-class QLabel;
-class QMenu;
+class LeasePage;
 class QString;
-class TopologyMenus;
-class TreeExpansion;
+class ServiceControls;
+class TopologyPage;
 
 namespace Ui {
 class FMain;
 }
 
-/// The program's window: the configuration as a tree, the leases as a table, the server's state in the status bar, and
-/// the commands on them.
+/// The program's window: the frame of its pages, which know the commands. It shows in modal boxes whatever they and the
+/// models report.
 ///
-/// The constructor reads the configuration and the leases and asks for the server's state. Whatever the models and the
-/// server manager report is shown in modal boxes.
+/// The constructor reads the configuration and the leases and asks for the server's state.
 class FMain final : public QMainWindow
 {
     Q_OBJECT
@@ -100,110 +94,18 @@ private:
         LeasesTab
     };
 
-    void showError(const QString &text);
-    void showInformation(const QString &text);
-
     void setUpActions();
-    void setUpServer();
+    void setUpService();
     void setUpTopology();
     void setUpLeases();
-    void setUpSearch();
-    void restoreSize();
 
-    /// Reads the whole lease file.
-    void readLeases();
-
-    enum class SaveOutcome
-    {
-        Saved,
-        Declined,
-        Failed
-    };
-    SaveOutcome saveConfiguration();
-    /// Asks whether to write `content` over the configuration, and tells if the server refuses it.
-    bool confirmsSave(const QByteArray &content);
-    /// Writes the model to the configuration file without noticing that as a change.
-    bool writeConfiguration();
-    void reloadTopology();
-    void showWholeTopology();
-
-    using KindTest = bool (*)(const DhcpdConfigStatement &);
-
-    /// Opens the editor that fits the statement at `index`; nothing for the nodes above the file's statements.
-    void editStatement(const QModelIndex &index);
-    void removeCurrentStatement();
-
-    /// The tree's current index where it is a declaration's; else invalid.
-    QModelIndex currentDeclaration() const;
-    /// The tree's current index where it is that of a statement of the kind, as the file has it; else invalid.
-    QModelIndex currentOfKind(KindTest isKind) const;
-    /// What is open in the tree after an add besides the declaration that was added to.
-    enum class OpenBranches
-    {
-        AsBefore,
-        All
-    };
-    /// Runs `change`, which may add children to the declaration at `parent`, and shows what was added.
-    template<typename Change>
-    void addTo(const QModelIndex &parent, const Change &change, OpenBranches open = OpenBranches::AsBefore);
-    /// Asks with a `Dialog` made ready by `fill(dialog)` and, when it is accepted, calls `add(dialog, parent)` with the
-    /// current declaration.
-    template<typename Dialog, typename Fill, typename Add>
-    void addThroughDialog(const QString &title, const Fill &fill, const Add &add,
-                          OpenBranches open = OpenBranches::AsBefore);
-    /// Asks with a `Dialog` made ready by `fill(dialog, statement)` from the current statement, if that is of the kind;
-    /// when it is accepted with another value than shown, calls `handOver(index, value, shown value)`.
-    template<typename Dialog, typename Fill, typename Value, typename HandOver>
-    void editThroughDialog(const QString &title, KindTest isKind, const Fill &fill, const Value &value,
-                           const HandOver &handOver);
-    /// The same for a value that is one text, which goes to the model's setData().
-    template<typename Dialog, typename Fill, typename Value>
-    void editValueThroughDialog(const QString &title, KindTest isKind, const Fill &fill, const Value &value);
-
-    /// Asks whether to go on with a free-text command.
-    bool resumesAdvancedEditing();
-    void addArbitrary(const QString &title, const QString &label,
-                      bool (DhcpdConfigModel::*add)(const QStringList &, const QModelIndex &));
-    void editArbitrary(const QString &title, const QString &label, KindTest isKind);
-    void addAddressList(const QString &title, const QString &label,
-                        void (DhcpdConfigModel::*add)(const QString &, const QModelIndex &));
-    void editAddressList(const QString &title, const QString &label, KindTest isKind);
-    void addLeaseTime(const QString &title, bool (DhcpdConfigModel::*add)(const QString &, const QModelIndex &));
-    void editLeaseTime(const QString &title, KindTest isKind);
-    void editOtherLeaseTime();
-
-    QModelIndexList leaseMatches(const QString &text, int hits) const;
-    void showLeaseMatch(const QModelIndex &match);
-    void stepToLease(int step);
-    /// The texts of a lease, copied, since the table may change while a menu or dialog is open.
-    struct LeaseTexts
-    {
-        QString address;
-        QString mac;
-        QString hostName;
-    };
-    /// The lease at an index of the lease table.
-    static std::optional<LeaseTexts> leaseAt(const QModelIndex &index);
-    /// Offers to add a host for a lease.
-    void reserve(const std::optional<LeaseTexts> &lease);
-    /// Adds a host and opens the whole tree.
-    void addHostTo(const QModelIndex &network, const QString &name, const QString &mac, const QString &ip);
+    void showError(const QString &text, const QString &reason = {});
+    void showInformation(const QString &text);
 
     std::unique_ptr<Ui::FMain> m_ui;
-    QLabel *m_statusLabel{};
-    std::unique_ptr<DhcpServerManager> m_serverManager;
     DhcpdConfigModel *m_configModel{};
-    std::unique_ptr<DhcpdLeasesModel> m_leasesModel;
-    TreeExpansion *m_treeExpansion{};
-    PathWatch *m_configWatch{};
-    PathWatch *m_leaseWatch{};
-    std::unique_ptr<LeaseProxyModel> m_leaseProxy;
-    QMenu *m_leaseMenu{};
-    std::optional<LeaseTexts> m_menuLease; // the one that the open lease menu is about
-    int m_matchPosition{};
-    QStringList m_bind9Versions;
-    std::unique_ptr<TopologyMenus> m_topologyMenus;
-    std::optional<QStringList> m_heldErrors; // while errors are to be shown later
-    bool m_ignoreNextChange{};
-    bool m_changedOutside{};
+    std::unique_ptr<ServiceControls> m_service;
+    std::unique_ptr<ConfigurationFile> m_file;
+    std::unique_ptr<TopologyPage> m_topology;
+    std::unique_ptr<LeasePage> m_leases;
 };

@@ -10,7 +10,7 @@ constexpr int burstMilliseconds = 100;
 
 void unwatch(QFileSystemWatcher *watcher)
 {
-    const QStringList paths = watcher->files() + watcher->directories();
+    const QStringList paths{watcher->files() + watcher->directories()};
     if (!paths.isEmpty())
         watcher->removePaths(paths);
 }

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/topologymenus.h"
 
-#include "app/fmain.h"
+#include "app/parametercommands.h"
+#include "app/windowtext.h"
 #include "config/dhcpdconfigstatement.h"
 #include "ui_fmain.h"
 
@@ -18,25 +19,23 @@ struct Separator
 
 } // namespace
 
-/// A menu's title and entries: actions of the form, separators, and menus that stand in an earlier row as submenus.
+/// A menu's title and entries: actions, alone or several, separators, and menus of earlier rows as submenus.
 struct TopologyMenus::Row
 {
     Menu menu;
     const char *title;
-    std::vector<std::variant<QAction *, Separator, Menu>> entries;
+    std::vector<std::variant<QAction *, QList<QAction *>, Separator, Menu>> entries;
 };
 
-TopologyMenus::TopologyMenus(const Ui::FMain &ui, QWidget *parent)
+TopologyMenus::TopologyMenus(const Ui::FMain &ui, const ParameterCommands &parameters, QWidget *parent)
 {
-    const char *const actions = QT_TRANSLATE_NOOP("FMain", "Actions");
-    const Separator separator;
+    const char *actions{QT_TRANSLATE_NOOP("FMain", "Actions")};
+    const Separator separator{};
     const std::vector<Row> table{
-        {AddOption,
-         QT_TRANSLATE_NOOP("FMain", "Add option"),
-         {ui.aAddRouters, ui.aAddDns, ui.aAddNtpServers, ui.aAddDomainName, ui.aAddDHCPDynamicUpdate}},
+        {AddOption, QT_TRANSLATE_NOOP("FMain", "Add option"), {parameters.optionActions(), ui.aAddDHCPDynamicUpdate}},
         {AddParameter,
          QT_TRANSLATE_NOOP("FMain", "Add parameter"),
-         {AddOption, separator, ui.aAddDefaultLeaseTime, ui.aAddMaxLeaseTime, separator, ui.aAddParam}},
+         {AddOption, separator, parameters.otherActions(), separator, ui.aAddParam}},
         {Root,
          actions,
          {ui.aAddSharedNetwork, ui.aAddSubnet, ui.aAddHost, ui.aAddStaticRoute, separator, ui.aAddDeclaration,
@@ -60,11 +59,13 @@ TopologyMenus::TopologyMenus(const Ui::FMain &ui, QWidget *parent)
     };
 
     for (const Row &row : table) {
-        auto *menu = new QMenu{FMain::tr(row.title), parent};
+        auto *menu = new QMenu{WindowText::tr(row.title), parent};
         m_menus.at(row.menu) = menu;
         for (const auto &entry : row.entries) {
             if (const auto *action = std::get_if<QAction *>(&entry))
                 menu->addAction(*action);
+            else if (const auto *several = std::get_if<QList<QAction *>>(&entry))
+                menu->addActions(*several);
             else if (const auto *submenu = std::get_if<Menu>(&entry))
                 menu->addMenu(m_menus.at(*submenu));
             else

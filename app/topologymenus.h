@@ -4,6 +4,7 @@
 #include <array>
 
 class DhcpdConfigStatement;
+class ParameterCommands;
 class QMenu;
 class QWidget;
 
@@ -15,8 +16,8 @@ class FMain;
 class TopologyMenus final
 {
 public:
-    /// Builds the menus, as children of `parent`, from the actions of `ui`.
-    TopologyMenus(const Ui::FMain &ui, QWidget *parent);
+    /// Builds the menus, as children of `parent`, from the actions of `ui` and `parameters`.
+    TopologyMenus(const Ui::FMain &ui, const ParameterCommands &parameters, QWidget *parent);
 
     /// The menu of the commands that fit `statement`.
     QMenu *menuFor(const DhcpdConfigStatement &statement) const;

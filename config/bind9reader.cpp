@@ -3,6 +3,7 @@
 
 #include "common/fileio.h"
 #include "common/textencoding.h"
+#include "config/values.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -167,7 +168,7 @@ QStringList keptHeading(Block block, const QStringList &words)
 {
     if (block == Block::Key)
         return {keyKeyword, words.value(1)};
-    QString name{bind9::unquoted(words.value(1))};
+    QString name{values::unquoted(words.value(1))};
     if (name.endsWith(dot))
         name.chop(1); // statements() appends one
     return {zoneKeyword, name};
@@ -209,7 +210,7 @@ QStringList scannedStatement(QStringList words, QChar delimiter)
     if (std::any_of(words.cbegin(), words.cend(), dropsStatement))
         return delimiter == QLatin1Char{'}'} ? words : QStringList{}; // deliberately not dropped before a closing brace
     if (words.contains(zoneKeyword)) {
-        words[1] = bind9::unquoted(words.at(1)) + dot;
+        words[1] = values::unquoted(words.at(1)) + dot;
         if (delimiter == QLatin1Char{'{'})
             words << primaryKeyword << QStringLiteral("127.0.0.1");
     }
@@ -219,7 +220,7 @@ QStringList scannedStatement(QStringList words, QChar delimiter)
 // The name of a key in the form in which bind9 compares it.
 QString comparableName(const QString &name)
 {
-    QString comparable{bind9::unquoted(name).toLower()};
+    QString comparable{values::unquoted(name).toLower()};
     if (comparable.endsWith(dot))
         comparable.chop(1);
     return comparable;
@@ -228,13 +229,13 @@ QString comparableName(const QString &name)
 // The DHCP server, other than bind9, takes names with and without a dot at their end for different ones.
 QString referenceTo(const QString &definedName, const QString &name)
 {
-    return bind9::unquoted(definedName).endsWith(dot) == bind9::unquoted(name).endsWith(dot) ? name : definedName;
+    return values::unquoted(definedName).endsWith(dot) == values::unquoted(name).endsWith(dot) ? name : definedName;
 }
 
 QStringList keyWithPlainAlgorithm(QStringList words)
 {
     const int algorithm{words.indexOf(algorithmKeyword, 2) + 1};
-    words[algorithm] = bind9::unquoted(words.at(algorithm));
+    words[algorithm] = values::unquoted(words.at(algorithm));
     return words;
 }
 
@@ -373,7 +374,5 @@ QStringList usable(const QStringList &statements, const QStringList &knownKeys)
     }
     return result;
 }
-
-QString unquoted(QString word) { return word.remove(quote); }
 
 } // namespace bind9

@@ -34,7 +34,4 @@ QStringList statements(const QString &text);
 /// among `knownKeys`, and behind that key. A zone without such a key is left out. Algorithms lose their quotes.
 QStringList usable(const QStringList &statements, const QStringList &knownKeys);
 
-/// `word` without its double quotes.
-QString unquoted(QString word);
-
 } // namespace bind9

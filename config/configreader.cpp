@@ -101,7 +101,7 @@ bool Reader::read(std::string_view text)
         if (kind == Kind::Hash && quoted)
             continue;
 
-        // Only the start of a comment heeds quotes: blanks and delimiters end a quoted word as well, deliberately.
+        // Quotes matter to the start of a comment only: blanks and delimiters end a quoted word as well, deliberately.
         endWord(text.substr(wordStart, i - wordStart));
         if (kind == Kind::Hash)
             i = std::min(text.find('\n', i), text.size());
@@ -130,8 +130,7 @@ bool Reader::endStatement(Kind delimiter)
     } else if (m_wordCount == 0) {
         return true;
     } else if (isDeclaration) {
-        auto *const declaration =
-            m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
+        auto *declaration = m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
         if (delimiter == Kind::OpeningBrace) {
             declaration->setReadAsBlock();
             m_current = declaration;

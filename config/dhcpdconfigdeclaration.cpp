@@ -91,7 +91,11 @@ int DhcpdConfigDeclaration::row() const { return parent() ? parent()->parameterC
 
 QString DhcpdConfigDeclaration::label() const
 {
-    static constexpr KindLabel declarationLabels[]{
+    static constexpr struct
+    {
+        bool (DhcpdConfigStatement::*isKind)() const;
+        const char *label;
+    } kinds[]{
         {&DhcpdConfigStatement::isSubnet, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Subnet")},
         {&DhcpdConfigStatement::isSharedNetwork, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Shared network")},
         {&DhcpdConfigStatement::isHost, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Host")},
@@ -101,7 +105,11 @@ QString DhcpdConfigDeclaration::label() const
         {&DhcpdConfigStatement::isZone, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Zone served by DNS server")},
         {&DhcpdConfigStatement::isGroup, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Group")},
     };
-    return labelAmong(declarationLabels, 0);
+    for (const auto &kind : kinds) {
+        if ((this->*kind.isKind)())
+            return tr(kind.label);
+    }
+    return keyword();
 }
 
 QString DhcpdConfigDeclaration::valueText() const

@@ -33,17 +33,14 @@ QModelIndex DhcpdConfigModel::index(int row, int column, const QModelIndex &pare
     const bool hasColumn{column == 0 ? !holder.words().isEmpty() : column > 0 && column < columnCount(parent)};
     if (row < 0 || row >= rowCount(parent) || !hasColumn)
         return {};
-    DhcpdConfigStatement *const child{holder.child(row)};
+    DhcpdConfigStatement *child{holder.child(row)};
     return child ? createIndex(row, column, child) : QModelIndex{};
 }
 
 QModelIndex DhcpdConfigModel::parent(const QModelIndex &index) const
 {
-    DhcpdConfigDeclaration *const parentNode{statementFor(index)->parent()};
-    if (!parentNode || parentNode == m_topNode.get())
-        return {};
-    // As a statement: a pointer to it is what statementFor() takes out of the index.
-    return createIndex(parentNode->row(), 0, static_cast<DhcpdConfigStatement *>(parentNode));
+    const DhcpdConfigDeclaration *parentNode{statementFor(index)->parent()};
+    return parentNode ? indexOf(*parentNode) : QModelIndex{};
 }
 
 int DhcpdConfigModel::rowCount(const QModelIndex &parent) const
@@ -76,10 +73,11 @@ bool DhcpdConfigModel::setData(const QModelIndex &index, const QVariant &value, 
 {
     if (role != Qt::EditRole || index.column() < 1)
         return false;
-    DhcpdConfigStatement *const statement{statementFor(index)};
+    DhcpdConfigStatement *statement{statementFor(index)};
+    const QString text{value.toString()};
     const bool stored{statement->isParam()
-                          ? setParamValue(static_cast<DhcpdConfigParam *>(statement), value)
-                          : setDeclarationValue(static_cast<DhcpdConfigDeclaration *>(statement), value)};
+                          ? setParamValue(static_cast<DhcpdConfigParam *>(statement), text)
+                          : setDeclarationValue(static_cast<DhcpdConfigDeclaration *>(statement), text)};
     if (stored)
         setModified();
     return stored;
@@ -90,6 +88,14 @@ DhcpdConfigStatement *DhcpdConfigModel::statementFor(const QModelIndex &index) c
     if (!index.isValid() || !index.internalPointer())
         return m_topNode.get();
     return static_cast<DhcpdConfigStatement *>(index.internalPointer());
+}
+
+QModelIndex DhcpdConfigModel::indexOf(const DhcpdConfigStatement &statement, int column) const
+{
+    if (&statement == m_topNode.get())
+        return {};
+    // An index holds the statement as one that may be changed, and as a statement, whatever its class.
+    return createIndex(statement.row(), column, const_cast<DhcpdConfigStatement *>(&statement));
 }
 
 bool DhcpdConfigModel::parse(const QString &text) { return parseUtf8(text.toUtf8()); }
@@ -108,12 +114,25 @@ void DhcpdConfigModel::reload(const QString &confFile)
     read(confFile);
 }
 
+void DhcpdConfigModel::reloadFrom(const std::optional<QByteArray> &content, const QString &confFile,
+                                  const QString &reason)
+{
+    removeRows(0, rowCount());
+    append(content, confFile, reason);
+}
+
 void DhcpdConfigModel::read(const QString &confFile)
 {
-    const auto bytes = fileio::readFile(confFile);
-    const auto encoding = bytes ? TextEncoding::detect(*bytes) : m_encoding;
-    if (!bytes || !parseUtf8(encoding.toUtf8(*bytes))) {
-        refuse(tr("Unable to open file '%1' for read").arg(confFile));
+    QString reason;
+    const auto content = fileio::readFile(confFile, &reason);
+    append(content, confFile, reason);
+}
+
+void DhcpdConfigModel::append(const std::optional<QByteArray> &content, const QString &confFile, const QString &reason)
+{
+    const TextEncoding encoding{content ? TextEncoding::detect(*content) : m_encoding};
+    if (!content || !parseUtf8(encoding.toUtf8(*content))) {
+        refuse(tr("Unable to open file '%1' for read").arg(confFile), reason);
         return;
     }
     m_encoding = encoding;
@@ -126,9 +145,16 @@ bool DhcpdConfigModel::write(const QString &confFile)
     // A tree without a top row was never read: nothing of it may replace a file that does hold something. Nor may a
     // text that could not be read again.
     const QByteArray content{fileContent()};
-    if (!content.isNull() && fileio::replaceFile(confFile, content))
+    QString reason;
+    if (!content.isNull() && fileio::replaceFile(confFile, content, &reason))
         return true;
-    return refuse(tr("Unable to open file '%1' for write").arg(confFile));
+    reportUnwritten(confFile, reason);
+    return false;
+}
+
+void DhcpdConfigModel::reportUnwritten(const QString &confFile, const QString &reason)
+{
+    refuse(tr("Unable to open file '%1' for write").arg(confFile), reason);
 }
 
 bool DhcpdConfigModel::parseUtf8(const QByteArray &text)
@@ -140,8 +166,9 @@ bool DhcpdConfigModel::parseUtf8(const QByteArray &text)
     return true;
 }
 
-bool DhcpdConfigModel::refuse(const QString &message)
+bool DhcpdConfigModel::refuse(const QString &message, const QString &reason)
 {
+    m_errorReason = reason;
     emit error(message);
     return false;
 }

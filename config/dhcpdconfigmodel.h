@@ -4,6 +4,7 @@
 #include "common/paths.h"
 #include "common/textencoding.h"
 #include "config/dhcpdconfigdeclaration.h"
+#include "config/parameterkind.h"
 
 #include <QAbstractItemModel>
 #include <QHash>
@@ -12,6 +13,7 @@
 #include <QVariant>
 
 #include <memory>
+#include <optional>
 
 /// The DHCP server's configuration as a tree of statements with a label and a value, its file, and every way to edit
 /// it. What the user must know of a failure or a refusal travels as error().
@@ -37,6 +39,8 @@ public:
 
     /// The statement of `index`; the invisible top node for an invalid one.
     DhcpdConfigStatement *statementFor(const QModelIndex &index) const;
+    /// The index of a statement of the tree in `column`; invalid for the invisible top node.
+    QModelIndex indexOf(const DhcpdConfigStatement &statement, int column = 0) const;
     /// Whether the tree has changed since it was read.
     bool isModified() const { return m_modified; }
 
@@ -44,6 +48,12 @@ public:
     bool parse(const QString &text);
     /// The bytes that write() puts into the file; null when nothing was read, or they could not be read again.
     QByteArray fileContent() const;
+    /// As reload(), of what was read from the file already; nothing where it could not be read, for that `reason`.
+    void reloadFrom(const std::optional<QByteArray> &content, const QString &confFile, const QString &reason);
+    /// Reports as write() does that the file could not be written, for the system's `reason`.
+    void reportUnwritten(const QString &confFile, const QString &reason);
+    /// While an error() is reported: the system's reason for it; empty where there is none.
+    const QString &errorReason() const { return m_errorReason; }
 
     // The operations below add statements at the end of those of their sort under the statement of `parent`. What they
     // refuse, with an error(), changes nothing. A parent too deep to hold blocks is refused like one of the wrong kind.
@@ -64,8 +74,9 @@ public:
     bool addDeclaration(const QStringList &words, const QModelIndex &parent);
     bool addParameter(const QStringList &words, const QModelIndex &parent);
 
-    // These replace the value of the first such parameter that the declaration has.
-
+    /// Gives the declaration a parameter of that kind, or the first one that it has the new value. Each of the
+    /// operations below is this for one kind.
+    bool setParameter(const ParameterKind &kind, const QString &value, const QModelIndex &parent);
     bool addLeaseTime(const QString &keyword, const QString &seconds, const QModelIndex &parent);
     bool addDefaultLeaseTime(const QString &seconds, const QModelIndex &parent);
     bool addMaxLeaseTime(const QString &seconds, const QModelIndex &parent);
@@ -103,6 +114,7 @@ public slots:
 
 private:
     bool parseUtf8(const QByteArray &text);
+    void append(const std::optional<QByteArray> &content, const QString &confFile, const QString &reason);
     void setModified();
     /// Runs `change`, which adds or removes statements, within a reset.
     template<typename Change>
@@ -112,23 +124,21 @@ private:
     QString keywordFor(const QModelIndex &index) const { return statementFor(index)->keyword(); }
     QIcon themeIcon(const QString &name) const;
 
-    bool setParamValue(DhcpdConfigParam *param, const QVariant &value);
-    bool setDeclarationValue(DhcpdConfigDeclaration *declaration, const QVariant &value);
+    /// The message for a value that is not valid.
+    static QString invalidValue(ValueType type, const QString &text);
+    // These check a value and store it; they report a refusal as error() and return false.
+    bool setParamValue(DhcpdConfigParam *param, const QString &text);
+    bool setDeclarationValue(DhcpdConfigDeclaration *declaration, const QString &text);
+    bool setSubnetValue(DhcpdConfigDeclaration *subnet, const QString &text);
+    bool setAddressValue(DhcpdConfigDeclaration *fixedAddress, const QString &text);
+    bool setRangeValue(DhcpdConfigDeclaration *range, const QString &text);
 
-    // These check a value, and those named set… store it; they report a refusal as error() and return false.
-    bool checkOptionValue(const DhcpdConfigParam &option, const QString &text);
-    bool setSubnetValue(DhcpdConfigStatement *statement, const QString &text);
-    bool setIpValue(DhcpdConfigStatement *statement, const QString &text);
-    bool setMacValue(DhcpdConfigStatement *statement, const QString &text);
-    bool setRangeValue(DhcpdConfigStatement *statement, const QString &text);
-
-    struct OptionKind;
-    void addOption(const OptionKind &kind, const QString &value, const QModelIndex &parent);
     /// Emits error() and returns false.
-    bool refuse(const QString &message);
+    bool refuse(const QString &message, const QString &reason = {});
 
     std::unique_ptr<DhcpdConfigDeclaration> m_topNode; // invisible; its words are the header labels
     bool m_modified{};
+    QString m_errorReason;
     TextEncoding m_encoding; // of the file that was read last
     mutable QHash<QString, QIcon> m_icons;
 };

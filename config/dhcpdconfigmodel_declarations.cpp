@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 // The operations of the configuration model that add declarations, and statements of any words.
-#include "config/addresses.h"
 #include "config/bind9reader.h"
 #include "config/dhcpdconfigmodel.h"
-#include "config/patterns.h"
+#include "config/values.h"
 
 #include <algorithm>
 
@@ -13,7 +12,6 @@ constexpr int wordsOfLine{2};
 constexpr int wordsOfBlock{3 * wordsOfLine};
 
 constexpr QLatin1Char blank{' '};
-constexpr QLatin1Char quote{'"'};
 
 // Whether blocks that stand at the top of a file can be added.
 bool takesTopBlocks(const DhcpdConfigDeclaration *declaration)
@@ -26,16 +24,13 @@ bool takesAnything(const DhcpdConfigDeclaration *declaration)
     return declaration && !declaration->isRange() && !declaration->isSubclass();
 }
 
-QStringList fixedAddressWords(const QHostAddress &address)
-{
-    return {QStringLiteral("fixed-address"), address.toString()};
-}
+QStringList fixedAddressWords(const QString &address) { return {QStringLiteral("fixed-address"), address}; }
 
 // The names of keys up to the end of `last`; false when that is reached.
 bool appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaration, const DhcpdConfigStatement &last)
 {
     if (declaration.isKeyDeclaration())
-        names += bind9::unquoted(declaration.word(1));
+        names += values::unquoted(declaration.word(1));
     for (const auto &child : declaration.declarations()) {
         if (!appendKeyNames(names, *child, last))
             return false;
@@ -47,7 +42,7 @@ bool appendKeyNames(QStringList &names, const DhcpdConfigDeclaration &declaratio
 
 void DhcpdConfigModel::addSharedNetwork(const QString &name, const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
+    auto *holder = declarationFor(parent);
     if (!takesTopBlocks(holder))
         refuse(tr("Error adding shared-network. Can not add shared-network to '%1'").arg(keywordFor(parent)));
     else
@@ -56,57 +51,53 @@ void DhcpdConfigModel::addSharedNetwork(const QString &name, const QModelIndex &
 
 void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, const QModelIndex &parent)
 {
-    const QString text{mask.isEmpty() ? address : address + QLatin1Char{'/'} + mask};
-    const auto subnet = addresses::parseSubnet(text);
-    auto *const holder = declarationFor(parent);
+    const QString text{values::subnetText(address, mask)};
+    const auto subnet = values::parseSubnet(text);
+    auto *holder = declarationFor(parent);
     if (!subnet)
         refuse(tr("Error adding subnet. Invalid subnet '%1'").arg(text));
     else if (!takesTopBlocks(holder) && !(holder && holder->isSharedNetwork() && holder->takesBlocks()))
         refuse(tr("Error adding subnet. Can not add subnet to '%1'").arg(keywordFor(parent)));
     else
-        changeTree([&] {
-            holder->addDeclaration({QStringLiteral("subnet"), subnet->ip().toString(), QStringLiteral("netmask"),
-                                    subnet->netmask().toString()});
-        });
+        changeTree(
+            [&] { holder->addDeclaration(QStringList{QStringLiteral("subnet")} + values::subnetWords(*subnet)); });
 }
 
 QStringList DhcpdConfigModel::defaultRange(const QString &subnet)
 {
-    const auto entry = addresses::parseSubnet(subnet);
-    if (!entry)
-        return {QString{}, QString{}};
-    const quint32 base{entry->ip().toIPv4Address()};
-    const quint32 hostBits{~entry->netmask().toIPv4Address()};
-    const quint32 first{base + 1}; // deliberately also where it lies behind the last
-    const quint32 last{base + (hostBits > 1 ? hostBits - 1 : hostBits)};
-    return {QHostAddress{first}.toString(), QHostAddress{last}.toString()};
+    const auto network = values::parseSubnet(subnet);
+    return network ? values::hostRange(*network) : QStringList{QString{}, QString{}};
 }
 
 void DhcpdConfigModel::addRange(const QString &start, const QString &end, const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
-    const bool isSubnet{holder && holder->isSubnet()};
-    const auto subnet = isSubnet ? addresses::subnetOf(*holder) : std::nullopt;
-    const QHostAddress first{start};
-    const QHostAddress last{end};
-    if (holder && holder->wordCount() < 3) // before the kind of the declaration, deliberately
-        refuse(tr("Error adding range. Invalid attributes of parent subnet"));
-    else if (!isSubnet)
+    using values::RangeProblem;
+    auto *holder = declarationFor(parent);
+    if (!holder) {
         refuse(tr("Error adding range. Can not add range to '%1'").arg(keywordFor(parent)));
-    else if (!subnet)
+        return;
+    }
+    const auto words = values::rangeWords(*holder, start, end);
+    const auto *problem = std::get_if<RangeProblem>(&words);
+    if (problem && *problem == RangeProblem::IncompleteSubnet) // before the kind of the declaration, deliberately
+        refuse(tr("Error adding range. Invalid attributes of parent subnet"));
+    else if (!holder->isSubnet())
+        refuse(tr("Error adding range. Can not add range to '%1'").arg(keywordFor(parent)));
+    else if (!problem)
+        changeTree(
+            [&] { holder->addDeclaration(QStringList{QStringLiteral("range")} + std::get<QStringList>(words)); });
+    else if (*problem == RangeProblem::InvalidSubnet)
         refuse(tr("Error adding range. Invalid parent subnet"));
-    else if (!addresses::isUsableIn(*subnet, first))
+    else if (*problem == RangeProblem::InvalidStart)
         refuse(tr("Error adding range. Invalid start IP '%1'").arg(start));
-    else if (!addresses::isUsableIn(*subnet, last) || last.toIPv4Address() < first.toIPv4Address())
-        refuse(tr("Error adding range. Invalid end IP '%1'").arg(end));
     else
-        changeTree([&] { holder->addDeclaration({QStringLiteral("range"), first.toString(), last.toString()}); });
+        refuse(tr("Error adding range. Invalid end IP '%1'").arg(end));
 }
 
 void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QString &address,
                                const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
+    auto *holder = declarationFor(parent);
     if (!takesTopBlocks(holder)) {
         refuse(tr("Error adding host. Can not add host to '%1'").arg(keywordFor(parent)));
         return;
@@ -115,28 +106,28 @@ void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QS
         refuse(tr("Error adding host. Host name can not be empty."));
         return;
     }
-    const bool isOneWord{!name.contains(blank)};
-    const bool isMac{macRegExp().match(mac).hasMatch()};
-    const QHostAddress fixedAddress{address};
+    const bool isMac{values::isValid(ValueType::MacAddress, mac)};
+    const auto fixedAddress = values::usableAddress(address);
     changeTree([&] {
-        auto *const host = holder->addDeclaration({QStringLiteral("host"), isOneWord ? name : quote + name + quote});
+        auto *host =
+            holder->addDeclaration({QStringLiteral("host"), name.contains(blank) ? values::quoted(name) : name});
         if (!mac.isEmpty())
-            host->addParam({QStringLiteral("hardware"), QStringLiteral("ethernet"),
-                            isMac ? mac : QStringLiteral("00:00:00:00:00:00")});
-        if (addresses::isUsable(fixedAddress))
-            host->addDeclaration(fixedAddressWords(fixedAddress));
+            host->addParam(
+                {QStringLiteral("hardware"), QStringLiteral("ethernet"), isMac ? mac : values::noMacAddress()});
+        if (fixedAddress)
+            host->addDeclaration(fixedAddressWords(*fixedAddress));
     });
 }
 
 void DhcpdConfigModel::addFixedAddress(const QString &address, const QModelIndex &parent)
 {
-    auto *const host = declarationFor(parent);
-    const QHostAddress fixedAddress{address};
+    auto *host = declarationFor(parent);
+    const auto fixedAddress = values::usableAddress(address);
     if (!host || !host->isHost()) {
         refuse(tr("Error adding fixed address. Can not add to '%1'").arg(keywordFor(parent)));
         return;
     }
-    if (!addresses::isUsable(fixedAddress)) {
+    if (!fixedAddress) {
         refuse(tr("Error adding fixed address. Invalid IP '%1'").arg(address));
         return;
     }
@@ -144,16 +135,16 @@ void DhcpdConfigModel::addFixedAddress(const QString &address, const QModelIndex
     const auto old =
         std::find_if(children.begin(), children.end(), [](const auto &child) { return child->isFixedAddress(); });
     if (old == children.end()) {
-        changeTree([&] { host->addDeclaration(fixedAddressWords(fixedAddress)); });
+        changeTree([&] { host->addDeclaration(fixedAddressWords(*fixedAddress)); });
     } else {
-        (*old)->setWordsFrom(1, {fixedAddress.toString()});
+        (*old)->setWordsFrom(1, {*fixedAddress});
         setModified();
     }
 }
 
 bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
+    auto *holder = declarationFor(parent);
     if (!takesTopBlocks(holder))
         return refuse(tr("Error adding bind9. Can not add bind9 to '%1'").arg(keywordFor(parent)));
     if (statements.isEmpty())
@@ -173,7 +164,7 @@ bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex
 
 bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
+    auto *holder = declarationFor(parent);
     if (!takesAnything(holder) || !holder->takesBlocks())
         return refuse(tr("Error adding declaration. Can not add declaration to '%1'").arg(keywordFor(parent)));
     changeTree([&] { holder->addDeclaration(words); });
@@ -182,7 +173,7 @@ bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelInde
 
 bool DhcpdConfigModel::addParameter(const QStringList &words, const QModelIndex &parent)
 {
-    auto *const holder = declarationFor(parent);
+    auto *holder = declarationFor(parent);
     if (!takesAnything(holder))
         return refuse(tr("Error adding parameter. Can not add parameter to '%1'").arg(keywordFor(parent)));
     changeTree([&] { holder->addParam(words); });

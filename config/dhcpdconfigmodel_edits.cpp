@@ -4,7 +4,7 @@
 
 bool DhcpdConfigModel::removeRows(int row, int count, const QModelIndex &parent)
 {
-    DhcpdConfigDeclaration *const declaration{declarationFor(parent)};
+    DhcpdConfigDeclaration *declaration{declarationFor(parent)};
     if (!declaration || row < 0 || count < 0 || count > declaration->childCount() - row)
         return false;
     if (count > 0) {
@@ -18,8 +18,8 @@ bool DhcpdConfigModel::removeRows(int row, int count, const QModelIndex &parent)
 
 void DhcpdConfigModel::removeStatement(const QModelIndex &index)
 {
-    DhcpdConfigStatement *const statement{statementFor(index)};
-    DhcpdConfigDeclaration *const parentNode{statement->parent()};
+    DhcpdConfigStatement *statement{statementFor(index)};
+    DhcpdConfigDeclaration *parentNode{statement->parent()};
     if (!parentNode)
         return;
     changeTree([=] { parentNode->removeChild(statement); });
@@ -27,13 +27,10 @@ void DhcpdConfigModel::removeStatement(const QModelIndex &index)
 
 bool DhcpdConfigModel::replaceWords(const QModelIndex &index, const QStringList &words)
 {
-    DhcpdConfigStatement *const statement{statementFor(index)};
+    DhcpdConfigStatement *statement{statementFor(index)};
     if (statement->isRoot())
         return false;
-    QStringList oldWords;
-    for (const std::string_view word : statement->words())
-        oldWords += decodedWord(word);
-    if (words != oldWords) {
+    if (words != statement->wordsFrom(0)) {
         statement->setWordsFrom(0, words);
         setModified();
     }
@@ -42,6 +39,6 @@ bool DhcpdConfigModel::replaceWords(const QModelIndex &index, const QStringList 
 
 DhcpdConfigDeclaration *DhcpdConfigModel::declarationFor(const QModelIndex &index) const
 {
-    DhcpdConfigStatement *const statement{statementFor(index)};
+    DhcpdConfigStatement *statement{statementFor(index)};
     return statement->isDeclaration() ? static_cast<DhcpdConfigDeclaration *>(statement) : nullptr;
 }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/dhcpdconfigparam.h"
 
+#include "config/parameterkind.h"
+
 #include <utility>
 
 namespace {
@@ -51,29 +53,12 @@ int DhcpdConfigParam::row() const { return parent() ? indexInList() : 0; }
 
 QString DhcpdConfigParam::label() const
 {
-    static constexpr KindLabel options[]{
-        {&DhcpdConfigStatement::isRouters, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Gateways")},
-        {&DhcpdConfigStatement::isDnsServers, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "DNS servers")},
-        {&DhcpdConfigStatement::isDomainName, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Domain name")},
-        {&DhcpdConfigStatement::isNtpServers, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "NTP servers")},
-        {&DhcpdConfigStatement::isMsStaticRoute, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Static route MS")},
-        {&DhcpdConfigStatement::isStaticRoute, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Static route")},
-    };
-    static constexpr KindLabel parameters[]{
-        {&DhcpdConfigStatement::isMacAddress, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "MAC address")},
-        {&DhcpdConfigStatement::isMaxLeaseTime, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Max lease time")},
-        {&DhcpdConfigStatement::isDefaultLeaseTime, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Default lease time")},
-        {&DhcpdConfigStatement::isKey, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key")},
-        {&DhcpdConfigStatement::isAlgorithm, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key generation algorithm")},
-        {&DhcpdConfigStatement::isSecret, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Generated secret")},
-        {&DhcpdConfigStatement::isPrimary, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Master DNS Server")},
-    };
-    return isOption() ? labelAmong(options, 1) : labelAmong(parameters, 0);
+    const ParameterKind &kind{ParameterKind::of(*this)};
+    return kind.label ? tr(kind.label) : word(kind.valuePosition() - 1);
 }
 
 QString DhcpdConfigParam::valueText() const
 {
-    if (isLeaseTime())
-        return timeText(word(1).toLongLong());
-    return joinedWordsFrom(isOption() || isMacAddress() ? 2 : 1);
+    const ParameterKind &kind{ParameterKind::of(*this)};
+    return kind.type == ValueType::Seconds ? timeText(word(1).toLongLong()) : joinedWordsFrom(kind.valuePosition());
 }

@@ -61,6 +61,17 @@ QString DhcpdConfigStatement::text(int column) const
     }
 }
 
+QStringList DhcpdConfigStatement::wordsFrom(int position) const
+{
+    QStringList words;
+    int index{};
+    for (const std::string_view word : m_words) {
+        if (index++ >= position)
+            words += decodedWord(word);
+    }
+    return words;
+}
+
 bool DhcpdConfigStatement::setWordsFrom(int position, const QStringList &words)
 {
     const int count{wordCount()};

@@ -47,6 +47,10 @@ public:
     QString keyword() const { return word(0); }
     int wordCount() const { return m_words.count(); }
     const WordList &words() const { return m_words; }
+    /// The words from `position` on.
+    QStringList wordsFrom(int position) const;
+    /// The words from `position` on as one text, without blanks at its ends: a value may be several words.
+    QString textFrom(int position) const { return wordsFrom(position).join(QLatin1Char{' '}).trimmed(); }
     /// All words joined by single spaces.
     QString joinedWords() const { return joinedWordsFrom(0); }
     /// Puts `words` in the place of all words from `position` on; false when there are fewer than `position`.
@@ -95,16 +99,6 @@ protected:
     /// Does not put the statement among the parent's children: addParam() and addDeclaration() do.
     DhcpdConfigStatement(WordList words, DhcpdConfigDeclaration *parent);
 
-    /// The label of a kind of statement.
-    struct KindLabel
-    {
-        bool (DhcpdConfigStatement::*isKind)() const;
-        const char *label; // to be translated
-    };
-    /// The label of the first kind in `kinds` that the statement is of; else the word at `fallback`.
-    template<std::size_t size>
-    QString labelAmong(const KindLabel (&kinds)[size], int fallback) const;
-
     /// The words from `position` on, or the last one when they are fewer, joined by single spaces.
     QString joinedWordsFrom(int position) const;
     /// The statement's place in the parent's list that holds it; -1 while it is in none.
@@ -120,13 +114,3 @@ private:
     int m_indexInList{-1};
     qint16 m_depth{}; // small, and last: a declaration's flag fits in behind it
 };
-
-template<std::size_t size>
-QString DhcpdConfigStatement::labelAmong(const KindLabel (&kinds)[size], int fallback) const
-{
-    for (const KindLabel &kind : kinds) {
-        if ((this->*kind.isKind)())
-            return tr(kind.label);
-    }
-    return word(fallback);
-}

@@ -1,15 +1,10 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/domaininputdialog.h"
 
+#include "config/values.h"
 #include "dialogs/fields.h"
 #include "dialogs/patterns.h"
 #include "ui_domaininputdialog.h"
-
-namespace {
-
-constexpr QLatin1Char quote{'"'};
-
-} // namespace
 
 DomainInputDialog::DomainInputDialog(QWidget *parent)
     : QDialog{parent}
@@ -22,9 +17,11 @@ DomainInputDialog::DomainInputDialog(QWidget *parent)
 
 DomainInputDialog::~DomainInputDialog() = default;
 
-void DomainInputDialog::setDomain(const QString &text) { m_ui->domainName->setText(QString{text}.remove(quote)); }
+void DomainInputDialog::setLabel(const QString &text) { m_ui->domainLabel->setText(text); }
 
-QString DomainInputDialog::domain() const { return quote + m_ui->domainName->text() + quote; }
+void DomainInputDialog::setDomain(const QString &text) { m_ui->domainName->setText(values::unquoted(text)); }
+
+QString DomainInputDialog::domain() const { return values::quoted(m_ui->domainName->text()); }
 
 void DomainInputDialog::accept()
 {

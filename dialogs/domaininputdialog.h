@@ -20,6 +20,8 @@ public:
     ~DomainInputDialog() override;
     Q_DISABLE_COPY_MOVE(DomainInputDialog)
 
+    /// What the field is called, where it is another name than that of a domain.
+    void setLabel(const QString &text);
     void setDomain(const QString &text);
     QString domain() const;
 

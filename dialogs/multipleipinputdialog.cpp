@@ -1,10 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/multipleipinputdialog.h"
 
+#include "config/values.h"
 #include "dialogs/ipinputdialog.h"
 #include "ui_multipleipinputdialog.h"
-
-#include <QHostAddress>
 
 MultipleIpInputDialog::MultipleIpInputDialog(QWidget *parent)
     : QDialog{parent}
@@ -47,9 +46,8 @@ void MultipleIpInputDialog::accept()
 
 void MultipleIpInputDialog::appendIp(const QString &text)
 {
-    const QHostAddress address{text};
-    if (!address.isNull() && !address.isLoopback() && !address.isBroadcast())
-        m_ui->ipList->addItem(address.toString());
+    if (const auto address = values::usableAddress(text))
+        m_ui->ipList->addItem(*address);
 }
 
 void MultipleIpInputDialog::handleAddIp()

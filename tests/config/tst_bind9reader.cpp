@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/bind9reader.h"
+#include "config/values.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QDir>
@@ -390,9 +391,9 @@ void TestBind9Reader::survivesAnyText()
             for (int i{}; i < result.size(); i += 6, ++groups) {
                 const QString &keyword{result.at(i)};
                 if (keyword == QLatin1String{"key"})
-                    keys += bind9::unquoted(result.at(i + 1)).toLower();
+                    keys += values::unquoted(result.at(i + 1)).toLower();
                 else if (keyword == QLatin1String{"zone"})
-                    QVERIFY(keys.contains(bind9::unquoted(result.at(i + 5)).toLower()));
+                    QVERIFY(keys.contains(values::unquoted(result.at(i + 5)).toLower()));
                 else
                     QFAIL(qPrintable(keyword));
             }

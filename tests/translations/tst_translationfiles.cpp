@@ -93,8 +93,8 @@ void TranslationFilesTest::germanHasTheTextsOfTheProgram()
     const QString fresh{folder.filePath(QStringLiteral("fresh.ts"))};
     QProcess lupdate;
     lupdate.setWorkingDirectory(QStringLiteral(SOURCE_FOLDER));
-    lupdate.start(QStringLiteral(LUPDATE), {QStringLiteral("-silent"), QStringLiteral("@translations/folders.lst"),
-                                            QStringLiteral("-ts"), fresh});
+    lupdate.start(QStringLiteral(LUPDATE), {QStringLiteral("-silent"), QStringLiteral("-I"), QStringLiteral("."),
+                                            QStringLiteral("@translations/folders.lst"), QStringLiteral("-ts"), fresh});
     QVERIFY2(lupdate.waitForFinished(-1), qPrintable(lupdate.errorString()));
     QCOMPARE(lupdate.exitCode(), 0);
 

@@ -12,14 +12,14 @@ class QTreeView;
 /// opens all of a large tree at once.
 ///
 /// A node is known again by its index's internal pointer, which therefore must stay the same over the reset.
-class TreeExpansion final : public QObject
+class TreeViewState final : public QObject
 {
     Q_OBJECT
-    Q_DISABLE_COPY_MOVE(TreeExpansion)
+    Q_DISABLE_COPY_MOVE(TreeViewState)
 
 public:
     /// Serves `tree` with the model that it has now, for as long as the tree lives.
-    explicit TreeExpansion(QTreeView *tree);
+    explicit TreeViewState(QTreeView *tree);
 
     /// Opens every branch. QTreeView::expandAll() also marks every leaf as open, each in a persistent index, which
     /// takes four times the memory and makes the next reset several times as slow.

@@ -1,19 +1,19 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "app/treeexpansion.h"
+#include "app/treeviewstate.h"
 
 #include <QScrollBar>
 #include <QTreeView>
 
-TreeExpansion::TreeExpansion(QTreeView *tree)
+TreeViewState::TreeViewState(QTreeView *tree)
     : QObject{tree}
     , m_tree{tree}
 {
     // Connected after the view itself, so that the view has forgotten its branches by the time they are opened again.
-    connect(tree->model(), &QAbstractItemModel::modelAboutToBeReset, this, &TreeExpansion::remember);
-    connect(tree->model(), &QAbstractItemModel::modelReset, this, &TreeExpansion::restore);
+    connect(tree->model(), &QAbstractItemModel::modelAboutToBeReset, this, &TreeViewState::remember);
+    connect(tree->model(), &QAbstractItemModel::modelReset, this, &TreeViewState::restore);
 }
 
-void TreeExpansion::expandAll()
+void TreeViewState::expandAll()
 {
     // Setting a root, even the same, puts the layout off, and while it is put off expand() only takes note.
     m_tree->setRootIndex(m_tree->rootIndex());
@@ -21,7 +21,7 @@ void TreeExpansion::expandAll()
     m_tree->doItemsLayout();
 }
 
-void TreeExpansion::remember()
+void TreeViewState::remember()
 {
     m_open.clear();
     m_scroll = m_tree->verticalScrollBar()->value();
@@ -31,7 +31,7 @@ void TreeExpansion::remember()
     });
 }
 
-void TreeExpansion::restore()
+void TreeViewState::restore()
 {
     // The view's own reset has put the layout off.
     forEachBranch({}, [this](const QModelIndex &index) {
@@ -43,12 +43,12 @@ void TreeExpansion::restore()
 }
 
 template<typename Visit>
-void TreeExpansion::forEachBranch(const QModelIndex &parent, const Visit &visit) const
+void TreeViewState::forEachBranch(const QModelIndex &parent, const Visit &visit) const
 {
-    const QAbstractItemModel *model = m_tree->model();
-    const int rows = model->rowCount(parent);
-    for (int row = 0; row < rows; ++row) {
-        const QModelIndex index = model->index(row, 0, parent);
+    const QAbstractItemModel *model{m_tree->model()};
+    const int rows{model->rowCount(parent)};
+    for (int row{0}; row < rows; ++row) {
+        const QModelIndex index{model->index(row, 0, parent)};
         if (!model->hasChildren(index))
             continue;
         visit(index);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "app/treeexpansion.h"
+#include "app/treeviewstate.h"
 
 #include <QScrollBar>
 #include <QTest>
@@ -78,7 +78,7 @@ private:
 
 } // namespace
 
-class TestTreeExpansion final : public QObject
+class TreeViewStateTest final : public QObject
 {
     Q_OBJECT
 
@@ -100,11 +100,11 @@ private:
     // Destroyed from the bottom up.
     std::unique_ptr<NodeModel> m_model;
     std::unique_ptr<QTreeView> m_tree;
-    TreeExpansion *m_expansion{};
+    TreeViewState *m_expansion{};
 };
 
 // a { b { c d } e { } f }, g { h }, and many leaves
-void TestTreeExpansion::init()
+void TreeViewStateTest::init()
 {
     m_tree.reset();
     m_model = std::make_unique<NodeModel>();
@@ -119,12 +119,12 @@ void TestTreeExpansion::init()
 
     m_tree = std::make_unique<QTreeView>();
     m_tree->setModel(m_model.get());
-    m_expansion = new TreeExpansion{m_tree.get()};
+    m_expansion = new TreeViewState{m_tree.get()};
     m_tree->show();
     QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
 }
 
-QModelIndex TestTreeExpansion::find(const QString &name, const QModelIndex &parent) const
+QModelIndex TreeViewStateTest::find(const QString &name, const QModelIndex &parent) const
 {
     for (int row = 0; row < m_model->rowCount(parent); ++row) {
         const QModelIndex index = m_model->index(row, 0, parent);
@@ -136,7 +136,7 @@ QModelIndex TestTreeExpansion::find(const QString &name, const QModelIndex &pare
     return {};
 }
 
-QStringList TestTreeExpansion::open() const
+QStringList TreeViewStateTest::open() const
 {
     QStringList names;
     for (const char *name : {"a", "b", "c", "d", "e", "g", "h", "i", "new", "7"}) {
@@ -146,7 +146,7 @@ QStringList TestTreeExpansion::open() const
     return names;
 }
 
-void TestTreeExpansion::everyBranchOpens()
+void TreeViewStateTest::everyBranchOpens()
 {
     m_expansion->expandAll();
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
@@ -154,13 +154,13 @@ void TestTreeExpansion::everyBranchOpens()
     QCOMPARE(m_tree->indexBelow(find(text("i"))), find(text("e")));
 }
 
-void TestTreeExpansion::noLeafIsMarkedAsOpen()
+void TreeViewStateTest::noLeafIsMarkedAsOpen()
 {
     m_expansion->expandAll();
     QCOMPARE(open(), text("a b d g").split(QLatin1Char{' '}));
 }
 
-void TestTreeExpansion::everyBranchOpensAgain()
+void TreeViewStateTest::everyBranchOpensAgain()
 {
     m_expansion->expandAll();
     m_tree->collapse(find(text("b")));
@@ -170,7 +170,7 @@ void TestTreeExpansion::everyBranchOpensAgain()
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
 }
 
-void TestTreeExpansion::openBranchesStayOverAReset()
+void TreeViewStateTest::openBranchesStayOverAReset()
 {
     m_tree->expand(find(text("a")));
     m_tree->expand(find(text("b")));
@@ -189,7 +189,7 @@ void TestTreeExpansion::openBranchesStayOverAReset()
     QCOMPARE(open(), text("a b").split(QLatin1Char{' '}));
 }
 
-void TestTreeExpansion::openBranchWithinAClosedOneStays()
+void TreeViewStateTest::openBranchWithinAClosedOneStays()
 {
     m_expansion->expandAll();
     m_tree->collapse(find(text("a")));
@@ -199,7 +199,7 @@ void TestTreeExpansion::openBranchWithinAClosedOneStays()
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
 }
 
-void TestTreeExpansion::scrollPositionStaysOverAReset()
+void TreeViewStateTest::scrollPositionStaysOverAReset()
 {
     m_expansion->expandAll();
     QScrollBar *bar = m_tree->verticalScrollBar();
@@ -213,14 +213,14 @@ void TestTreeExpansion::scrollPositionStaysOverAReset()
 }
 
 // Which row is current after a reset is for the command to say.
-void TestTreeExpansion::currentRowIsNotKept()
+void TreeViewStateTest::currentRowIsNotKept()
 {
     m_tree->setCurrentIndex(find(text("g")));
     m_model->reset([] {});
     QVERIFY(!m_tree->currentIndex().isValid());
 }
 
-void TestTreeExpansion::emptyModelIsNothing()
+void TreeViewStateTest::emptyModelIsNothing()
 {
     m_expansion->expandAll();
     m_model->reset([this] { m_model->top().children.clear(); });
@@ -230,5 +230,5 @@ void TestTreeExpansion::emptyModelIsNothing()
     QCOMPARE(open(), QStringList{});
 }
 
-QTEST_MAIN(TestTreeExpansion)
-#include "tst_treeexpansion.moc"
+QTEST_MAIN(TreeViewStateTest)
+#include "tst_treeviewstate.moc"

@@ -1,0 +1,275 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "app/declarationcommands.h"
+
+#include "app/reservation.h"
+#include "app/statementcommands.h"
+#include "common/paths.h"
+#include "config/bind9reader.h"
+#include "config/dhcpdconfigdeclaration.h"
+#include "config/dhcpdconfigmodel.h"
+#include "config/values.h"
+#include "dialogs/hostinputdialog.h"
+#include "dialogs/ipinputdialog.h"
+#include "dialogs/rangeinputdialog.h"
+#include "dialogs/sharednetworkinputdialog.h"
+#include "dialogs/staticrouteinputdialog.h"
+#include "dialogs/subnetinputdialog.h"
+
+#include <QFileDialog>
+#include <QFileInfo>
+#include <QMessageBox>
+
+namespace {
+
+using Statement = DhcpdConfigStatement;
+
+template<bool (Statement::*isKind)() const>
+bool declarationOf(const Statement &statement)
+{
+    return statement.isDeclaration() && (statement.*isKind)();
+}
+
+bool isHardware(const Statement &statement) { return statement.isParam() && statement.isMacAddress(); }
+
+bool isRoute(const Statement &statement)
+{
+    return statement.isParam() && ParameterKind::of(statement).type == ValueType::Routes;
+}
+
+/// The first child of `declaration` that is of a kind; null when there is none.
+const Statement *firstChild(const Statement &declaration, bool (*isKind)(const Statement &))
+{
+    for (int row{0}; row < declaration.childCount(); ++row) {
+        if (const Statement * child{declaration.child(row)}; isKind(*child))
+            return child;
+    }
+    return nullptr;
+}
+
+/// The position of the word that holds the first address of `range`.
+int firstAddressOf(const Statement &range) { return values::rangeFlag(range).isEmpty() ? 1 : 2; }
+
+} // namespace
+
+void DeclarationCommands::addArbitrary()
+{
+    m_commands.addAsText(tr("Add arbitrary declaration"), tr("Declaration:"), &DhcpdConfigModel::addDeclaration);
+}
+
+void DeclarationCommands::editArbitrary()
+{
+    m_commands.editAsText(tr("Edit arbitrary declaration"), tr("Declaration:"),
+                          declarationOf<&Statement::isDeclaration>);
+}
+
+void DeclarationCommands::addSharedNetwork()
+{
+    SharedNetworkInputDialog dialog{m_commands.window()};
+    m_commands.add(tr("Add shared network"), dialog,
+                   [&](const QModelIndex &parent) { m_commands.model().addSharedNetwork(dialog.name(), parent); });
+}
+
+void DeclarationCommands::editSharedNetwork()
+{
+    SharedNetworkInputDialog dialog{m_commands.window()};
+    m_commands.editValue(
+        tr("Edit shared network"), dialog, declarationOf<&Statement::isSharedNetwork>,
+        [&dialog](const Statement &network) { dialog.setName(network.textFrom(1)); },
+        [&dialog] { return values::quotedIfSpaced(dialog.name()); });
+}
+
+void DeclarationCommands::addSubnet()
+{
+    SubnetInputDialog dialog{m_commands.window()};
+    dialog.setAddress(QStringLiteral("192.168.1.0/24"));
+    m_commands.add(tr("Add subnet"), dialog, [&](const QModelIndex &parent) {
+        m_commands.model().addSubnet(dialog.address(), dialog.netmask(), parent);
+    });
+}
+
+void DeclarationCommands::editSubnet()
+{
+    SubnetInputDialog dialog{m_commands.window()};
+    m_commands.editValue(
+        tr("Edit subnet"), dialog, declarationOf<&Statement::isSubnet>,
+        [&dialog](const Statement &subnet) {
+            dialog.setAddress(subnet.word(1));
+            dialog.setNetmask(subnet.word(3));
+        },
+        [&dialog] { return values::subnetText(dialog.address(), dialog.netmask()); });
+}
+
+void DeclarationCommands::addRange()
+{
+    const Statement &subnet{m_commands.currentStatement()};
+    const QStringList range{DhcpdConfigModel::defaultRange(subnet.word(1) + QLatin1Char{'/'} + subnet.word(3))};
+    RangeInputDialog dialog{m_commands.window()};
+    dialog.setStartIp(range.value(0));
+    dialog.setEndIp(range.value(1));
+    m_commands.add(tr("Add range"), dialog, [&](const QModelIndex &parent) {
+        m_commands.model().addRange(dialog.startIp(), dialog.endIp(), parent);
+    });
+}
+
+void DeclarationCommands::editRange()
+{
+    RangeInputDialog dialog{m_commands.window()};
+    const auto fill = [&dialog](const Statement &range) {
+        dialog.setStartIp(range.word(firstAddressOf(range)));
+        dialog.setEndIp(range.word(firstAddressOf(range) + 1));
+    };
+    const auto store = [&model = m_commands.model()](const QModelIndex &index, const QStringList &addresses,
+                                                     const QStringList & /*shown*/) {
+        const Statement &range{*model.statementFor(index)};
+        const QString flag{values::rangeFlag(range)};
+        if (!model.setData(index, addresses.join(QLatin1Char{' '}), Qt::EditRole) || flag.isEmpty())
+            return;
+        // The dialog has no field for the flag and the model keeps only the addresses, so it is put back.
+        QStringList words{range.wordsFrom(0)};
+        words.insert(1, flag);
+        model.replaceWords(index, words);
+    };
+    m_commands.edit(tr("Edit range"), dialog, declarationOf<&Statement::isRange>,
+                    {fill,
+                     [&dialog] {
+                         return QStringList{dialog.startIp(), dialog.endIp()};
+                     }},
+                    store);
+}
+
+void DeclarationCommands::addHost()
+{
+    HostInputDialog dialog{m_commands.window()};
+    dialog.setMac(values::noMacAddress());
+    dialog.adjustSize();
+    m_commands.add(tr("Add host"), dialog, [&](const QModelIndex &parent) {
+        m_commands.model().addHost(dialog.name(), dialog.mac(), dialog.ip(), parent);
+    });
+}
+
+void DeclarationCommands::editHost()
+{
+    enum Field
+    {
+        Name,
+        Mac,
+        Address
+    };
+    const auto isFixedAddress = declarationOf<&Statement::isFixedAddress>;
+
+    HostInputDialog dialog{m_commands.window()};
+    const auto fill = [&](const Statement &host) {
+        const Statement *hardware{firstChild(host, isHardware)};
+        const Statement *fixedAddress{firstChild(host, isFixedAddress)};
+        dialog.setName(host.textFrom(1));
+        dialog.setMac(hardware ? hardware->word(2) : values::noMacAddress());
+        dialog.setIp(fixedAddress ? fixedAddress->textFrom(1) : QString{});
+    };
+    const auto fields = [&dialog] {
+        return QStringList{values::quotedIfSpaced(dialog.name()), dialog.mac(), dialog.ip()};
+    };
+    const auto store = [&](const QModelIndex &index, const QStringList &now, const QStringList &shown) {
+        DhcpdConfigModel &model{m_commands.model()};
+        const Statement &host{*model.statementFor(index)};
+        const auto setValue = [&model](const Statement &statement, const QString &text) {
+            model.setData(model.indexOf(statement, 1), text, Qt::EditRole);
+        };
+        if (now.at(Name) != shown.at(Name))
+            setValue(host, now.at(Name));
+        if (const Statement * hardware{firstChild(host, isHardware)}; hardware && now.at(Mac) != shown.at(Mac))
+            setValue(*hardware, now.at(Mac));
+        if (now.at(Address) == shown.at(Address))
+            return;
+        const QModelIndex hostIndex{index.siblingAtColumn(0)};
+        if (const Statement * fixedAddress{firstChild(host, isFixedAddress)})
+            setValue(*fixedAddress, now.at(Address));
+        else
+            m_commands.addTo(hostIndex, [&] { model.addFixedAddress(now.at(Address), hostIndex); });
+    };
+    m_commands.edit(tr("Edit host"), dialog, declarationOf<&Statement::isHost>, {fill, fields}, store);
+}
+
+bool DeclarationCommands::reserve(const Reservation &lease)
+{
+    // Without a configuration there is nothing that the host could be added to.
+    DhcpdConfigModel &model{m_commands.model()};
+    const QModelIndex network{model.index(0, 0)};
+    if (!network.isValid())
+        return false;
+    HostInputDialog dialog{m_commands.window()};
+    dialog.setWindowTitle(tr("Reserve an IP address"));
+    dialog.setIp(lease.address);
+    dialog.setMac(lease.mac);
+    dialog.setName(values::withoutSyntax(lease.hostName));
+    dialog.adjustSize();
+    if (dialog.exec() != QDialog::Accepted)
+        return false;
+
+    m_commands.addTo(
+        network, [&] { model.addHost(dialog.name(), dialog.mac(), dialog.ip(), network); },
+        StatementCommands::OpenBranches::All);
+    return QMessageBox::information(m_commands.window(), tr("Information"),
+                                    tr("The IP address is reserved.\nGo to topology?"),
+                                    QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
+}
+
+void DeclarationCommands::addFixedAddress()
+{
+    IpInputDialog dialog{m_commands.window()};
+    m_commands.add(tr("Add fixed address"), dialog,
+                   [&](const QModelIndex &parent) { m_commands.model().addFixedAddress(dialog.ip(), parent); });
+}
+
+void DeclarationCommands::editFixedAddress()
+{
+    IpInputDialog dialog{m_commands.window()};
+    m_commands.editValue(
+        tr("Edit fixed address"), dialog, declarationOf<&Statement::isFixedAddress>,
+        [&dialog](const Statement &fixedAddress) { dialog.setIp(fixedAddress.textFrom(1)); },
+        [&dialog] { return dialog.ip(); });
+}
+
+void DeclarationCommands::addStaticRoute()
+{
+    StaticRouteInputDialog dialog{m_commands.window()};
+    m_commands.add(tr("Add static route"), dialog, [&](const QModelIndex &parent) {
+        m_commands.model().addStaticRoutes(dialog.routes(), dialog.isMsRoute(), parent);
+    });
+}
+
+void DeclarationCommands::editStaticRoute()
+{
+    if (values::isDefinition(m_commands.currentStatement())) {
+        m_commands.editAsText(tr("Edit static route"), tr("Parameter:"), isRoute);
+        return;
+    }
+    StaticRouteInputDialog dialog{m_commands.window()};
+    m_commands.editValue(
+        tr("Edit static route"), dialog, isRoute,
+        [&dialog](const Statement &option) {
+            dialog.setRoutes(option.textFrom(2), option.isMsStaticRoute());
+            dialog.lockMsRoute();
+        },
+        [&dialog] { return values::routeList(dialog.routes()); });
+}
+
+void DeclarationCommands::addBind9Settings()
+{
+    const QModelIndex parent{m_commands.currentDeclaration()};
+    if (!parent.isValid())
+        return;
+    QWidget *window{m_commands.window()};
+    const auto answer = QMessageBox::information(
+        window, tr("Information"), tr("Add configuration to automatically configure binding with bind9 DNS server?"),
+        QMessageBox::Yes | QMessageBox::No, QMessageBox::Yes);
+    if (answer != QMessageBox::Yes)
+        return;
+    const QString file{QFileDialog::getOpenFileName(window, tr("Choose the bind9 configuration with the update key"),
+                                                    QFileInfo{paths::bind9LocalConfiguration()}.absolutePath())};
+    if (file.isEmpty())
+        return;
+    DhcpdConfigModel &model{m_commands.model()};
+    m_commands.addTo(
+        parent, [&] { model.addBind9(bind9::prepared(file, model.keyNames(parent)), parent); },
+        StatementCommands::OpenBranches::All);
+}

@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "server/dhcpservermanager.h"
+
+#include <QObject>
+
+#include <memory>
+
+class QLabel;
+
+namespace Ui {
+class FMain;
+}
+
+/// The DHCP server as a service in the window: its state in the status bar, the actions on it, and the choice of the
+/// interfaces that it serves.
+class ServiceControls final : public QObject
+{
+    Q_OBJECT
+    Q_DISABLE_COPY_MOVE(ServiceControls)
+
+public:
+    /// Asks nothing about the service yet; `window` is the parent of dialogs.
+    ServiceControls(const Ui::FMain &ui, QWidget *window);
+    ~ServiceControls() override;
+
+    DhcpServerManager &manager() { return *m_manager; }
+    void startOrStop();
+    void showState(DhcpServerManager::ServerStates state);
+    void chooseInterfaces();
+
+private:
+    const Ui::FMain &m_ui;
+    QWidget *m_window;
+    QLabel *m_stateLabel; // the status bar's
+    std::unique_ptr<DhcpServerManager> m_manager;
+};
