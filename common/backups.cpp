@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/backups.h"
 
-#include "common/filedescriptor.h"
 #include "common/paths.h"
+#include "common/posix.h"
 #include "common/temporaryfile.h"
 
 #include <QCryptographicHash>
@@ -85,7 +85,7 @@ public:
         , m_name{name}
         , m_prefix{name + mark}
     {
-        const auto entries = posix::entries(folder);
+        const QVector<QByteArray> entries{posix::entries(folder)};
         for (const QByteArray &entry : entries) {
             if (entry.size() == m_prefix.size() + stampLength && entry.startsWith(m_prefix))
                 m_versions.append(entry);

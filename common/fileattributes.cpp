@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/fileattributes.h"
 
-#include "common/filedescriptor.h"
+#include "common/posix.h"
 
 #include <QMap>
 

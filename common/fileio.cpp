@@ -3,7 +3,7 @@
 
 #include "common/backups.h"
 #include "common/fileattributes.h"
-#include "common/filedescriptor.h"
+#include "common/posix.h"
 #include "common/temporaryfile.h"
 #include "common/textencoding.h"
 

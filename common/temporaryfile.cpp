@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/temporaryfile.h"
 
+#include "common/posix.h"
+
 #include <QRandomGenerator>
 
 #include <algorithm>
@@ -92,7 +94,7 @@ std::error_code TemporaryFile::renameTo(const QByteArray &name)
 void TemporaryFile::removeLeftOvers(int directory, const QByteArray &name, uid_t owner)
 {
     const QByteArray prefix{prefixFor(name)};
-    const auto entries = posix::entries(directory);
+    const QVector<QByteArray> entries{posix::entries(directory)};
     for (const QByteArray &entry : entries) {
         if (entry.size() != prefix.size() + suffixLength || !entry.startsWith(prefix))
             continue;

@@ -3,6 +3,10 @@
 
 #include "common/filedescriptor.h"
 
+#include <QByteArray>
+
+#include <system_error>
+
 #include <sys/types.h>
 
 /// A new file beside the one that it is going to replace, readable by its owner only, gone again unless it was renamed.

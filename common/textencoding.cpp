@@ -40,7 +40,7 @@ const Byte *skipAscii(const Byte *at, const Byte *end)
 
 bool isAscii(const QByteArray &text)
 {
-    const Byte *const end{bytesOf(text) + text.size()};
+    const Byte *end{bytesOf(text) + text.size()};
     return skipAscii(bytesOf(text), end) == end;
 }
 
@@ -78,7 +78,7 @@ int sequenceLength(const Byte *at, const Byte *end)
 
 bool isUtf8(const QByteArray &text)
 {
-    const Byte *const end{bytesOf(text) + text.size()};
+    const Byte *end{bytesOf(text) + text.size()};
     for (const Byte *at{skipAscii(bytesOf(text), end)}; at != end; at = skipAscii(at, end)) {
         const int length{sequenceLength(at, end)};
         if (length == 0)
@@ -165,7 +165,7 @@ TextEncoding::TextEncoding(QTextCodec *codec)
 
 TextEncoding TextEncoding::detect(const QByteArray &bytes)
 {
-    QTextCodec *const locale{localeCodec()};
+    QTextCodec *locale{localeCodec()};
     if (locale && (isAscii(bytes) || survivesIn(locale, bytes)))
         return TextEncoding{locale};
     return isUtf8(bytes) ? TextEncoding{} : TextEncoding{QTextCodec::codecForMib(latin1Mib)};

@@ -58,7 +58,7 @@ struct DescriptorMessage
         header.msg_iovlen = 1;
         header.msg_control = control.data();
         header.msg_controllen = control.size();
-        auto *const rights = reinterpret_cast<cmsghdr *>(control.data());
+        auto *rights = reinterpret_cast<cmsghdr *>(control.data());
         rights->cmsg_level = SOL_SOCKET;
         rights->cmsg_type = SCM_RIGHTS;
         rights->cmsg_len = CMSG_LEN(sizeof descriptor);

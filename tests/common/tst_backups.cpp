@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/backups.h"
-#include "common/filedescriptor.h"
 #include "common/fileio.h"
 #include "common/paths.h"
+#include "common/posix.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QDateTime>

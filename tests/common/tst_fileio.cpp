@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/fileio.h"
 
-#include "common/filedescriptor.h"
 #include "common/paths.h"
+#include "common/posix.h"
 #include "common/textencoding.h"
 #include "tests/common/childprocess.h"
 #include "tests/support/temporaryroot.h"
@@ -937,7 +937,7 @@ void FileIoTest::leavesWhatIsNoLeftOver()
 {
     writeTestFile(paths::configuration(), oldContent);
     const QString live{directory() + QStringLiteral(".dhcpd.conf.orv-living")};
-    for (const char *const name :
+    for (const char *name :
          {".dhcpd.conf.orv-living", ".dhcpd.conf.orv-longer1", ".other.orv-a1b2c3", "dhcpd.conf.orv-a1b2c3"})
         writeTestFile(directory() + QString::fromLatin1(name), "x");
     QVERIFY(QDir{directory()}.mkdir(QStringLiteral(".dhcpd.conf.orv-folder")));

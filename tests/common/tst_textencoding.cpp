@@ -229,7 +229,7 @@ void TextEncodingTest::agreesWithQtOnEveryShortSequence()
     const LocaleCodec codec{"UTF-8"};
     for (int first{0x80}; first < 0x100; ++first) {
         for (int second{}; second < 0x100; ++second) {
-            for (const char *const rest : {"", "\x80", "\xBF", "a", "\x80\x80", "\xBF\xBF", "\x80z", "\x80\xC0"}) {
+            for (const char *rest : {"", "\x80", "\xBF", "a", "\x80\x80", "\xBF\xBF", "\x80z", "\x80\xC0"}) {
                 const QByteArray bytes{QByteArray{}.append(static_cast<char>(first)).append(static_cast<char>(second)) +
                                        rest};
                 QVERIFY2(isReadAsUtf8(bytes) == qtTakesForUtf8(bytes), bytes.toHex());
