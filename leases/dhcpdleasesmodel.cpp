@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/dhcpdleasesmodel.h"
 
+#include "leases/leasefile.h"
+#include "leases/leaseneedle.h"
 #include "leases/leasesearch.h"
 
 #include <array>
@@ -30,37 +32,20 @@ int DhcpdLeasesModel::columnCount(const QModelIndex & /*parent*/) const { return
 
 QVariant DhcpdLeasesModel::data(const QModelIndex &index, int role) const
 {
-    if (!index.isValid() || index.row() >= m_table.size() || (role != Qt::DisplayRole && role != Qt::EditRole)) {
+    if (!index.isValid() || index.row() >= m_table.size())
         return {};
-    }
     const Lease &lease{m_table.at(index.row())};
-    const auto text{[this](LeaseTexts::Id id) { return decodeLeaseText(m_table.texts().at(id)); }};
-    switch (index.column()) {
-    case Address:
-        return m_table.addressText(lease.address);
-    case Mac:
-        return text(lease.mac);
-    case HostName:
-        return text(lease.host);
-    case State:
-        return text(lease.state);
-    case Start:
-        return m_timeTexts.text(lease.start);
-    case End:
-        return m_timeTexts.text(lease.end);
-    default:
-        return {};
-    }
+    if (role == AddressRole)
+        return lease.address;
+    return role == Qt::DisplayRole || role == Qt::EditRole ? text(lease, index.column()) : QVariant{};
 }
 
 QVariant DhcpdLeasesModel::headerData(int section, Qt::Orientation orientation, int role) const
 {
-    if (role != Qt::DisplayRole) {
+    if (role != Qt::DisplayRole)
         return {};
-    }
-    if (orientation == Qt::Vertical) {
+    if (orientation == Qt::Vertical)
         return section; // deliberately from 0 on
-    }
     return section >= 0 && section < columns ? tr(headers[static_cast<std::size_t>(section)]) : QVariant{};
 }
 
@@ -80,14 +65,12 @@ void DhcpdLeasesModel::reload(const QString &path)
     beginResetModel();
     m_reader.clear();
     const bool isRead{m_reader.readOn(LeaseFile{path})};
-    if (!isRead) {
+    if (!isRead)
         m_reader.clear();
-    }
     m_table.settleAll();
     endResetModel();
-    if (!isRead) {
+    if (!isRead)
         emit error(tr("Unable to open file '%1' for read").arg(path));
-    }
 }
 
 void DhcpdLeasesModel::update(const QString &path)
@@ -98,9 +81,8 @@ void DhcpdLeasesModel::update(const QString &path)
         return;
     }
     const bool isAnnouncedByRow{file.size() - m_reader.position() <= mostAnnouncedByRow};
-    if (!isAnnouncedByRow) {
+    if (!isAnnouncedByRow)
         beginResetModel();
-    }
     const bool isRead{m_reader.readOn(file)};
     if (isAnnouncedByRow) {
         settleOneByOne();
@@ -108,15 +90,33 @@ void DhcpdLeasesModel::update(const QString &path)
         m_table.settleAll();
         endResetModel();
     }
-    if (!isRead) {
+    if (!isRead)
         reload(path);
+}
+
+QString DhcpdLeasesModel::text(const Lease &lease, int column) const
+{
+    const auto decoded = [this](LeaseTexts::Id id) { return decodeLeaseText(m_table.texts().at(id)); };
+    switch (column) {
+    case Address:
+        return m_table.addressText(lease.address);
+    case Mac:
+        return decoded(lease.mac);
+    case HostName:
+        return decoded(lease.host);
+    case State:
+        return decoded(lease.state);
+    case Start:
+        return m_timeTexts.text(lease.start);
+    default:
+        return m_timeTexts.text(lease.end);
     }
 }
 
 void DhcpdLeasesModel::settleOneByOne()
 {
     while (m_table.hasPending()) {
-        const auto [row, isNew]{m_table.placeOfNext()};
+        const auto [row, isNew] = m_table.placeOfNext();
         if (isNew) {
             beginInsertRows({}, row, row);
             m_table.settleNext();

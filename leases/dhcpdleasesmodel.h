@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include "leases/lease.h"
 #include "leases/leasereader.h"
 #include "leases/leasetable.h"
-#include "leases/leasetime.h"
+#include "leases/leasetimetexts.h"
 
 #include <QAbstractListModel>
 #include <QString>
@@ -20,15 +21,19 @@ class DhcpdLeasesModel final : public QAbstractListModel
     Q_OBJECT
 
 public:
+    /// The columns as an index counts them.
     enum Column
     {
-        Address,
-        Mac,
-        HostName,
-        State,
-        Start,
-        End
+        Address = static_cast<int>(LeaseColumn::Address),
+        Mac = static_cast<int>(LeaseColumn::Mac),
+        HostName = static_cast<int>(LeaseColumn::HostName),
+        State = static_cast<int>(LeaseColumn::State),
+        Start = static_cast<int>(LeaseColumn::Start),
+        End = static_cast<int>(LeaseColumn::End)
     };
+
+    /// The role of the number by which the rows are ordered, that of the address as a quint32; in every column.
+    static constexpr int AddressRole{Qt::UserRole + 1};
 
     explicit DhcpdLeasesModel(QObject *parent = nullptr);
 
@@ -56,6 +61,7 @@ public slots:
     void update(const QString &path);
 
 private:
+    QString text(const Lease &lease, int column) const;
     void settleOneByOne();
 
     LeaseTable m_table;

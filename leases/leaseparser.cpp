@@ -28,12 +28,10 @@ std::size_t closingQuote(std::string_view line, std::size_t begin)
     std::size_t quote{line.find('"', begin)};
     while (quote != npos) {
         std::size_t backslashes{0};
-        while (quote - backslashes > begin && line[quote - backslashes - 1] == '\\') {
+        while (quote - backslashes > begin && line[quote - backslashes - 1] == '\\')
             ++backslashes;
-        }
-        if (backslashes % 2 == 0) {
+        if (backslashes % 2 == 0)
             break;
-        }
         quote = line.find('"', quote + 1);
     }
     return quote;
@@ -46,9 +44,8 @@ std::string outsideOfQuotes(std::string_view line)
     for (std::size_t begin{0}; begin < line.size();) {
         const std::size_t end{line.find_first_of("\"#", begin)};
         outside += line.substr(begin, end - begin);
-        if (end == npos || line[end] == '#') {
+        if (end == npos || line[end] == '#')
             break;
-        }
         outside += '"';
         const std::size_t closing{closingQuote(line, end + 1)};
         begin = closing == npos ? npos : closing + 1;
@@ -59,21 +56,18 @@ std::string outsideOfQuotes(std::string_view line)
 /// The text within the quotes of which the first is at `place`; nothing if there are none.
 std::optional<std::string_view> quotedAt(std::string_view line, std::size_t place)
 {
-    if (place == npos) {
+    if (place == npos)
         return {};
-    }
     std::size_t begin{line.find_first_of("\"#")};
     while (begin < place && line[begin] == '"') {
         const std::size_t closing{closingQuote(line, begin + 1)};
         begin = closing == npos ? npos : line.find_first_of("\"#", closing + 1);
     }
-    if (begin != place || line[begin] != '"') {
+    if (begin != place || line[begin] != '"')
         return {};
-    }
     const std::size_t closing{closingQuote(line, begin + 1)};
-    if (closing == npos) {
+    if (closing == npos)
         return {};
-    }
     return line.substr(begin + 1, closing - begin - 1);
 }
 
@@ -83,9 +77,8 @@ std::size_t wordPlace(std::string_view line, int index)
     std::size_t begin{0};
     for (; index > 0; --index) {
         const std::size_t space{line.find(' ', begin)};
-        if (space == npos) {
+        if (space == npos)
             return npos;
-        }
         begin = space + 1;
     }
     return begin;
@@ -122,19 +115,16 @@ std::optional<quint32> plainAddress(std::string_view text)
 {
     quint32 address{0};
     const char *c{text.data()};
-    const char *const end{c + text.size()};
+    const char *end{c + text.size()};
     for (int part{0}; part < 4; ++part) {
-        if (part > 0 && (c == end || *c++ != '.')) {
+        if (part > 0 && (c == end || *c++ != '.'))
             return {};
-        }
-        const char *const begin{c};
+        const char *begin{c};
         quint32 value{0};
-        while (c != end && *c >= '0' && *c <= '9' && c - begin < 3) {
+        while (c != end && *c >= '0' && *c <= '9' && c - begin < 3)
             value = value * 10 + static_cast<quint32>(*c++ - '0');
-        }
-        if (c == begin || value > 255 || (*begin == '0' && c - begin > 1)) { // a number that begins with 0 is octal
+        if (c == begin || value > 255 || (*begin == '0' && c - begin > 1)) // a number that begins with 0 is octal
             return {};
-        }
         address = address << 8U | value;
     }
     return c == end ? std::optional{address} : std::nullopt;
@@ -154,11 +144,10 @@ const char *usualTime(std::string_view line, std::string_view keyword)
 /// The state in a line of a keyword with its indentation, one of the usual states and a semicolon; else empty.
 std::string_view usualState(std::string_view line, std::string_view keyword)
 {
-    if (!startsWith(line, keyword) || line.back() != ';') {
+    if (!startsWith(line, keyword) || line.back() != ';')
         return {};
-    }
     const std::string_view state{line.substr(keyword.size(), line.size() - keyword.size() - 1)};
-    const auto usual{std::find(usualStates.begin(), usualStates.end(), state)};
+    const auto usual = std::find(usualStates.begin(), usualStates.end(), state);
     return usual != usualStates.end() ? *usual : std::string_view{};
 }
 
@@ -167,21 +156,19 @@ std::string_view usualState(std::string_view line, std::string_view keyword)
 std::optional<std::string_view> usualQuoted(std::string_view line, std::string_view keyword)
 {
     if (line.size() < keyword.size() + 2 || !startsWith(line, keyword) || line.back() != ';' ||
-        closingQuote(line, keyword.size()) != line.size() - 2) {
+        closingQuote(line, keyword.size()) != line.size() - 2)
         return {};
-    }
     return line.substr(keyword.size(), line.size() - 2 - keyword.size());
 }
 
 /// The address in a line of the word lease, a plain address and an opening brace; else nothing.
 std::optional<quint32> usualAddress(std::string_view line)
 {
-    constexpr auto begin{"lease "sv};
-    constexpr auto end{" {"sv};
+    constexpr std::string_view begin{"lease "};
+    constexpr std::string_view end{" {"};
     if (line.size() < begin.size() + end.size() || !startsWith(line, begin) ||
-        line.substr(line.size() - end.size()) != end) {
+        line.substr(line.size() - end.size()) != end)
         return {};
-    }
     return plainAddress(line.substr(begin.size(), line.size() - end.size() - begin.size()));
 }
 
@@ -206,9 +193,8 @@ void LeaseParser::clear()
 
 void LeaseParser::feed(std::string_view bytes)
 {
-    if (m_beforeUnfinished) {
+    if (m_beforeUnfinished)
         m_values = *std::exchange(m_beforeUnfinished, std::nullopt);
-    }
     if (contains(bytes, "\r"sv)) { // as in any text file, carriage returns are no part of the text
         std::string text{bytes};
         text.erase(std::remove(text.begin(), text.end(), '\r'), text.end());
@@ -220,9 +206,8 @@ void LeaseParser::feed(std::string_view bytes)
 
 void LeaseParser::finish()
 {
-    if (m_beforeUnfinished) { // the line was taken, and nothing was fed since
+    if (m_beforeUnfinished) // the line was taken, and nothing was fed since
         return;
-    }
     m_beforeUnfinished = m_values;
     m_blockEnded = false;
     readLine(m_unfinished);
@@ -234,23 +219,20 @@ void LeaseParser::feedLines(std::string_view bytes)
     if (!m_unfinished.empty()) {
         const std::size_t end{bytes.find('\n')};
         m_unfinished += bytes.substr(0, end);
-        if (end == npos) {
+        if (end == npos)
             return;
-        }
         readLine(m_unfinished);
         begin = end + 1;
     }
-    for (std::size_t end{}; (end = bytes.find('\n', begin)) != npos; begin = end + 1) {
+    for (std::size_t end{}; (end = bytes.find('\n', begin)) != npos; begin = end + 1)
         readLine(bytes.substr(begin, end - begin));
-    }
     m_unfinished = bytes.substr(begin);
 }
 
 void LeaseParser::readLine(std::string_view line)
 {
-    if (!readUsualLine(line)) {
+    if (!readUsualLine(line))
         readAnyLine(line);
-    }
 }
 
 /// Reads a line that is wholly of a layout that the server writes. Each layout leaves no room for a keyword or brace
@@ -258,9 +240,8 @@ void LeaseParser::readLine(std::string_view line)
 bool LeaseParser::readUsualLine(std::string_view line)
 {
     if (line.size() < 3) {
-        if (line == "}"sv) {
+        if (line == "}"sv)
             endBlock();
-        }
         return line.empty() || line == "}"sv;
     }
     switch (line[2]) {
@@ -269,7 +250,7 @@ bool LeaseParser::readUsualLine(std::string_view line)
     case 'e':
         return readUsualTime(line, "  ends "sv, m_values.lease.end);
     case 'c':
-        if (const auto host{usualQuoted(line, R"(  client-hostname ")"sv)}) {
+        if (const std::optional<std::string_view> host{usualQuoted(line, R"(  client-hostname ")"sv)}) {
             m_values.lease.host = add(*host);
             return true;
         }
@@ -290,7 +271,7 @@ bool LeaseParser::readUsualLine(std::string_view line)
         }
         return false;
     case 'a':
-        if (const auto address{usualAddress(line)}) {
+        if (const std::optional<quint32> address{usualAddress(line)}) {
             m_values.lease.address = *address;
             m_values.addressText.reset();
             return true;
@@ -311,23 +292,22 @@ bool LeaseParser::readUsualLine(std::string_view line)
 
 bool LeaseParser::readUsualTime(std::string_view line, std::string_view keyword, LeaseTime &time)
 {
-    const char *const text{usualTime(line, keyword)};
-    if (text) {
+    const char *text{usualTime(line, keyword)};
+    if (text)
         time = LeaseTime::fromUsualLayout(text);
-    }
     return text;
 }
 
 void LeaseParser::readAnyLine(std::string_view line)
 {
     const std::string outside{outsideOfQuotes(line)};
-    const auto has{[&outside](std::string_view keyword) { return contains(outside, keyword); }};
+    const auto has = [&outside](std::string_view keyword) { return contains(outside, keyword); };
     if (has("{"sv)) {
         startBlock(word(line, 1));
     } else if (has("hardware"sv)) {
         m_values.lease.mac = add(withoutLast(word(line, 4)));
     } else if (has("client-hostname"sv)) {
-        const auto quoted{quotedAt(line, wordPlace(line, 3))};
+        const std::optional<std::string_view> quoted{quotedAt(line, wordPlace(line, 3))};
         m_values.lease.host = quoted ? add(*quoted) : add(withoutEnds(word(line, 3), 1, 2));
     } else if (has("binding state"sv) && !has("next"sv) && !has("rewind"sv)) {
         setState(withoutLast(word(line, 4)));
@@ -347,9 +327,8 @@ void LeaseParser::startBlock(std::string_view address)
     const quint32 number{parsed.toIPv4Address()};
     m_values.lease.address = number;
     m_values.addressText.reset();
-    if (shown != QHostAddress{number}.toString()) {
+    if (shown != QHostAddress{number}.toString())
         m_values.addressText = shown;
-    }
 }
 
 void LeaseParser::endBlock()
@@ -360,14 +339,13 @@ void LeaseParser::endBlock()
 
 void LeaseParser::setState(std::string_view state)
 {
-    const auto usual{std::find(usualStates.begin(), usualStates.end(), state)};
+    const auto usual = std::find(usualStates.begin(), usualStates.end(), state);
     if (usual == usualStates.end()) {
         m_values.lease.state = add(state);
         return;
     }
     LeaseTexts::Id &id{m_usualStates[static_cast<std::size_t>(usual - usualStates.begin())]};
-    if (id == LeaseTexts::Id{}) {
+    if (id == LeaseTexts::Id{})
         id = add(state);
-    }
     m_values.lease.state = id;
 }

@@ -2,14 +2,22 @@
 #include "leases/leaseproxymodel.h"
 
 #include "leases/dhcpdleasesmodel.h"
+#include "leases/leaseneedle.h"
+#include "leases/leasesearch.h"
 
 #include <QSignalBlocker>
 
+LeaseProxyModel::LeaseProxyModel(QObject *parent)
+    : QSortFilterProxyModel{parent}
+{
+}
+
+LeaseProxyModel::~LeaseProxyModel() = default;
+
 void LeaseProxyModel::setSourceModel(QAbstractItemModel *model)
 {
-    for (const QMetaObject::Connection &connection : m_connections) {
+    for (const QMetaObject::Connection &connection : m_connections)
         disconnect(connection);
-    }
     // Before the base connects itself, so that what is known of the old leases is forgotten when it asks about the new.
     if (model) {
         m_connections = {
@@ -28,9 +36,8 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
         QSortFilterProxyModel::setFilterFixedString(text);
         return;
     }
-    if (text == m_text) {
+    if (text == m_text)
         return;
-    }
     beginResetModel();
     m_text = text;
     searchAgain();
@@ -45,31 +52,26 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
 QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const QVariant &value, int hits,
                                        Qt::MatchFlags flags) const
 {
-    const DhcpdLeasesModel *const model{leases()};
-    if (!model || !isSearchable(start, role, hits, flags)) {
+    const DhcpdLeasesModel *model{leases()};
+    if (!model || !isSearchable(start, role, hits, flags))
         return QSortFilterProxyModel::match(start, role, value, hits, flags);
-    }
     const QModelIndex first{mapToSource(start)};
     const LeaseNeedle needle{value.toString(),
                              flags.testFlag(Qt::MatchCaseSensitive) ? Qt::CaseSensitive : Qt::CaseInsensitive};
-    if (!m_lastMatch || !(m_lastMatch->needle() == needle)) {
+    if (!m_lastMatch || !(m_lastMatch->needle() == needle))
         m_lastMatch = model->search(needle);
-    }
-    const LeaseHits found{m_lastMatch->find(first.column(), m_found ? &*m_found : nullptr)};
+    const LeaseHits found{m_lastMatch->find(static_cast<LeaseColumn>(first.column()), m_found ? &*m_found : nullptr)};
     QModelIndexList matches;
-    if (found.isEmpty()) {
+    if (found.isEmpty())
         return matches;
-    }
     const int rows{model->rowCount()};
     const int end{rows + (flags.testFlag(Qt::MatchWrap) ? first.row() : 0)};
     for (int i{first.row()}; i < end && matches.size() != hits; ++i) {
         const int row{i < rows ? i : i - rows};
-        if (!found.contains(row)) {
+        if (!found.contains(row))
             continue;
-        }
-        if (const QModelIndex match{mapFromSource(model->index(row, first.column()))}; match.isValid()) {
+        if (const QModelIndex match{mapFromSource(model->index(row, first.column()))}; match.isValid())
             matches.append(match);
-        }
     }
     return matches;
 }
@@ -88,8 +90,8 @@ const DhcpdLeasesModel *LeaseProxyModel::leases() const
 bool LeaseProxyModel::isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const
 {
     // There are no levels to recurse into.
-    constexpr Qt::MatchFlags heeded{Qt::MatchCaseSensitive | Qt::MatchWrap | Qt::MatchRecursive};
-    return (flags & ~heeded) == Qt::MatchContains && role == Qt::DisplayRole && (hits > 0 || hits == -1) &&
+    constexpr Qt::MatchFlags supported{Qt::MatchCaseSensitive | Qt::MatchWrap | Qt::MatchRecursive};
+    return (flags & ~supported) == Qt::MatchContains && role == Qt::DisplayRole && (hits > 0 || hits == -1) &&
            start.model() == this && hasIndex(start.row(), start.column()) && sortColumn() < 0;
 }
 
@@ -97,7 +99,7 @@ void LeaseProxyModel::search(const QAbstractItemModel *model)
 {
     forgetFound();
     m_search.reset();
-    const auto *const searched{qobject_cast<const DhcpdLeasesModel *>(model)};
+    const auto *searched = qobject_cast<const DhcpdLeasesModel *>(model);
     if (searched && !m_text.isEmpty()) {
         m_search = searched->search({m_text, Qt::CaseSensitive});
         m_found.emplace(m_search->find());

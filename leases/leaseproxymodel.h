@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
-#include "leases/leasesearch.h"
+#include "leases/leasehits.h"
 
 #include <QSortFilterProxyModel>
 
@@ -10,6 +10,7 @@
 #include <optional>
 
 class DhcpdLeasesModel;
+class LeaseSearch;
 
 /// A filter and search for a DhcpdLeasesModel that keep up with typing over a million leases.
 ///
@@ -20,7 +21,8 @@ class LeaseProxyModel final : public QSortFilterProxyModel
     Q_OBJECT
 
 public:
-    using QSortFilterProxyModel::QSortFilterProxyModel;
+    explicit LeaseProxyModel(QObject *parent = nullptr);
+    ~LeaseProxyModel() override;
 
     void setSourceModel(QAbstractItemModel *model) override;
 

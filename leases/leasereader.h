@@ -1,42 +1,15 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include "leases/leasefile.h"
 #include "leases/leaseparser.h"
-#include "leases/leasetable.h"
 
 #include <QByteArray>
-#include <QString>
 
-#include <sys/types.h>
-
-#include <optional>
 #include <string_view>
 #include <vector>
 
-/// A lease file opened for reading: a regular file, as long as it was then, whatever is written to it meanwhile.
-class LeaseFile final
-{
-public:
-    explicit LeaseFile(const QString &path);
-    ~LeaseFile();
-    Q_DISABLE_COPY_MOVE(LeaseFile)
-
-    bool isOpen() const { return m_descriptor >= 0; }
-    qint64 size() const { return m_size; }
-    bool isSameFile(dev_t device, ino_t inode) const { return device == m_device && inode == m_inode; }
-    dev_t device() const { return m_device; }
-    ino_t inode() const { return m_inode; }
-
-    /// Reads up to `count` bytes from `offset` on into `buffer`: fewer where the file ends, none beyond size(). Nothing
-    /// on an error.
-    std::optional<std::size_t> read(qint64 offset, char *buffer, std::size_t count) const;
-
-private:
-    int m_descriptor{-1};
-    qint64 m_size{0};
-    dev_t m_device{};
-    ino_t m_inode{};
-};
+class LeaseTable;
 
 /// Reads lease files into a table: whole ones, or what was appended to the one that was read last.
 class LeaseReader final
@@ -69,8 +42,7 @@ private:
 
     LeaseTable &m_table;
     LeaseParser m_parser;
-    dev_t m_device{};
-    ino_t m_inode{};
+    LeaseFile::Identity m_identity;
     qint64 m_position{0};
     std::vector<Sample> m_samples;
     QByteArray m_lastBytes; // those before m_position

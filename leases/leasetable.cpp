@@ -1,12 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasetable.h"
 
-#include "common/textencoding.h"
-
 #include <QHostAddress>
 
 #include <algorithm>
-#include <cstring>
 #include <limits>
 
 namespace {
@@ -27,68 +24,24 @@ quint32 placeOf(quint64 key) { return static_cast<quint32>(key); }
 
 } // namespace
 
-QByteArray leaseBytes(std::string_view text)
-{
-    return {text.data(), static_cast<int>(std::min(text.size(), std::size_t{TextEncoding::longestText}))};
-}
-
-QString decodeLeaseText(std::string_view text)
-{
-    const QByteArray bytes{leaseBytes(text)};
-    return TextEncoding::detect(bytes).decode(bytes);
-}
-
-void LeaseTexts::clear()
-{
-    m_bytes.assign(1, '\0'); // the empty text
-    m_bytes.shrink_to_fit();
-}
-
-LeaseTexts::Id LeaseTexts::add(std::string_view text)
-{
-    const std::size_t id{m_bytes.size()};
-    if (text.empty() || id > std::numeric_limits<Id>::max()) { // beyond 4 GiB of texts, cells stay empty
-        return {};
-    }
-    if (text.size() < static_cast<unsigned char>(longText)) {
-        m_bytes.push_back(static_cast<char>(text.size()));
-    } else {
-        const quint64 size{text.size()};
-        m_bytes.push_back(longText);
-        m_bytes.append(reinterpret_cast<const char *>(&size), sizeof size);
-    }
-    m_bytes.append(text);
-    return static_cast<Id>(id);
-}
-
-std::string_view LeaseTexts::longTextAt(Id id) const
-{
-    const char *const text{m_bytes.data() + id + 1};
-    quint64 size{};
-    std::memcpy(&size, text, sizeof size);
-    return {text + sizeof size, size};
-}
-
 void LeaseTable::clear() { *this = LeaseTable{}; }
 
 void LeaseTable::reserveForFile(qint64 bytes)
 {
-    const auto ahead{static_cast<std::size_t>(std::min(bytes, mostBytesAhead))};
+    const auto ahead = static_cast<std::size_t>(std::min(bytes, mostBytesAhead));
     m_leases.reserve(ahead / bytesPerLease);
     m_texts.reserve(ahead / bytesPerTextByte);
 }
 
 void LeaseTable::add(const Lease &lease, const std::optional<QString> &addressText)
 {
-    if (m_leases.size() - m_rows.size() >= std::max(manyPending, m_rows.size())) {
+    if (m_leases.size() - m_rows.size() >= std::max(manyPending, m_rows.size()))
         settleAll();
-    }
     m_leases.push_back(lease);
-    if (addressText) {
+    if (addressText)
         m_addressTexts.insert(lease.address, *addressText);
-    } else if (!m_addressTexts.isEmpty()) {
+    else if (!m_addressTexts.isEmpty())
         m_addressTexts.remove(lease.address);
-    }
 }
 
 void LeaseTable::settleAll()
@@ -96,9 +49,8 @@ void LeaseTable::settleAll()
     const std::size_t settled{m_rows.size()};
     std::vector<quint64> keys;
     keys.reserve(m_leases.size() - settled);
-    for (std::size_t place{settled}; place < m_leases.size(); ++place) {
+    for (std::size_t place{settled}; place < m_leases.size(); ++place)
         keys.push_back(sortKey(m_leases[place].address, place));
-    }
     std::sort(keys.begin(), keys.end());
 
     // Merge the last lease of each address into the rows. A lease whose address has a row already moves to that one's
@@ -107,16 +59,14 @@ void LeaseTable::settleAll()
     std::vector<quint32> rows;
     std::vector<quint32> rowOf(keys.size(), none);
     rows.reserve(m_leases.size());
-    auto old{m_rows.cbegin()};
-    for (auto key{keys.cbegin()}; key != keys.cend(); ++key) {
+    auto old = m_rows.cbegin();
+    for (auto key = keys.cbegin(); key != keys.cend(); ++key) {
         const quint32 address{addressOf(*key)};
         const bool isLast{key + 1 == keys.cend() || addressOf(*(key + 1)) != address};
-        if (!isLast) {
+        if (!isLast)
             continue;
-        }
-        while (old != m_rows.cend() && m_leases[*old].address < address) {
+        while (old != m_rows.cend() && m_leases[*old].address < address)
             rows.push_back(*old++);
-        }
         if (old != m_rows.cend() && m_leases[*old].address == address) {
             m_leases[*old] = m_leases[placeOf(*key)];
         } else {
@@ -140,20 +90,20 @@ void LeaseTable::settleAll()
 LeaseTable::Place LeaseTable::placeOfNext() const
 {
     const quint32 address{m_leases[m_rows.size()].address};
-    const auto row{std::lower_bound(m_rows.cbegin(), m_rows.cend(), address, [this](quint32 place, quint32 wanted) {
+    const auto row = std::lower_bound(m_rows.cbegin(), m_rows.cend(), address, [this](quint32 place, quint32 wanted) {
         return m_leases[place].address < wanted;
-    })};
+    });
     return {static_cast<int>(row - m_rows.cbegin()), row == m_rows.cend() || m_leases[*row].address != address};
 }
 
 void LeaseTable::settleNext()
 {
     const Place place{placeOfNext()};
-    const auto row{m_rows.begin() + place.row};
+    const auto row = m_rows.begin() + place.row;
     if (place.isNew) {
         m_rows.insert(row, static_cast<quint32>(m_rows.size()));
     } else {
-        const auto next{m_leases.begin() + size()};
+        const auto next = m_leases.begin() + size();
         m_leases[*row] = *next;
         m_leases.erase(next);
     }
@@ -161,12 +111,12 @@ void LeaseTable::settleNext()
 
 QString LeaseTable::addressText(quint32 address) const
 {
-    const QString *const text{oddAddressText(address)};
+    const QString *text{irregularAddressText(address)};
     return text ? *text : QHostAddress{address}.toString();
 }
 
-const QString *LeaseTable::oddAddressText(quint32 address) const
+const QString *LeaseTable::irregularAddressText(quint32 address) const
 {
-    const auto text{m_addressTexts.constFind(address)};
+    const auto text = m_addressTexts.constFind(address);
     return text != m_addressTexts.cend() ? &*text : nullptr;
 }

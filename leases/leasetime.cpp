@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasetime.h"
 
-#include <algorithm>
+#include <QString>
+
+#include <array>
 #include <cstring>
-#include <iterator>
-#include <utility>
 
 namespace {
 
@@ -31,9 +31,8 @@ bool hasLayout(const char *bytes, const char *pattern)
     constexpr quint64 highHalves{0xF0F0F0F0F0F0F0F0};
     constexpr quint64 sixes{0x0606060606060606};
     std::array<char, sizeof(quint64)> mask{};
-    for (std::size_t i{0}; i < mask.size(); ++i) {
+    for (std::size_t i{0}; i < mask.size(); ++i)
         mask[i] = pattern[i] == '0' ? '\0' : '\xFF';
-    }
     const quint64 separators{load(mask.data())};
     const quint64 word{load(bytes)};
     const quint64 digits{(word & ~separators) | (zeros & separators)};
@@ -44,9 +43,8 @@ bool hasLayout(const char *bytes, const char *pattern)
 unsigned number(const char *digits, int count)
 {
     unsigned value{0};
-    for (int i{0}; i < count; ++i) {
+    for (int i{0}; i < count; ++i)
         value = value * 10 + static_cast<unsigned>(digits[i] - '0');
-    }
     return value;
 }
 
@@ -60,16 +58,14 @@ LeaseTime::LeaseTime(unsigned year, unsigned month, unsigned day, unsigned hour,
 
 LeaseTime LeaseTime::parse(std::string_view date, std::string_view time)
 {
-    if (date.size() != dateLength || time.size() != timeLength) {
+    if (date.size() != dateLength || time.size() != timeLength)
         return {};
-    }
     // Apart: together they would be refused where the local clock skips that hour. Qt's parser takes more than digits.
     const QDate qDate{QDate::fromString(QString::fromLatin1(date.data(), dateLength), QStringLiteral("yyyy/MM/dd"))};
     const QTime qTime{QTime::fromString(QString::fromLatin1(time.data(), timeLength), QStringLiteral("hh:mm:ss"))};
-    if (!qDate.isValid() || !qTime.isValid()) {
+    if (!qDate.isValid() || !qTime.isValid())
         return {};
-    }
-    const auto u{[](int value) { return static_cast<unsigned>(value); }};
+    const auto u = [](int value) { return static_cast<unsigned>(value); };
     return {u(qDate.year()), u(qDate.month()), u(qDate.day()), u(qTime.hour()), u(qTime.minute()), u(qTime.second())};
 }
 
@@ -96,102 +92,4 @@ QDate LeaseTime::date() const
 QTime LeaseTime::time() const
 {
     return {static_cast<int>(m_time >> 16U), static_cast<int>(m_time >> 8U & 0xFFU), static_cast<int>(m_time & 0xFFU)};
-}
-
-TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
-{
-    // Two numbers without a digit in common.
-    constexpr int number{11};
-    constexpr int otherNumber{22};
-    const auto text{[&locale](int hour, int minute, int second) {
-        return locale.toString(QTime{hour, minute, second}, QLocale::LongFormat);
-    }};
-    for (std::size_t i{0}; i < m_hours.size(); ++i) {
-        const int hour{static_cast<int>(i)};
-        const QString example{text(hour, number, number)};
-        m_hours[i] = {example, difference(example, text(hour, otherNumber, number)),
-                      difference(example, text(hour, number, otherNumber))};
-    }
-    const Hour &first{m_hours.front()};
-    const auto numberIn{[&first](const QString &whole, Field field) {
-        return whole.mid(field.position, field.length + whole.size() - first.text.size());
-    }};
-    for (std::size_t i{0}; i < m_minutes.size(); ++i) {
-        m_minutes[i] = numberIn(text(0, static_cast<int>(i), number), first.minute);
-        m_seconds[i] = numberIn(text(0, number, static_cast<int>(i)), first.second);
-    }
-}
-
-/// The part of `left` that is another in `right`, which is as long.
-TimeOfDayTexts::Field TimeOfDayTexts::difference(const QString &left, const QString &right)
-{
-    const auto begin{std::mismatch(left.cbegin(), left.cend(), right.cbegin(), right.cend()).first};
-    const auto end{std::mismatch(left.crbegin(), std::make_reverse_iterator(begin), right.crbegin()).first.base()};
-    return {static_cast<int>(begin - left.cbegin()), static_cast<int>(end - begin)};
-}
-
-QString TimeOfDayTexts::text(QTime time) const
-{
-    const Hour &hour{m_hours[static_cast<std::size_t>(time.hour())]};
-    const QString &minute{m_minutes[static_cast<std::size_t>(time.minute())]};
-    const QString &second{m_seconds[static_cast<std::size_t>(time.second())]};
-    QString text{hour.text};
-    const auto put{[&text](Field field, const QString &number) { text.replace(field.position, field.length, number); }};
-    // The latter first, so that the former stays where it is.
-    if (hour.minute.position < hour.second.position) {
-        put(hour.second, second);
-        put(hour.minute, minute);
-    } else {
-        put(hour.minute, minute);
-        put(hour.second, second);
-    }
-    return text;
-}
-
-QString LeaseTimeTexts::text(LeaseTime time)
-{
-    return time.isValid() ? timeOfDayText(time) + separator + dateText(time) : QString{};
-}
-
-QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
-{
-    heedLocale();
-    heedZone();
-    if (!m_timesOfDay) {
-        m_timesOfDay.emplace(m_locale);
-    }
-    return m_timesOfDay->text(time.time());
-}
-
-QString LeaseTimeTexts::dateText(LeaseTime time)
-{
-    heedLocale();
-    if (m_dates.size() >= rememberedDates) {
-        m_dates.clear();
-    }
-    auto text{m_dates.find(time.dateKey())};
-    if (text == m_dates.end()) {
-        text = m_dates.insert(time.dateKey(), m_locale.toString(time.date(), QLocale::NarrowFormat));
-    }
-    return *text;
-}
-
-void LeaseTimeTexts::heedLocale()
-{
-    if (const QLocale locale; locale != m_locale) {
-        m_locale = locale;
-        m_dates.clear();
-        m_timesOfDay.reset();
-    }
-}
-
-/// Once a second, which is when the name changes, for the locale takes microseconds to tell.
-void LeaseTimeTexts::heedZone()
-{
-    const std::time_t now{std::time(nullptr)};
-    const QTime example{0, 0};
-    if (std::exchange(m_zoneHeeded, now) != now && m_timesOfDay &&
-        m_timesOfDay->text(example) != m_locale.toString(example, QLocale::LongFormat)) {
-        m_timesOfDay.reset();
-    }
 }

@@ -15,9 +15,8 @@ namespace {
 
 void require(bool holds)
 {
-    if (!holds) {
+    if (!holds)
         std::abort();
-    }
 }
 
 } // namespace

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "tests/leases/oddleases.h"
+#include "tests/leases/irregularleases.h"
 
 #include <QRandomGenerator>
 
@@ -31,7 +31,7 @@ constexpr std::array usualLines{
     R"(  option agent.circuit-id "}{";)",
 };
 
-constexpr std::array oddLines{
+constexpr std::array irregularLines{
     "",
     " ",
     "}",
@@ -166,22 +166,20 @@ QByteArray changed(QByteArray line, QRandomGenerator &random)
 
 } // namespace
 
-QByteArray oddLeaseFile(QRandomGenerator &random)
+QByteArray irregularLeaseFile(QRandomGenerator &random)
 {
     QByteArray text;
-    const auto add{[&](const QByteArray &line) {
+    const auto add = [&](const QByteArray &line) {
         text += random.bounded(20) == 0 ? changed(line, random) : line;
-        if (random.bounded(60) != 0) {
+        if (random.bounded(60) != 0)
             text += random.bounded(40) == 0 ? "\r\n" : "\n";
-        }
-    }};
+    };
     const int blocks{random.bounded(1, 8)};
     for (int block{0}; block < blocks; ++block) {
         add("lease 10.0." + QByteArray::number(random.bounded(2)) + '.' + QByteArray::number(random.bounded(6)) + " {");
         const int lines{random.bounded(10)};
-        for (int line{0}; line < lines; ++line) {
-            add(random.bounded(3) == 0 ? oneOf(oddLines, random) : oneOf(usualLines, random));
-        }
+        for (int line{0}; line < lines; ++line)
+            add(random.bounded(3) == 0 ? oneOf(irregularLines, random) : oneOf(usualLines, random));
         add("}");
     }
     return random.bounded(4) == 0 ? text.left(random.bounded(text.size() + 1)) : text;

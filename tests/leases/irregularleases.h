@@ -5,9 +5,9 @@
 
 class QRandomGenerator;
 
-/// The text of a lease file of a few blocks as the server writes them, with odd lines among theirs, and some lines cut
+/// The text of a lease file of a few blocks as the server writes them, with irregular lines among them, and some lines cut
 /// short, changed or joined.
-QByteArray oddLeaseFile(QRandomGenerator &random);
+QByteArray irregularLeaseFile(QRandomGenerator &random);
 
 /// A block as the server writes it for an address 10.0.`third`.`fourth`, with values that depend on `version`.
 QByteArray leaseBlock(int third, int fourth, int version);

@@ -3,7 +3,7 @@
 
 #include "leases/leaseparser.h"
 #include "leases/leasetable.h"
-#include "leases/leasetime.h"
+#include "leases/leasetimetexts.h"
 
 #include <QAbstractItemModel>
 #include <QDateTime>
@@ -110,7 +110,7 @@ LeaseRows referenceRows(const QByteArray &text)
     for (const QString &line : lines) {
         const QStringList words{line.split(QLatin1Char{' '})};
         const Scanned scanned{scan(line)};
-        const auto has{[&](const char *part) { return scanned.outside.contains(QLatin1String{part}); }};
+        const auto has = [&](const char *part) { return scanned.outside.contains(QLatin1String{part}); };
         if (has("{")) {
             address = QHostAddress{shown(words.value(1))};
         } else if (has("hardware")) {
@@ -139,7 +139,7 @@ LeaseRows rowsOf(const LeaseTable &table)
     LeaseTimeTexts times;
     for (int row{0}; row < table.size(); ++row) {
         const Lease &lease{table.at(row)};
-        const auto text{[&](LeaseTexts::Id id) { return decodeLeaseText(table.texts().at(id)); }};
+        const auto text = [&](LeaseTexts::Id id) { return decodeLeaseText(table.texts().at(id)); };
         rows.append(QStringList{table.addressText(lease.address), text(lease.mac), text(lease.host), text(lease.state),
                                 times.text(lease.start), times.text(lease.end)});
     }
@@ -151,9 +151,8 @@ LeaseRows rowsOf(const QAbstractItemModel &model)
     LeaseRows rows;
     for (int row{0}; row < model.rowCount(); ++row) {
         QStringList texts;
-        for (int column{0}; column < model.columnCount(); ++column) {
+        for (int column{0}; column < model.columnCount(); ++column)
             texts.append(model.data(model.index(row, column)).toString());
-        }
         rows.append(texts);
     }
     return rows;

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/dhcpdleasesmodel.h"
-#include "tests/leases/oddleases.h"
+#include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QAbstractItemModelTester>
 #include <QFile>
@@ -14,8 +15,6 @@
 #include <sys/stat.h>
 
 namespace {
-
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
 
 /// Changes the file in place: the same file afterwards, with all that it had kept or not.
 void appendTo(const QString &path, const QByteArray &bytes)
@@ -43,7 +42,7 @@ void replace(const QString &path, const QByteArray &bytes)
 
 } // namespace
 
-class TestDhcpdLeasesModel final : public QObject
+class DhcpdLeasesModelTest final : public QObject
 {
     Q_OBJECT
 
@@ -77,14 +76,14 @@ private:
     QString m_path;
 };
 
-void TestDhcpdLeasesModel::init()
+void DhcpdLeasesModelTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     QVERIFY(m_folder->isValid());
     m_path = m_folder->filePath(text("dhcpd.leases"));
 }
 
-void TestDhcpdLeasesModel::isATableOfSixColumns()
+void DhcpdLeasesModelTest::isATableOfSixColumns()
 {
     DhcpdLeasesModel model;
     QCOMPARE(model.rowCount(), 0);
@@ -101,14 +100,13 @@ void TestDhcpdLeasesModel::isATableOfSixColumns()
     QCOMPARE(model.index(0, 2).data(Qt::EditRole).toString(), text("host-2"));
 }
 
-void TestDhcpdLeasesModel::hasHeaders()
+void DhcpdLeasesModelTest::hasHeaders()
 {
     const DhcpdLeasesModel model;
     const QStringList headers{text("IP address"),    text("MAC address"),  text("Host name"),
                               text("Binding state"), text("Rental start"), text("Rental end")};
-    for (int section{0}; section < headers.size(); ++section) {
+    for (int section{0}; section < headers.size(); ++section)
         QCOMPARE(model.headerData(section, Qt::Horizontal), QVariant{headers[section]});
-    }
     QVERIFY(!model.headerData(-1, Qt::Horizontal).isValid());
     QVERIFY(!model.headerData(6, Qt::Horizontal).isValid());
     QCOMPARE(model.headerData(0, Qt::Vertical), QVariant{0});
@@ -119,7 +117,7 @@ void TestDhcpdLeasesModel::hasHeaders()
     }
 }
 
-void TestDhcpdLeasesModel::hasDataOnlyForTextRoles()
+void DhcpdLeasesModelTest::hasDataOnlyForTextRoles()
 {
     DhcpdLeasesModel model;
     writeTestFile(m_path, leaseBlock(0, 1, 1));
@@ -128,9 +126,8 @@ void TestDhcpdLeasesModel::hasDataOnlyForTextRoles()
     QVERIFY(index.isValid());
     QCOMPARE(model.data(index, Qt::DisplayRole).toString(), text("10.0.0.1"));
     QCOMPARE(model.data(index, Qt::EditRole).toString(), text("10.0.0.1"));
-    for (const int role : {Qt::DecorationRole, Qt::ToolTipRole, Qt::CheckStateRole, Qt::UserRole}) {
+    for (const int role : {Qt::DecorationRole, Qt::ToolTipRole, Qt::CheckStateRole, Qt::UserRole})
         QVERIFY(!model.data(index, role).isValid());
-    }
     QVERIFY(!model.data({}, Qt::DisplayRole).isValid());
     QVERIFY(!model.index(1, 0).isValid());
     QVERIFY(!model.index(0, 6).isValid());
@@ -139,7 +136,7 @@ void TestDhcpdLeasesModel::hasDataOnlyForTextRoles()
     QVERIFY(!model.data(index, Qt::DisplayRole).isValid()); // an index of a row that is no more
 }
 
-void TestDhcpdLeasesModel::isAFlatReadOnlyList()
+void DhcpdLeasesModelTest::isAFlatReadOnlyList()
 {
     DhcpdLeasesModel model;
     const QAbstractItemModelTester tester{&model, QAbstractItemModelTester::FailureReportingMode::QtTest};
@@ -155,7 +152,7 @@ void TestDhcpdLeasesModel::isAFlatReadOnlyList()
              QModelIndexList{model.index(0, 5)});
 }
 
-void TestDhcpdLeasesModel::showsFilesOfTheServer_data()
+void DhcpdLeasesModelTest::showsFilesOfTheServer_data()
 {
     QTest::addColumn<QString>("file");
     QTest::addColumn<LeaseRows>("rows");
@@ -187,7 +184,7 @@ void TestDhcpdLeasesModel::showsFilesOfTheServer_data()
                                                 };
 }
 
-void TestDhcpdLeasesModel::showsFilesOfTheServer()
+void DhcpdLeasesModelTest::showsFilesOfTheServer()
 {
     QFETCH(const QString, file);
     QFETCH(const LeaseRows, rows);
@@ -198,7 +195,7 @@ void TestDhcpdLeasesModel::showsFilesOfTheServer()
     QCOMPARE(rowsOf(model), rows);
 }
 
-void TestDhcpdLeasesModel::reloadsInOneReset()
+void DhcpdLeasesModelTest::reloadsInOneReset()
 {
     DhcpdLeasesModel model;
     const QSignalSpy aboutToReset{&model, &QAbstractItemModel::modelAboutToBeReset};
@@ -221,15 +218,14 @@ void TestDhcpdLeasesModel::reloadsInOneReset()
     QCOMPARE(inserted.size() + changed.size(), 0);
 }
 
-void TestDhcpdLeasesModel::reportsWhatCannotBeRead_data()
+void DhcpdLeasesModelTest::reportsWhatCannotBeRead_data()
 {
     QTest::addColumn<QString>("kind");
-    for (const char *kind : {"missing", "directory", "pipe", "dangling link", "empty path"}) {
+    for (const char *kind : {"missing", "directory", "pipe", "dangling link", "empty path"})
         QTest::addRow("%s", kind) << text(kind);
-    }
 }
 
-void TestDhcpdLeasesModel::reportsWhatCannotBeRead()
+void DhcpdLeasesModelTest::reportsWhatCannotBeRead()
 {
     QFETCH(const QString, kind);
     DhcpdLeasesModel model;
@@ -240,15 +236,14 @@ void TestDhcpdLeasesModel::reportsWhatCannotBeRead()
     QCOMPARE(model.rowCount(), 1);
 
     QString path{m_folder->filePath(text("other"))};
-    if (kind == text("directory")) {
+    if (kind == text("directory"))
         path = m_folder->path();
-    } else if (kind == text("pipe")) {
+    else if (kind == text("pipe"))
         QCOMPARE(::mkfifo(QFile::encodeName(path).constData(), 0600), 0);
-    } else if (kind == text("dangling link")) {
+    else if (kind == text("dangling link"))
         QVERIFY(QFile::link(m_folder->filePath(text("nothing")), path));
-    } else if (kind == text("empty path")) {
+    else if (kind == text("empty path"))
         path.clear();
-    }
     model.reload(path);
     QCOMPARE(model.rowCount(), 0);
     QCOMPARE(resets.size(), 2);
@@ -262,7 +257,7 @@ void TestDhcpdLeasesModel::reportsWhatCannotBeRead()
     QCOMPARE(errors.size(), 1);
 }
 
-void TestDhcpdLeasesModel::readsAnEmptyFileSilently()
+void DhcpdLeasesModelTest::readsAnEmptyFileSilently()
 {
     DhcpdLeasesModel model;
     const QSignalSpy errors{&model, &DhcpdLeasesModel::error};
@@ -276,12 +271,11 @@ void TestDhcpdLeasesModel::readsAnEmptyFileSilently()
     QCOMPARE(errors.size(), 0);
 }
 
-void TestDhcpdLeasesModel::readsFilesLargerThanAPiece()
+void DhcpdLeasesModelTest::readsFilesLargerThanAPiece()
 {
     QByteArray file;
-    for (int i{0}; file.size() < 1'500'000; ++i) {
+    for (int i{0}; file.size() < 1'500'000; ++i)
         file += leaseBlock(i % 7, i % 251, i);
-    }
     file += "# " + QByteArray(600'000, 'x') + "\n" + leaseBlock(9, 9, 9);
     writeTestFile(m_path, file);
     DhcpdLeasesModel model;
@@ -290,7 +284,7 @@ void TestDhcpdLeasesModel::readsFilesLargerThanAPiece()
     QCOMPARE(rowsOf(model), referenceRows(file));
 }
 
-void TestDhcpdLeasesModel::updatesWithWhatWasAppended()
+void DhcpdLeasesModelTest::updatesWithWhatWasAppended()
 {
     DhcpdLeasesModel model;
     const QSignalSpy resets{&model, &QAbstractItemModel::modelReset};
@@ -310,7 +304,7 @@ void TestDhcpdLeasesModel::updatesWithWhatWasAppended()
     QCOMPARE(resets.size(), 2);
 }
 
-void TestDhcpdLeasesModel::tellsHowMuchAnUpdateReads()
+void DhcpdLeasesModelTest::tellsHowMuchAnUpdateReads()
 {
     DhcpdLeasesModel model;
     const QByteArray block{leaseBlock(0, 1, 1)};
@@ -328,7 +322,7 @@ void TestDhcpdLeasesModel::tellsHowMuchAnUpdateReads()
     QCOMPARE(model.bytesToRead(m_path), qint64{0});
 }
 
-void TestDhcpdLeasesModel::updateTakesBackAnEndThatTurnsOutToBeNone()
+void DhcpdLeasesModelTest::updateTakesBackAnEndThatTurnsOutToBeNone()
 {
     DhcpdLeasesModel model;
     writeTestFile(m_path, "lease 10.0.0.1 {\n}");
@@ -343,7 +337,7 @@ void TestDhcpdLeasesModel::updateTakesBackAnEndThatTurnsOutToBeNone()
     QCOMPARE(model.index(0, 0).data().toString(), text("10.0.0.2"));
 }
 
-void TestDhcpdLeasesModel::updateAnnouncesNewAndChangedRows()
+void DhcpdLeasesModelTest::updateAnnouncesNewAndChangedRows()
 {
     DhcpdLeasesModel model;
     const QAbstractItemModelTester tester{&model, QAbstractItemModelTester::FailureReportingMode::QtTest};
@@ -371,22 +365,20 @@ void TestDhcpdLeasesModel::updateAnnouncesNewAndChangedRows()
     QCOMPARE(rowsOf(model), referenceRows(readTestFile(m_path)));
 }
 
-void TestDhcpdLeasesModel::updateAnnouncesMuchAsAReset()
+void DhcpdLeasesModelTest::updateAnnouncesMuchAsAReset()
 {
     DhcpdLeasesModel model;
     QByteArray blocks;
-    for (int i{0}; i < 200; ++i) {
+    for (int i{0}; i < 200; ++i)
         blocks += leaseBlock(i % 2, i, i);
-    }
     writeTestFile(m_path, blocks);
     model.reload(m_path);
     const QSignalSpy resets{&model, &QAbstractItemModel::modelReset};
     const QSignalSpy inserted{&model, &QAbstractItemModel::rowsInserted};
     const QSignalSpy changed{&model, &QAbstractItemModel::dataChanged};
     QByteArray more;
-    for (int i{0}; i < 200; ++i) {
+    for (int i{0}; i < 200; ++i)
         more += leaseBlock(i % 3, i, 2 * i);
-    }
     appendTo(m_path, more);
     model.update(m_path);
     QCOMPARE(resets.size(), 1);
@@ -394,7 +386,7 @@ void TestDhcpdLeasesModel::updateAnnouncesMuchAsAReset()
     QCOMPARE(rowsOf(model), referenceRows(blocks + more));
 }
 
-void TestDhcpdLeasesModel::updateOfAnUnchangedFileSaysNothing()
+void DhcpdLeasesModelTest::updateOfAnUnchangedFileSaysNothing()
 {
     DhcpdLeasesModel model;
     writeTestFile(m_path, leaseBlock(0, 1, 1));
@@ -406,21 +398,19 @@ void TestDhcpdLeasesModel::updateOfAnUnchangedFileSaysNothing()
     QCOMPARE(model.rowCount(), 1);
 }
 
-void TestDhcpdLeasesModel::updateReadsTheWholeOfAnotherFile_data()
+void DhcpdLeasesModelTest::updateReadsTheWholeOfAnotherFile_data()
 {
     QTest::addColumn<QString>("change");
-    for (const char *change : {"replaced", "shorter", "other head", "other end", "other sample"}) {
+    for (const char *change : {"replaced", "shorter", "other head", "other end", "other sample"})
         QTest::addRow("%s", change) << text(change);
-    }
 }
 
-void TestDhcpdLeasesModel::updateReadsTheWholeOfAnotherFile()
+void DhcpdLeasesModelTest::updateReadsTheWholeOfAnotherFile()
 {
     QFETCH(const QString, change);
     QByteArray file;
-    while (file.size() < 3'000'000) {
+    while (file.size() < 3'000'000)
         file += leaseBlock(0, 1, 1) + "# " + QByteArray(100'000, 'x') + "\n";
-    }
     file += leaseBlock(0, 2, 2);
     writeTestFile(m_path, file);
     DhcpdLeasesModel model;
@@ -429,17 +419,16 @@ void TestDhcpdLeasesModel::updateReadsTheWholeOfAnotherFile()
     const QSignalSpy resets{&model, &QAbstractItemModel::modelReset};
     const QSignalSpy inserted{&model, &QAbstractItemModel::rowsInserted};
 
-    if (change == text("replaced")) {
+    if (change == text("replaced"))
         replace(m_path, file + leaseBlock(0, 3, 3));
-    } else if (change == text("shorter")) {
+    else if (change == text("shorter"))
         QVERIFY(QFile::resize(m_path, file.size() - 1));
-    } else if (change == text("other head")) {
+    else if (change == text("other head"))
         overwrite(m_path, 100, "X");
-    } else if (change == text("other end")) {
+    else if (change == text("other end"))
         overwrite(m_path, file.size() - 100, "X");
-    } else {
+    else
         overwrite(m_path, 2 << 20, "XXXX");
-    }
     model.update(m_path);
     QCOMPARE(resets.size(), 1);
     QCOMPARE(inserted.size(), 0);
@@ -447,7 +436,7 @@ void TestDhcpdLeasesModel::updateReadsTheWholeOfAnotherFile()
 }
 
 /// Whatever happens to the file between two updates, the model shows what a whole reading does.
-void TestDhcpdLeasesModel::updateEqualsReload()
+void DhcpdLeasesModelTest::updateEqualsReload()
 {
     QRandomGenerator random{5};
     DhcpdLeasesModel model;
@@ -456,7 +445,7 @@ void TestDhcpdLeasesModel::updateEqualsReload()
     writeTestFile(m_path, leaseBlock(0, 1, 1));
     constexpr int steps{1500};
     for (int step{0}; step < steps; ++step) {
-        const QByteArray bytes{random.bounded(2) == 0 ? oddLeaseFile(random)
+        const QByteArray bytes{random.bounded(2) == 0 ? irregularLeaseFile(random)
                                                       : leaseBlock(random.bounded(2), random.bounded(20), step)};
         switch (random.bounded(12)) {
         case 0:
@@ -469,7 +458,7 @@ void TestDhcpdLeasesModel::updateEqualsReload()
             writeTestFile(m_path, bytes); // truncated and written anew
             break;
         case 3: // while nobody looks, truncated and written beyond where it was
-            writeTestFile(m_path, oddLeaseFile(random) + readTestFile(m_path) + bytes);
+            writeTestFile(m_path, irregularLeaseFile(random) + readTestFile(m_path) + bytes);
             break;
         case 4:
         case 5: // not at the end of a line
@@ -485,5 +474,5 @@ void TestDhcpdLeasesModel::updateEqualsReload()
     QVERIFY(resets.size() < steps * 3 / 4);
 }
 
-QTEST_GUILESS_MAIN(TestDhcpdLeasesModel)
+QTEST_GUILESS_MAIN(DhcpdLeasesModelTest)
 #include "tst_dhcpdleasesmodel.moc"

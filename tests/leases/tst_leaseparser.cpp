@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leaseparser.h"
 #include "leases/leasetable.h"
-#include "tests/leases/oddleases.h"
+#include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
+#include "tests/support/text.h"
 
 #include <QRandomGenerator>
 #include <QTest>
@@ -15,13 +16,10 @@ namespace {
 QStringList row(const QString &address, const QMap<int, QString> &values = {})
 {
     QStringList texts{address, {}, {}, {}, {}, {}};
-    for (auto value{values.cbegin()}; value != values.cend(); ++value) {
+    for (auto value = values.cbegin(); value != values.cend(); ++value)
         texts[value.key()] = *value;
-    }
     return texts;
 }
-
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
 
 enum Column
 {
@@ -34,7 +32,7 @@ enum Column
 
 } // namespace
 
-class TestLeaseParser final : public QObject
+class LeaseParserTest final : public QObject
 {
     Q_OBJECT
 
@@ -54,7 +52,7 @@ private slots:
     void sortsInBetweenWithoutLoss();
 };
 
-void TestLeaseParser::readsWholeFiles_data()
+void LeaseParserTest::readsWholeFiles_data()
 {
     QTest::addColumn<QByteArray>("file");
     QTest::addColumn<LeaseRows>("rows");
@@ -108,7 +106,7 @@ void TestLeaseParser::readsWholeFiles_data()
         << LeaseRows{row(text("10.0.0.1"))};
 }
 
-void TestLeaseParser::readsWholeFiles()
+void LeaseParserTest::readsWholeFiles()
 {
     QFETCH(const QByteArray, file);
     QFETCH(const LeaseRows, rows);
@@ -116,15 +114,15 @@ void TestLeaseParser::readsWholeFiles()
     QCOMPARE(referenceRows(file), rows);
 }
 
-void TestLeaseParser::readsALineOfABlock_data()
+void LeaseParserTest::readsALineOfABlock_data()
 {
     QTest::addColumn<QByteArray>("line");
     QTest::addColumn<int>("column");
     QTest::addColumn<QString>("shown");
 
-    const auto addRow{[](int column, const char *line, const char *shown) {
+    const auto addRow = [](int column, const char *line, const char *shown) {
         QTest::addRow("%s", line) << QByteArray{line} << column << QString::fromUtf8(shown);
-    }};
+    };
     addRow(Mac, "  hardware ethernet 00:0c:01:02:03:04;", "00:0c:01:02:03:04");
     addRow(Mac, "  hardware token-ring aa:bb;", "aa:bb");
     addRow(Mac, "  hardware ethernet 00:0c", "00:0");
@@ -195,7 +193,7 @@ void TestLeaseParser::readsALineOfABlock_data()
 
 /// The line stands in the second of two blocks, of which the first has "-" or a known time in all columns: a line that
 /// is ignored leaves what the block before had.
-void TestLeaseParser::readsALineOfABlock()
+void LeaseParserTest::readsALineOfABlock()
 {
     QFETCH(const QByteArray, line);
     QFETCH(const int, column);
@@ -206,21 +204,20 @@ void TestLeaseParser::readsALineOfABlock()
         line + "\n}\n"};
     const LeaseRows rows{parsedRows(file)};
     QCOMPARE(rows.size(), 2);
-    if (shown == QLatin1String{"-"}) {
+    if (shown == QLatin1String{"-"})
         shown = rows[0][column];
-    }
     QCOMPARE(rows[1][column], shown);
     QCOMPARE(rows, referenceRows(file));
 }
 
-void TestLeaseParser::readsTheAddress_data()
+void LeaseParserTest::readsTheAddress_data()
 {
     QTest::addColumn<QByteArray>("line");
     QTest::addColumn<QString>("shown");
 
-    const auto addRow{[](const char *line, const char *shown) {
+    const auto addRow = [](const char *line, const char *shown) {
         QTest::addRow("%s", line) << QByteArray{line} << QString::fromUtf8(shown);
-    }};
+    };
     addRow("lease 10.0.0.1 {", "10.0.0.1");
     addRow("lease 255.255.255.255 {", "255.255.255.255");
     addRow("lease 0.0.0.0 {", "0.0.0.0");
@@ -248,7 +245,7 @@ void TestLeaseParser::readsTheAddress_data()
     addRow("host ten.example.com {", "");
 }
 
-void TestLeaseParser::readsTheAddress()
+void LeaseParserTest::readsTheAddress()
 {
     QFETCH(const QByteArray, line);
     QFETCH(const QString, shown);
@@ -257,21 +254,21 @@ void TestLeaseParser::readsTheAddress()
     QCOMPARE(rows, referenceRows(line + "\n}\n"));
 }
 
-void TestLeaseParser::agreesWithTheReference()
+void LeaseParserTest::agreesWithTheReference()
 {
     QRandomGenerator random{20'261'121};
     for (int i{0}; i < 6000; ++i) {
-        const QByteArray file{oddLeaseFile(random)};
+        const QByteArray file{irregularLeaseFile(random)};
         const LeaseRows rows{parsedRows(file)};
         QVERIFY2(rows == referenceRows(file), file.constData());
     }
 }
 
-void TestLeaseParser::readsTheSameInPieces()
+void LeaseParserTest::readsTheSameInPieces()
 {
     QRandomGenerator random{1};
     for (int i{0}; i < 8; ++i) {
-        const QByteArray file{oddLeaseFile(random)};
+        const QByteArray file{irregularLeaseFile(random)};
         const LeaseRows whole{parsedRows(file)};
         QVector<int> everywhere;
         for (int place{0}; place <= file.size(); ++place) {
@@ -282,23 +279,22 @@ void TestLeaseParser::readsTheSameInPieces()
     }
 }
 
-void TestLeaseParser::readsTheSameCutAnywhere()
+void LeaseParserTest::readsTheSameCutAnywhere()
 {
     QRandomGenerator random{2};
     for (int i{0}; i < 8; ++i) {
-        const QByteArray file{oddLeaseFile(random)};
-        for (int size{0}; size <= file.size(); ++size) {
+        const QByteArray file{irregularLeaseFile(random)};
+        for (int size{0}; size <= file.size(); ++size)
             QVERIFY2(parsedRows(file.left(size)) == referenceRows(file.left(size)), file.left(size).constData());
-        }
     }
 }
 
-void TestLeaseParser::continuesAfterTheEnd()
+void LeaseParserTest::continuesAfterTheEnd()
 {
     QRandomGenerator random{3};
     int continued{0};
     for (int i{0}; i < 200; ++i) {
-        const QByteArray file{oddLeaseFile(random)};
+        const QByteArray file{irregularLeaseFile(random)};
         const int size{random.bounded(file.size() + 1)};
         LeaseTable table;
         LeaseParser parser{table};
@@ -306,9 +302,8 @@ void TestLeaseParser::continuesAfterTheEnd()
         parser.finish();
         table.settleAll();
         QCOMPARE(rowsOf(table), referenceRows(file.left(size)));
-        if (!parser.canContinue()) {
+        if (!parser.canContinue())
             continue;
-        }
         ++continued;
         parser.feed({file.constData() + size, static_cast<std::size_t>(file.size() - size)});
         parser.finish();
@@ -319,16 +314,16 @@ void TestLeaseParser::continuesAfterTheEnd()
 }
 
 /// The line that is cut sets the end of the lease; as a whole it sets the state instead.
-void TestLeaseParser::finishesOnceUntilMoreIsFed()
+void LeaseParserTest::finishesOnceUntilMoreIsFed()
 {
     const QByteArray first{"lease 10.0.0.1 {\n  ends 6 2026/11/21 01:15:30;\n}\nlease 10.0.0.2 {\n"};
     const QByteArray cut{"  ends 6 2026/11/22 01:15:30;"};
     const QByteArray rest{" binding state\n}\n"};
     LeaseTable table;
     LeaseParser parser{table};
-    const auto feed{[&parser](const QByteArray &text) {
+    const auto feed = [&parser](const QByteArray &text) {
         parser.feed({text.constData(), static_cast<std::size_t>(text.size())});
-    }};
+    };
     feed(first + cut);
     parser.finish();
     parser.finish();
@@ -349,7 +344,7 @@ void TestLeaseParser::finishesOnceUntilMoreIsFed()
     QVERIFY(!table.hasPending());
 }
 
-void TestLeaseParser::readsVeryLongTexts()
+void LeaseParserTest::readsVeryLongTexts()
 {
     for (const int size : {254, 255, 256, 70'000}) {
         const QByteArray name(size, 'x');
@@ -363,14 +358,13 @@ void TestLeaseParser::readsVeryLongTexts()
 }
 
 /// More blocks than are kept until they are sorted, of few addresses.
-void TestLeaseParser::sortsInBetweenWithoutLoss()
+void LeaseParserTest::sortsInBetweenWithoutLoss()
 {
     LeaseTable table;
     LeaseParser parser{table};
     QByteArray piece;
-    for (int i{0}; i < 4096; ++i) {
+    for (int i{0}; i < 4096; ++i)
         piece += "lease 10.0.1." + QByteArray::number(i % 200) + " {\n}\n";
-    }
     for (int i{0}; i < 400; ++i) {
         parser.feed({piece.constData(), static_cast<std::size_t>(piece.size())});
         const QByteArray other{leaseBlock(i / 200, i % 200, i)};
@@ -388,5 +382,5 @@ void TestLeaseParser::sortsInBetweenWithoutLoss()
     QCOMPARE(rows[399][Host], text("host-399"));
 }
 
-QTEST_GUILESS_MAIN(TestLeaseParser)
+QTEST_GUILESS_MAIN(LeaseParserTest)
 #include "tst_leaseparser.moc"

@@ -2,10 +2,11 @@
 #include "leases/leaseproxymodel.h"
 
 #include "leases/dhcpdleasesmodel.h"
-#include "tests/leases/oddleases.h"
+#include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/leases/variedleases.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QAbstractItemModelTester>
 #include <QFile>
@@ -16,8 +17,6 @@
 #include <QTest>
 
 namespace {
-
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
 
 /// The filter that Qt has, for comparison.
 class StockFilter final : public QSortFilterProxyModel
@@ -39,7 +38,7 @@ void appendTo(const QString &path, const QByteArray &bytes)
 
 } // namespace
 
-class TestLeaseProxyModel final : public QObject
+class LeaseProxyModelTest final : public QObject
 {
     Q_OBJECT
 
@@ -51,7 +50,7 @@ private slots:
     void filtersInOneReset();
     void sameTextChangesNothing();
     void persistentIndexesDoNotOutliveAFilter();
-    void heedsTheBaseFilter();
+    void respectsTheBaseFilter();
     void matchesAsQtDoes();
     void matchesInAFilteredTableAsQtDoes();
     void matchesInASortedTableAsQtDoes();
@@ -74,7 +73,7 @@ private:
     std::unique_ptr<LeaseProxyModel> m_proxy;
 };
 
-void TestLeaseProxyModel::init()
+void LeaseProxyModelTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     m_path = m_folder->filePath(text("dhcpd.leases"));
@@ -83,19 +82,19 @@ void TestLeaseProxyModel::init()
     m_proxy->setSourceModel(m_model.get());
 }
 
-void TestLeaseProxyModel::cleanup()
+void LeaseProxyModelTest::cleanup()
 {
     m_proxy.reset();
     m_model.reset();
 }
 
-void TestLeaseProxyModel::load(const QByteArray &bytes)
+void LeaseProxyModelTest::load(const QByteArray &bytes)
 {
     writeTestFile(m_path, bytes);
     m_model->reload(m_path);
 }
 
-void TestLeaseProxyModel::filtersAsQtDoes()
+void LeaseProxyModelTest::filtersAsQtDoes()
 {
     QRandomGenerator random{1};
     load(variedLeaseFile(random, 120));
@@ -110,7 +109,7 @@ void TestLeaseProxyModel::filtersAsQtDoes()
     QCOMPARE(rowsOf(*m_proxy), rowsOf(*m_model));
 }
 
-void TestLeaseProxyModel::filtersInOneReset()
+void LeaseProxyModelTest::filtersInOneReset()
 {
     load(leaseBlock(0, 1, 0) + leaseBlock(0, 2, 1) + leaseBlock(0, 3, 2));
     QCOMPARE(m_proxy->rowCount(), 3);
@@ -131,7 +130,7 @@ void TestLeaseProxyModel::filtersInOneReset()
     QCOMPARE(layouts, 0);
 }
 
-void TestLeaseProxyModel::sameTextChangesNothing()
+void LeaseProxyModelTest::sameTextChangesNothing()
 {
     load(leaseBlock(0, 1, 0));
     const QSignalSpy reset{m_proxy.get(), &QAbstractItemModel::modelReset};
@@ -142,7 +141,7 @@ void TestLeaseProxyModel::sameTextChangesNothing()
     QCOMPARE(reset.count(), 1);
 }
 
-void TestLeaseProxyModel::persistentIndexesDoNotOutliveAFilter()
+void LeaseProxyModelTest::persistentIndexesDoNotOutliveAFilter()
 {
     load(leaseBlock(0, 1, 0) + leaseBlock(0, 2, 1));
     const QPersistentModelIndex index{m_proxy->index(1, 2)};
@@ -152,14 +151,14 @@ void TestLeaseProxyModel::persistentIndexesDoNotOutliveAFilter()
     QCOMPARE(m_proxy->index(0, 2).data().toString(), text("host-1"));
 }
 
-void TestLeaseProxyModel::heedsTheBaseFilter()
+void LeaseProxyModelTest::respectsTheBaseFilter()
 {
     QRandomGenerator random{2};
     load(variedLeaseFile(random, 60));
-    QSortFilterProxyModel *const base{m_proxy.get()};
+    QSortFilterProxyModel *base{m_proxy.get()};
     base->setFilterKeyColumn(-1);
     StockFilter stock{m_model.get()};
-    for (const char *const wanted : {"1", "free", "", "active", "7"}) {
+    for (const char *wanted : {"1", "free", "", "active", "7"}) {
         base->setFilterFixedString(text(wanted));
         stock.setFilterFixedString(text(wanted));
         QCOMPARE(rowsOf(*m_proxy), rowsOf(stock));
@@ -177,7 +176,7 @@ void TestLeaseProxyModel::heedsTheBaseFilter()
 }
 
 /// Compares what match() finds with what Qt's own finds, from random places on.
-void TestLeaseProxyModel::compareMatches(QRandomGenerator &random, const QString &wanted)
+void LeaseProxyModelTest::compareMatches(QRandomGenerator &random, const QString &wanted)
 {
     const Qt::MatchFlags contains{Qt::MatchContains};
     for (const Qt::MatchFlags flags :
@@ -192,16 +191,15 @@ void TestLeaseProxyModel::compareMatches(QRandomGenerator &random, const QString
     }
 }
 
-void TestLeaseProxyModel::matchesAsQtDoes()
+void LeaseProxyModelTest::matchesAsQtDoes()
 {
     QRandomGenerator random{3};
     load(variedLeaseFile(random, 100));
-    for (const QString &wanted : searchTexts(random, *m_model, 250)) {
+    for (const QString &wanted : searchTexts(random, *m_model, 250))
         compareMatches(random, wanted);
-    }
 }
 
-void TestLeaseProxyModel::matchesInAFilteredTableAsQtDoes()
+void LeaseProxyModelTest::matchesInAFilteredTableAsQtDoes()
 {
     QRandomGenerator random{4};
     load(variedLeaseFile(random, 100));
@@ -213,31 +211,30 @@ void TestLeaseProxyModel::matchesInAFilteredTableAsQtDoes()
     }
 }
 
-void TestLeaseProxyModel::matchesInASortedTableAsQtDoes()
+void LeaseProxyModelTest::matchesInASortedTableAsQtDoes()
 {
     QRandomGenerator random{5};
     load(variedLeaseFile(random, 60));
     m_proxy->sort(DhcpdLeasesModel::HostName, Qt::DescendingOrder);
-    for (const QString &wanted : searchTexts(random, *m_model, 80)) {
+    for (const QString &wanted : searchTexts(random, *m_model, 80))
         compareMatches(random, wanted);
-    }
     m_proxy->sort(-1);
     compareMatches(random, text("1"));
 }
 
-void TestLeaseProxyModel::matchesOtherwiseAsQtDoes()
+void LeaseProxyModelTest::matchesOtherwiseAsQtDoes()
 {
     QRandomGenerator random{6};
     load(variedLeaseFile(random, 60));
     const QModelIndex first{m_proxy->index(0, DhcpdLeasesModel::State)};
-    const auto compare{
-        [this](const QModelIndex &start, int role, const QVariant &value, int hits, Qt::MatchFlags flags) {
-            const QModelIndexList expected{m_proxy->QSortFilterProxyModel::match(start, role, value, hits, flags)};
-            QCOMPARE(m_proxy->match(start, role, value, hits, flags), expected);
-            return;
-        }};
+    const auto compare = [this](const QModelIndex &start, int role, const QVariant &value, int hits,
+                                Qt::MatchFlags flags) {
+        const QModelIndexList expected{m_proxy->QSortFilterProxyModel::match(start, role, value, hits, flags)};
+        QCOMPARE(m_proxy->match(start, role, value, hits, flags), expected);
+        return;
+    };
     const Qt::MatchFlags contains{Qt::MatchContains};
-    for (const char *const wanted : {"", "a", "active"}) {
+    for (const char *wanted : {"", "a", "active"}) {
         compare({}, Qt::DisplayRole, text(wanted), -1, contains);
         compare({}, Qt::DisplayRole, text(wanted), 1, contains | Qt::MatchRecursive | Qt::MatchWrap);
         compare(first, Qt::EditRole, text(wanted), -1, contains);
@@ -255,16 +252,15 @@ void TestLeaseProxyModel::matchesOtherwiseAsQtDoes()
     QVERIFY(m_proxy->match(first, Qt::DisplayRole, text("ACTIVE"), -1, contains | Qt::MatchCaseSensitive).isEmpty());
 }
 
-void TestLeaseProxyModel::followsUpdates_data()
+void LeaseProxyModelTest::followsUpdates_data()
 {
     QTest::addColumn<QString>("wanted");
-    for (const char *const wanted : {"", "active", "host-1", "10.0.1", "12 U", "nothing"}) {
+    for (const char *wanted : {"", "active", "host-1", "10.0.1", "12 U", "nothing"})
         QTest::addRow("'%s'", wanted) << text(wanted);
-    }
 }
 
 /// Leases that are added, and others that match no more, or now.
-void TestLeaseProxyModel::followsUpdates()
+void LeaseProxyModelTest::followsUpdates()
 {
     QFETCH(const QString, wanted);
     QRandomGenerator random{7};
@@ -293,15 +289,15 @@ void TestLeaseProxyModel::followsUpdates()
 }
 
 /// A text that only the newest lease has, looked for before and after that came.
-void TestLeaseProxyModel::findsTextsThatAreNew()
+void LeaseProxyModelTest::findsTextsThatAreNew()
 {
     load(leaseBlock(0, 1, 1));
-    const auto found{[this] {
+    const auto found = [this] {
         return m_proxy
             ->match(m_proxy->index(0, DhcpdLeasesModel::HostName), Qt::DisplayRole, text("laptop"), -1,
                     Qt::MatchContains)
             .size();
-    }};
+    };
     QCOMPARE(found(), 0);
     appendTo(m_path, leaseBlock(0, 1, 2).replace("host-2", "laptop"));
     m_model->update(m_path);
@@ -309,7 +305,7 @@ void TestLeaseProxyModel::findsTextsThatAreNew()
     QCOMPARE(found(), 1);
 }
 
-void TestLeaseProxyModel::followsReloads()
+void LeaseProxyModelTest::followsReloads()
 {
     QRandomGenerator random{8};
     StockFilter stock{m_model.get()};
@@ -318,15 +314,14 @@ void TestLeaseProxyModel::followsReloads()
     for (int i{0}; i < 20; ++i) {
         load(variedLeaseFile(random, random.bounded(100)));
         QCOMPARE(rowsOf(*m_proxy), rowsOf(stock));
-        if (m_model->rowCount() > 0) {
+        if (m_model->rowCount() > 0)
             compareMatches(random, text("HOST"));
-        }
     }
     load({});
     QCOMPARE(m_proxy->rowCount(), 0);
 }
 
-void TestLeaseProxyModel::followsAnotherModel()
+void LeaseProxyModelTest::followsAnotherModel()
 {
     load(leaseBlock(0, 1, 0) + leaseBlock(0, 2, 1));
     m_proxy->setFilterFixedString(text("free"));
@@ -344,7 +339,7 @@ void TestLeaseProxyModel::followsAnotherModel()
     QCOMPARE(m_proxy->rowCount(), 0);
 }
 
-void TestLeaseProxyModel::outlivesItsModel()
+void LeaseProxyModelTest::outlivesItsModel()
 {
     load(leaseBlock(0, 1, 0));
     m_proxy->setFilterFixedString(text("active"));
@@ -357,17 +352,16 @@ void TestLeaseProxyModel::outlivesItsModel()
 }
 
 /// A model that is no lease table is filtered by the base alone.
-void TestLeaseProxyModel::filtersOtherModels()
+void LeaseProxyModelTest::filtersOtherModels()
 {
     QStandardItemModel other;
-    for (const char *const item : {"one", "two", "three"}) {
+    for (const char *item : {"one", "two", "three"})
         other.appendRow(new QStandardItem{text(item)});
-    }
     m_proxy->setSourceModel(&other);
     m_proxy->setFilterFixedString(text("t"));
     QCOMPARE(m_proxy->rowCount(), 2);
     QCOMPARE(m_proxy->match(m_proxy->index(0, 0), Qt::DisplayRole, text("W"), -1, Qt::MatchContains).size(), 1);
 }
 
-QTEST_GUILESS_MAIN(TestLeaseProxyModel)
+QTEST_GUILESS_MAIN(LeaseProxyModelTest)
 #include "tst_leaseproxymodel.moc"

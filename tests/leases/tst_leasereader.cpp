@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasereader.h"
+
+#include "leases/leasefile.h"
 #include "leases/leasetable.h"
-#include "tests/leases/oddleases.h"
+#include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
 
@@ -10,7 +12,7 @@
 #include <QTest>
 
 /// Files that change between being opened and being read.
-class TestLeaseReader final : public QObject
+class LeaseReaderTest final : public QObject
 {
     Q_OBJECT
 
@@ -31,14 +33,14 @@ private:
     LeaseReader m_reader{m_table};
 };
 
-void TestLeaseReader::init()
+void LeaseReaderTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     m_path = m_folder->filePath(QStringLiteral("dhcpd.leases"));
     m_reader.clear();
 }
 
-void TestLeaseReader::readsAsMuchAsThereWasWhenOpened()
+void LeaseReaderTest::readsAsMuchAsThereWasWhenOpened()
 {
     const QByteArray before{leaseBlock(0, 1, 1)};
     const QByteArray after{before + leaseBlock(0, 2, 2)};
@@ -57,15 +59,14 @@ void TestLeaseReader::readsAsMuchAsThereWasWhenOpened()
     QCOMPARE(rowsOf(m_table), referenceRows(after));
 }
 
-void TestLeaseReader::endsWhereTheFileWasCut_data()
+void LeaseReaderTest::endsWhereTheFileWasCut_data()
 {
     QTest::addColumn<int>("size");
-    for (const int size : {0, 1, 100, 270, 300}) {
+    for (const int size : {0, 1, 100, 270, 300})
         QTest::addRow("%d bytes", size) << size;
-    }
 }
 
-void TestLeaseReader::endsWhereTheFileWasCut()
+void LeaseReaderTest::endsWhereTheFileWasCut()
 {
     QFETCH(const int, size);
     const QByteArray text{leaseBlock(0, 1, 1) + leaseBlock(0, 2, 2)};
@@ -78,7 +79,7 @@ void TestLeaseReader::endsWhereTheFileWasCut()
     QCOMPARE(rowsOf(m_table), referenceRows(text.left(size)));
 }
 
-void TestLeaseReader::readsTheOpenedFileAfterItWasReplaced()
+void LeaseReaderTest::readsTheOpenedFileAfterItWasReplaced()
 {
     const QByteArray text{leaseBlock(0, 1, 1)};
     writeTestFile(m_path, text);
@@ -91,7 +92,7 @@ void TestLeaseReader::readsTheOpenedFileAfterItWasReplaced()
     QVERIFY(!m_reader.continues(LeaseFile{m_path}));
 }
 
-void TestLeaseReader::isNotContinuedByAnother()
+void LeaseReaderTest::isNotContinuedByAnother()
 {
     writeTestFile(m_path, leaseBlock(0, 1, 1));
     QVERIFY(!m_reader.continues(LeaseFile{m_path})); // nothing was read yet
@@ -106,7 +107,7 @@ void TestLeaseReader::isNotContinuedByAnother()
     QCOMPARE(m_table.size(), 0);
 }
 
-void TestLeaseReader::noticesChangesInWhatCameInSmallPieces_data()
+void LeaseReaderTest::noticesChangesInWhatCameInSmallPieces_data()
 {
     constexpr int sampleDistance{1 << 20};
     QTest::addColumn<QVector<int>>("sizes"); // of the file each time that it is read
@@ -117,7 +118,7 @@ void TestLeaseReader::noticesChangesInWhatCameInSmallPieces_data()
                             << sampleDistance + 40;
 }
 
-void TestLeaseReader::noticesChangesInWhatCameInSmallPieces()
+void LeaseReaderTest::noticesChangesInWhatCameInSmallPieces()
 {
     QFETCH(const QVector<int>, sizes);
     QFETCH(const int, changed);
@@ -133,5 +134,5 @@ void TestLeaseReader::noticesChangesInWhatCameInSmallPieces()
     QVERIFY(!m_reader.continues(LeaseFile{m_path}));
 }
 
-QTEST_GUILESS_MAIN(TestLeaseReader)
+QTEST_GUILESS_MAIN(LeaseReaderTest)
 #include "tst_leasereader.moc"

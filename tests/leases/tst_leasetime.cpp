@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasetime.h"
 
+#include "leases/leasetimetexts.h"
+#include "leases/timeofdaytexts.h"
+
 #include <QDateTime>
 #include <QRandomGenerator>
 #include <QTest>
@@ -35,7 +38,7 @@ private:
 
 } // namespace
 
-class TestLeaseTime final : public QObject
+class LeaseTimeTest final : public QObject
 {
     Q_OBJECT
 
@@ -55,9 +58,9 @@ private slots:
     void knowsAllTimesOfDayInAllLocales();
 };
 
-void TestLeaseTime::cleanup() { QLocale::setDefault(QLocale::c()); }
+void LeaseTimeTest::cleanup() { QLocale::setDefault(QLocale::c()); }
 
-void TestLeaseTime::takesWhatQtTakes()
+void LeaseTimeTest::takesWhatQtTakes()
 {
     const QString characters{QStringLiteral("0123456789/: -+.aT\t") + QChar{0x663} + QChar{0xA0} + QChar{0}};
     QRandomGenerator random{4};
@@ -79,9 +82,8 @@ void TestLeaseTime::takesWhatQtTakes()
             }
         }
         const QStringList words{text.split(QLatin1Char{' '})};
-        if (words.size() != 2) {
+        if (words.size() != 2)
             continue;
-        }
         const QDateTime expected{QDateTime::fromString(text, QStringLiteral("yyyy/MM/dd hh:mm:ss"))};
         const LeaseTime time{parsed(words[0].toUtf8(), words[1].toUtf8())};
         QVERIFY2(time.isValid() == expected.isValid(), qPrintable(text));
@@ -102,7 +104,7 @@ void TestLeaseTime::takesWhatQtTakes()
 }
 
 /// Every byte at every place of a text of the usual layout.
-void TestLeaseTime::knowsTheUsualLayout()
+void LeaseTimeTest::knowsTheUsualLayout()
 {
     const QByteArray usual{"2024/02/28 19:45:30"};
     QCOMPARE(usual.size(), int{LeaseTime::usualLength});
@@ -117,7 +119,7 @@ void TestLeaseTime::knowsTheUsualLayout()
     }
 }
 
-void TestLeaseTime::isShownAsItStands_data()
+void LeaseTimeTest::isShownAsItStands_data()
 {
     QTest::addColumn<QByteArray>("zone");
     QTest::addColumn<QByteArray>("date");
@@ -127,7 +129,7 @@ void TestLeaseTime::isShownAsItStands_data()
     QTest::addRow("UTC") << QByteArray{"UTC"} << QByteArray{"2026/03/29"};
 }
 
-void TestLeaseTime::isShownAsItStands()
+void LeaseTimeTest::isShownAsItStands()
 {
     QFETCH(const QByteArray, zone);
     QFETCH(const QByteArray, date);
@@ -141,14 +143,14 @@ void TestLeaseTime::isShownAsItStands()
 }
 
 /// Also where a number of seconds since 1970 would be negative, or more than 31 or 32 bits hold.
-void TestLeaseTime::isShownInAnyYear_data()
+void LeaseTimeTest::isShownInAnyYear_data()
 {
     QTest::addColumn<QByteArray>("date");
     QTest::addColumn<QByteArray>("time");
     QTest::addColumn<QString>("text");
-    const auto addRow{[](const char *date, const char *time, const char *text) {
+    const auto addRow = [](const char *date, const char *time, const char *text) {
         QTest::addRow("%s %s", date, time) << QByteArray{date} << QByteArray{time} << QString::fromUtf8(text);
-    }};
+    };
     addRow("0001/01/01", "00:00:00", "00:00:00 UTC 1 Jan 0001");
     addRow("1901/12/13", "20:45:51", "20:45:51 UTC 13 Dec 1901");
     addRow("1969/12/31", "23:59:59", "23:59:59 UTC 31 Dec 1969");
@@ -159,7 +161,7 @@ void TestLeaseTime::isShownInAnyYear_data()
     addRow("0000/01/01", "00:00:00", "");
 }
 
-void TestLeaseTime::isShownInAnyYear()
+void LeaseTimeTest::isShownInAnyYear()
 {
     QFETCH(const QByteArray, date);
     QFETCH(const QByteArray, time);
@@ -168,15 +170,14 @@ void TestLeaseTime::isShownInAnyYear()
     QCOMPARE(LeaseTimeTexts{}.text(LeaseTime::fromUsualLayout((date + ' ' + time).constData())), text);
 }
 
-void TestLeaseTime::isShownInTheDefaultLocale_data()
+void LeaseTimeTest::isShownInTheDefaultLocale_data()
 {
     QTest::addColumn<QString>("locale");
-    for (const char *locale : {"C", "en_US", "en_GB", "de_DE", "ru_RU", "ar_EG", "ja_JP"}) {
+    for (const char *locale : {"C", "en_US", "en_GB", "de_DE", "ru_RU", "ar_EG", "ja_JP"})
         QTest::addRow("%s", locale) << QString::fromLatin1(locale);
-    }
 }
 
-void TestLeaseTime::isShownInTheDefaultLocale()
+void LeaseTimeTest::isShownInTheDefaultLocale()
 {
     QFETCH(const QString, locale);
     QLocale::setDefault(QLocale{locale});
@@ -187,14 +188,14 @@ void TestLeaseTime::isShownInTheDefaultLocale()
                  QLocale{locale}.toString(date, QLocale::NarrowFormat));
 }
 
-void TestLeaseTime::hasNoTextIfInvalid()
+void LeaseTimeTest::hasNoTextIfInvalid()
 {
     QVERIFY(!LeaseTime{}.isValid());
     QCOMPARE(LeaseTimeTexts{}.text(LeaseTime{}), QString{});
     QCOMPARE(LeaseTimeTexts{}.text(parsed("never", "")), QString{});
 }
 
-void TestLeaseTime::remembersNoWrongTexts()
+void LeaseTimeTest::remembersNoWrongTexts()
 {
     LeaseTimeTexts texts;
     const LeaseTime time{parsed("2026/01/02", "13:04:05")};
@@ -212,7 +213,7 @@ void TestLeaseTime::remembersNoWrongTexts()
     QCOMPARE(texts.text(time), german);
 }
 
-void TestLeaseTime::namesTheZoneAsItIsCalledNow()
+void LeaseTimeTest::namesTheZoneAsItIsCalledNow()
 {
     LeaseTimeTexts texts;
     const LeaseTime time{parsed("2026/01/02", "13:04:05")};
@@ -222,7 +223,7 @@ void TestLeaseTime::namesTheZoneAsItIsCalledNow()
     QTRY_COMPARE(texts.text(time), QStringLiteral("13:04:05 CEST 2 Jan 2026"));
 }
 
-void TestLeaseTime::knowsAllTimesOfDayInAllLocales()
+void LeaseTimeTest::knowsAllTimesOfDayInAllLocales()
 {
     QRandomGenerator random{5};
     const QList<QLocale> locales{
@@ -237,5 +238,5 @@ void TestLeaseTime::knowsAllTimesOfDayInAllLocales()
     }
 }
 
-QTEST_GUILESS_MAIN(TestLeaseTime)
+QTEST_GUILESS_MAIN(LeaseTimeTest)
 #include "tst_leasetime.moc"

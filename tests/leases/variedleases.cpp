@@ -51,31 +51,29 @@ QByteArray hostName(QRandomGenerator &random)
                                                 "1",
                                                 QByteArray(300, 'x')};
     QByteArray name;
-    for (int i{random.bounded(5)}; i >= 0; --i) {
+    for (int i{random.bounded(5)}; i >= 0; --i)
         name += oneOf(pieces, random);
-    }
     return name;
 }
 
 QByteArray address(QRandomGenerator &random)
 {
-    static const std::vector<QByteArray> odd{"::1", "::ffff:10.0.0.1", "peer", "fe80::7"};
-    if (random.bounded(40) == 0) {
-        return oneOf(odd, random);
-    }
-    const auto octet{[&random] { return QByteArray::number(random.bounded(256)); }};
+    static const std::vector<QByteArray> unusual{"::1", "::ffff:10.0.0.1", "peer", "fe80::7"};
+    if (random.bounded(40) == 0)
+        return oneOf(unusual, random);
+    const auto octet = [&random] { return QByteArray::number(random.bounded(256)); };
     return octet() + '.' + octet() + '.' + octet() + '.' + octet();
 }
 
 QByteArray time(QRandomGenerator &random)
 {
-    static const std::vector<QByteArray> odd{"never", "6 2026/02/30 11:00:00", "6 2026/11/21", "6 0001/01/01 00:00:00",
-                                             "6 9999/12/31 23:59:59"};
-    if (random.bounded(10) == 0) {
-        return oneOf(odd, random);
-    }
-    const auto number{
-        [&random](int from, int to) { return QByteArray::number(random.bounded(from, to)).rightJustified(2, '0'); }};
+    static const std::vector<QByteArray> unusual{"never", "6 2026/02/30 11:00:00", "6 2026/11/21",
+                                                 "6 0001/01/01 00:00:00", "6 9999/12/31 23:59:59"};
+    if (random.bounded(10) == 0)
+        return oneOf(unusual, random);
+    const auto number = [&random](int from, int to) {
+        return QByteArray::number(random.bounded(from, to)).rightJustified(2, '0');
+    };
     return "6 20" + number(19, 30) + '/' + number(1, 13) + '/' + number(1, 29) + ' ' + number(0, 24) + ':' +
            number(0, 60) + ':' + number(0, 60);
 }
@@ -89,12 +87,10 @@ QByteArray variedLeaseFile(QRandomGenerator &random, int blocks)
     for (int block{0}; block < blocks; ++block) {
         text += "lease " + address(random) + " {\n  starts " + time(random) + ";\n  ends " + time(random) + ";\n";
         text += "  binding state " + oneOf(states, random) + ";\n";
-        if (random.bounded(5) != 0) {
+        if (random.bounded(5) != 0)
             text += "  hardware ethernet 00:0c:" + QByteArray::number(random.bounded(16, 256), 16) + ":0A:1b;\n";
-        }
-        if (random.bounded(3) != 0) {
+        if (random.bounded(3) != 0)
             text += "  client-hostname \"" + hostName(random) + "\";\n";
-        }
         text += "}\n";
     }
     return text;

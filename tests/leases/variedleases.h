@@ -8,7 +8,7 @@ class QAbstractItemModel;
 class QRandomGenerator;
 
 /// The text of a lease file of so many blocks with few addresses in common, whose cells have what is hard to find:
-/// letters with odd cases, bytes of several encodings, long names, invalid times and addresses that are none of IPv4.
+/// letters whose other case is unusual, bytes of several encodings, long names, invalid times and addresses other than IPv4.
 QByteArray variedLeaseFile(QRandomGenerator &random, int blocks);
 
 /// Texts to look for in a table: parts of its cells, some with the case of their letters changed, and some that are

@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "leases/leasetable.h"
+
+#include <vector>
+
+/// The leases in which a search found its text; to be used until the leases change.
+class LeaseHits final
+{
+public:
+    explicit LeaseHits(const LeaseTable &table);
+
+    bool isEmpty() const { return m_isEmpty; }
+    bool contains(int row) const { return containsInFile(m_table->placeInFile(row)); }
+
+    /// The same by the place of a lease in the order of the file.
+    bool containsInFile(int place) const { return m_isHit[static_cast<std::size_t>(place)]; }
+    void addInFile(int place);
+
+private:
+    const LeaseTable *m_table;
+    std::vector<bool> m_isHit; // in the order of the file
+    bool m_isEmpty{true};
+};

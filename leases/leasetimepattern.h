@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include "leases/leaseneedle.h"
+#include "leases/leasetime.h"
+
+#include <QString>
+
+#include <array>
+#include <memory>
+#include <vector>
+
+class LeaseTimeTexts;
+
+/// Tells whether a needle is in the text of a time. Whether it is in, or which part of it ends or begins, a time of day
+/// or a date is found out once for each.
+class LeaseTimePattern final
+{
+public:
+    LeaseTimePattern(LeaseNeedle needle, LeaseTimeTexts &texts);
+
+    bool isIn(LeaseTime time) const { return time.isValid() && (timeOfDayFits(time) & dateFits(time) & ~known) != 0; }
+
+private:
+    /// The bit `known`, and one for each place that the needle can have in a text: in the time of day, in the date, and
+    /// over the separator with any of its own separators there.
+    using Fits = quint16; // small, for there are many
+    static constexpr unsigned known{1U};
+    static constexpr unsigned inTimeOfDay{2U};
+    static constexpr unsigned inDate{4U};
+    static constexpr unsigned firstSplit{8U};
+
+    /// What of the needle stands before and after the separator.
+    struct Split
+    {
+        QString before;
+        QString after;
+    };
+
+    // By month and day as they are in a key.
+    static constexpr std::size_t daysOfMonth{32};
+    using Year = std::array<Fits, 13 * daysOfMonth>;
+
+    Fits timeOfDayFits(LeaseTime time) const;
+    Fits dateFits(LeaseTime time) const;
+    template<typename FitsSplit>
+    Fits findFits(unsigned in, unsigned inOther, const QString &text, const FitsSplit &fitsSplit) const;
+
+    LeaseNeedle m_needle;
+    LeaseTimeTexts &m_texts;
+    std::vector<Split> m_splits;
+    mutable std::vector<Fits> m_timesOfDay;
+    mutable std::vector<std::unique_ptr<Year>> m_years;
+};

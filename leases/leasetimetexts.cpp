@@ -1,0 +1,55 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/leasetimetexts.h"
+
+#include <utility>
+
+namespace {
+
+// Far more days than a lease file names, and few enough to forget about their memory.
+constexpr int rememberedDates{10'000};
+
+} // namespace
+
+QString LeaseTimeTexts::text(LeaseTime time)
+{
+    return time.isValid() ? timeOfDayText(time) + separator + dateText(time) : QString{};
+}
+
+QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
+{
+    followLocale();
+    followZone();
+    if (!m_timesOfDay)
+        m_timesOfDay.emplace(m_locale);
+    return m_timesOfDay->text(time.time());
+}
+
+QString LeaseTimeTexts::dateText(LeaseTime time)
+{
+    followLocale();
+    if (m_dates.size() >= rememberedDates)
+        m_dates.clear();
+    auto text = m_dates.find(time.dateKey());
+    if (text == m_dates.end())
+        text = m_dates.insert(time.dateKey(), m_locale.toString(time.date(), QLocale::NarrowFormat));
+    return *text;
+}
+
+void LeaseTimeTexts::followLocale()
+{
+    if (const QLocale locale; locale != m_locale) {
+        m_locale = locale;
+        m_dates.clear();
+        m_timesOfDay.reset();
+    }
+}
+
+/// Once a second, which is when the name changes, for the locale takes microseconds to tell.
+void LeaseTimeTexts::followZone()
+{
+    const std::time_t now{std::time(nullptr)};
+    const QTime example{0, 0};
+    if (std::exchange(m_zoneChecked, now) != now && m_timesOfDay &&
+        m_timesOfDay->text(example) != m_locale.toString(example, QLocale::LongFormat))
+        m_timesOfDay.reset();
+}

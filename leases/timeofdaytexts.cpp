@@ -1,0 +1,59 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#include "leases/timeofdaytexts.h"
+
+#include <QLocale>
+
+#include <algorithm>
+#include <iterator>
+
+TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
+{
+    // Two numbers without a digit in common.
+    constexpr int number{11};
+    constexpr int otherNumber{22};
+    const auto text = [&locale](int hour, int minute, int second) {
+        return locale.toString(QTime{hour, minute, second}, QLocale::LongFormat);
+    };
+    for (std::size_t i{0}; i < m_hours.size(); ++i) {
+        const int hour{static_cast<int>(i)};
+        const QString example{text(hour, number, number)};
+        m_hours[i] = {example, difference(example, text(hour, otherNumber, number)),
+                      difference(example, text(hour, number, otherNumber))};
+    }
+    const Hour &first{m_hours.front()};
+    const auto numberIn = [&first](const QString &whole, Field field) {
+        return whole.mid(field.position, field.length + whole.size() - first.text.size());
+    };
+    for (std::size_t i{0}; i < m_minutes.size(); ++i) {
+        m_minutes[i] = numberIn(text(0, static_cast<int>(i), number), first.minute);
+        m_seconds[i] = numberIn(text(0, number, static_cast<int>(i)), first.second);
+    }
+}
+
+/// The part of `left` that is another in `right`, which is as long.
+TimeOfDayTexts::Field TimeOfDayTexts::difference(const QString &left, const QString &right)
+{
+    const auto begin = std::mismatch(left.cbegin(), left.cend(), right.cbegin(), right.cend()).first;
+    const auto end = std::mismatch(left.crbegin(), std::make_reverse_iterator(begin), right.crbegin()).first.base();
+    return {static_cast<int>(begin - left.cbegin()), static_cast<int>(end - begin)};
+}
+
+QString TimeOfDayTexts::text(QTime time) const
+{
+    const Hour &hour{m_hours[static_cast<std::size_t>(time.hour())]};
+    const QString &minute{m_minutes[static_cast<std::size_t>(time.minute())]};
+    const QString &second{m_seconds[static_cast<std::size_t>(time.second())]};
+    QString text{hour.text};
+    const auto put = [&text](Field field, const QString &number) {
+        text.replace(field.position, field.length, number);
+    };
+    // The latter first, so that the former stays where it is.
+    if (hour.minute.position < hour.second.position) {
+        put(hour.second, second);
+        put(hour.minute, minute);
+    } else {
+        put(hour.minute, minute);
+        put(hour.second, second);
+    }
+    return text;
+}

@@ -1,0 +1,41 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+#pragma once
+
+#include <QString>
+#include <QTime>
+
+#include <array>
+
+class QLocale;
+
+/// The long texts of all times of day in one locale. The locale takes microseconds a text, but within an hour texts
+/// differ only where the minute and the second stand, so that it need be asked for a few dozen only.
+class TimeOfDayTexts final
+{
+public:
+    explicit TimeOfDayTexts(const QLocale &locale);
+
+    QString text(QTime time) const;
+
+private:
+    /// Where a number stands in a text.
+    struct Field
+    {
+        int position;
+        int length;
+    };
+
+    /// The text of a time in an hour, and where its minute and second stand.
+    struct Hour
+    {
+        QString text;
+        Field minute;
+        Field second;
+    };
+
+    static Field difference(const QString &left, const QString &right);
+
+    std::array<Hour, 24> m_hours;
+    std::array<QString, 60> m_minutes;
+    std::array<QString, 60> m_seconds;
+};
