@@ -7,9 +7,9 @@ class QProcess;
 
 /// The DHCP server's own verdict on the text of a configuration, asked from a child process that is never waited for.
 ///
-/// The text is handed over in a memory file that the child inherits, so nothing is staged on disk. Where the server is
-/// not found, or the check dies or does not come to a verdict, nothing is told. The destructor ends a check that still
-/// runs, without waiting: what is left of it goes with the parent at the latest.
+/// The child inherits the text in a memory file, so nothing is staged on disk. Nothing is told where the server is not
+/// found, or where the check dies or comes to no verdict. The destructor ends a check that is still running, without
+/// waiting: what is left of it goes with the parent at the latest.
 class ConfigCheck final : public QObject
 {
     Q_OBJECT
@@ -28,7 +28,7 @@ signals:
     void refused(const QString &complaint, const QString &output);
 
 private:
-    void judge();
+    void readVerdict();
 
     QProcess *m_process{};
     QString m_candidate; // the path under which the child finds the text

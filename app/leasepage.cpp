@@ -2,7 +2,7 @@
 #include "app/leasepage.h"
 
 #include "app/busycursor.h"
-#include "app/leaseplace.h"
+#include "app/leaseviewstate.h"
 #include "app/pathwatch.h"
 #include "app/windowtext.h"
 #include "common/paths.h"
@@ -80,10 +80,10 @@ void LeasePage::reload()
 void LeasePage::update()
 {
     QTableView &table{*m_ui.dhcpdLeaseTable};
-    const LeasePlace place{table};
+    const LeaseViewState viewState{table};
     const BusyCursor busy{m_model.bytesToRead(paths::leases())};
     m_model.update(paths::leases());
-    place.restoreIn(table);
+    viewState.restoreIn(table);
 }
 
 void LeasePage::search(const QString &text)

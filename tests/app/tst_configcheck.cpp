@@ -1,18 +1,25 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-// What becomes of a check that nobody waits for. The server's verdicts are tested where they are shown.
+// Which server a check asks, what it passes to it, and what becomes of a check that nobody waits for. The server's
+// verdicts are tested where they are shown.
 #include "app/configcheck.h"
 #include "tests/app/testmachine.h"
+#include "tests/common/childprocess.h"
 
+#include <QCoreApplication>
+#include <QFile>
 #include <QPointer>
 #include <QProcess>
+#include <QTemporaryDir>
 #include <QTest>
 
 #include <csignal>
 #include <memory>
 
+#include <sys/mount.h>
+
 namespace {
 
-int warnings = 0;
+int warnings{0};
 
 void countWarning(QtMsgType type, const QMessageLogContext & /*context*/, const QString & /*message*/)
 {
@@ -21,6 +28,17 @@ void countWarning(QtMsgType type, const QMessageLogContext & /*context*/, const 
 
 bool isRunning(qint64 process) { return kill(static_cast<pid_t>(process), 0) == 0; }
 
+const QByteArray endlessServer{"exec sleep 60\n"};
+
+/// What `process` has open, as the system names it.
+QString openFiles(const QString &process)
+{
+    QProcess list;
+    list.start(QStringLiteral("ls"), {QStringLiteral("-l"), QStringLiteral("/proc/%1/fd").arg(process)});
+    list.waitForFinished(-1);
+    return QString::fromLocal8Bit(list.readAll());
+}
+
 } // namespace
 
 class ConfigCheckTest final : public QObject
@@ -28,6 +46,9 @@ class ConfigCheckTest final : public QObject
     Q_OBJECT
 
 private slots:
+    void asksTheServerInPathFirst_data();
+    void asksTheServerInPathFirst();
+    void passesTheTextToNoOtherProcess();
     void abandonedProcessGoesWhenItHasEnded();
     void abandonedProcessGoesWithTheParent();
 
@@ -36,10 +57,59 @@ private:
     static QProcess *abandonCheck(QObject *parent);
 };
 
+void ConfigCheckTest::asksTheServerInPathFirst_data()
+{
+    QTest::addColumn<bool>("inPath");
+    QTest::addRow("one in each place") << true;
+    QTest::addRow("one in /usr/sbin only") << false;
+}
+
+void ConfigCheckTest::asksTheServerInPathFirst()
+{
+    QFETCH(const bool, inPath);
+    const QString folder{QStringLiteral("/usr/sbin")};
+    const QString name{QStringLiteral("/dhcpd")};
+    const QTemporaryDir path;
+    const QString server{path.path() + name};
+    writeTestFile(server, "#!/bin/sh\n" + endlessServer);
+    QVERIFY(QFile::setPermissions(server, QFile::ReadOwner | QFile::ExeOwner));
+
+    QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
+        if (mount("none", QFile::encodeName(folder).constData(), "tmpfs", 0, nullptr) < 0)
+            return QStringLiteral("skip: no tmpfs");
+        if (!QFile::copy(server, folder + name))
+            return QStringLiteral("cannot copy");
+        qputenv("PATH", inPath ? QFile::encodeName(path.path()) + ":/bin" : QByteArray{"/bin"});
+        QObject parent;
+        ConfigCheck check{&parent};
+        check.start({});
+        const QProcess *process{parent.findChild<QProcess *>()};
+        const QString program{process ? process->program() : QString{}};
+        return program == (inPath ? server : folder + name) ? QString{}
+                                                            : QLatin1Char{'\''} + program + QLatin1Char{'\''};
+    }));
+}
+
+void ConfigCheckTest::passesTheTextToNoOtherProcess()
+{
+    const FakePrograms programs;
+    programs.install(QStringLiteral("dhcpd"), endlessServer);
+    QObject parent;
+    ConfigCheck check{&parent};
+    check.start("secret");
+    const QProcess *process{parent.findChild<QProcess *>()};
+    QVERIFY(process);
+    const QString file{QStringLiteral("memfd:dhcpd.conf")};
+    QTRY_VERIFY(openFiles(QString::number(process->processId())).contains(file));
+    QVERIFY(openFiles(QString::number(QCoreApplication::applicationPid())).contains(file));
+    const QString inOther{openFiles(QStringLiteral("self"))};
+    QVERIFY2(!inOther.contains(file), qPrintable(inOther));
+}
+
 QProcess *ConfigCheckTest::abandonCheck(QObject *parent)
 {
     const FakePrograms programs;
-    programs.install(QStringLiteral("dhcpd"), "exec sleep 60\n");
+    programs.install(QStringLiteral("dhcpd"), endlessServer);
     ConfigCheck check{parent};
     check.start({});
     return parent->findChild<QProcess *>();
@@ -48,9 +118,9 @@ QProcess *ConfigCheckTest::abandonCheck(QObject *parent)
 void ConfigCheckTest::abandonedProcessGoesWhenItHasEnded()
 {
     QObject parent;
-    const QPointer<QProcess> process = abandonCheck(&parent);
+    const QPointer<QProcess> process{abandonCheck(&parent)};
     QVERIFY(process);
-    const qint64 id = process->processId();
+    const qint64 id{process->processId()};
     QTRY_VERIFY(!process);
     QVERIFY(!isRunning(id));
 }
@@ -58,11 +128,11 @@ void ConfigCheckTest::abandonedProcessGoesWhenItHasEnded()
 void ConfigCheckTest::abandonedProcessGoesWithTheParent()
 {
     auto parent = std::make_unique<QObject>();
-    const QProcess *process = abandonCheck(parent.get());
+    const QProcess *process{abandonCheck(parent.get())};
     QVERIFY(process);
-    const qint64 id = process->processId();
+    const qint64 id{process->processId()};
 
-    const QtMessageHandler previous = qInstallMessageHandler(countWarning);
+    QtMessageHandler previous{qInstallMessageHandler(countWarning)};
     parent.reset();
     qInstallMessageHandler(previous);
     QCOMPARE(warnings, 0);

@@ -26,21 +26,21 @@
 
 namespace {
 
-constexpr int noJudge{125}; // what the child returns when it cannot be judged
+constexpr int unsupervisable{125}; // what the child returns when its calls cannot be supervised
 
-// Calls without effect on files; sendmsg hands over the listener.
-constexpr std::array unjudged{
+// Calls without effect on files; sendmsg passes the listener on.
+constexpr std::array unsupervised{
     SYS_brk,          SYS_clock_gettime,   SYS_exit,        SYS_exit_group, SYS_futex,        SYS_getegid,
     SYS_geteuid,      SYS_getpid,          SYS_getrandom,   SYS_gettid,     SYS_madvise,      SYS_mmap,
     SYS_mprotect,     SYS_mremap,          SYS_munmap,      SYS_ppoll,      SYS_rt_sigaction, SYS_rt_sigprocmask,
     SYS_rt_sigreturn, SYS_rt_sigtimedwait, SYS_sched_yield, SYS_sendmsg,    SYS_sigaltstack,  SYS_umask};
 
-// From here on, calls of this process wait for a verdict from the returned descriptor's reader.
-int startJudgement()
+// From now on, the calls of this process wait for a verdict from whoever reads the returned descriptor.
+int startSupervision()
 {
     QVector<sock_filter> program;
     program.append(BPF_STMT(BPF_LD | BPF_W | BPF_ABS, offsetof(seccomp_data, nr)));
-    for (const long call : unjudged) {
+    for (const long call : unsupervised) {
         program.append(BPF_JUMP(BPF_JMP | BPF_JEQ | BPF_K, static_cast<unsigned>(call), 0, 1));
         program.append(BPF_STMT(BPF_RET | BPF_K, SECCOMP_RET_ALLOW));
     }
@@ -80,18 +80,18 @@ FileDescriptor receiveDescriptor(int socket)
     return FileDescriptor{descriptor};
 }
 
-[[noreturn]] void runJudged(int socket, const std::function<int()> &function)
+[[noreturn]] void runSupervised(int socket, const std::function<int()> &function)
 {
-    const int listener{startJudgement()};
+    const int listener{startSupervision()};
     if (listener < 0)
-        _exit(noJudge);
+        _exit(unsupervisable);
     const DescriptorMessage message{listener};
     sendmsg(socket, &message.header, 0);
     _exit(function());
 }
 
 // Answers the calls of `child` until it is gone.
-void judgeCalls(pid_t child, int listener, const syscalljudge::Judge &judge)
+void superviseCalls(pid_t child, int listener, const supervisor::Policy &policy)
 {
     for (int index{};; ++index) {
         pollfd waiting{listener, POLLIN, 0};
@@ -100,15 +100,15 @@ void judgeCalls(pid_t child, int listener, const syscalljudge::Judge &judge)
         seccomp_notif call{};
         if (ioctl(listener, SECCOMP_IOCTL_NOTIF_RECV, &call) < 0)
             return;
-        const syscalljudge::Verdict verdict{judge(call.data.nr, index)};
-        if (verdict == syscalljudge::kill) {
+        const supervisor::Verdict verdict{policy(call.data.nr, index)};
+        if (verdict == supervisor::kill) {
             kill(child, SIGKILL);
             return;
         }
         seccomp_notif_resp answer{};
         answer.id = call.id;
-        answer.error = verdict == syscalljudge::pretend ? 0 : -verdict;
-        answer.flags = verdict == syscalljudge::proceed ? SECCOMP_USER_NOTIF_FLAG_CONTINUE : 0;
+        answer.error = verdict == supervisor::pretend ? 0 : -verdict;
+        answer.flags = verdict == supervisor::proceed ? SECCOMP_USER_NOTIF_FLAG_CONTINUE : 0;
         ioctl(listener, SECCOMP_IOCTL_NOTIF_SEND, &answer);
     }
 }
@@ -134,7 +134,7 @@ bool enterMountNamespace()
 
 } // namespace
 
-syscalljudge::Outcome syscalljudge::run(const std::function<int()> &function, const Judge &judge)
+supervisor::Outcome supervisor::run(const std::function<int()> &function, const Policy &policy)
 {
     std::array<int, 2> ends{};
     if (socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()) < 0)
@@ -143,16 +143,16 @@ syscalljudge::Outcome syscalljudge::run(const std::function<int()> &function, co
     FileDescriptor theirs{ends[1]};
     const pid_t child{fork()};
     if (child == 0)
-        runJudged(theirs.get(), function);
+        runSupervised(theirs.get(), function);
     theirs = FileDescriptor{};
     {
         const FileDescriptor listener{receiveDescriptor(ours.get())};
         if (listener.isOpen())
-            judgeCalls(child, listener.get(), judge);
+            superviseCalls(child, listener.get(), policy);
     }
     int status{};
     waitpid(child, &status, 0);
-    if (WIFEXITED(status) && WEXITSTATUS(status) == noJudge)
+    if (WIFEXITED(status) && WEXITSTATUS(status) == unsupervisable)
         return {QStringLiteral("system calls cannot be supervised here")};
     return {{}, WIFSIGNALED(status) && WTERMSIG(status) == SIGKILL, WIFEXITED(status) ? WEXITSTATUS(status) : -1};
 }

@@ -2,12 +2,23 @@
 #pragma once
 
 #include <QString>
+#include <QTest>
 
 #include <functional>
 
-/// Runs a function in a child process of which every system call is judged before the kernel acts on it, so that a test
-/// can let any of them fail or end the process there.
-namespace syscalljudge {
+/// Fails the test with what a child process tells by a text, if that is not empty; skips it when the text begins with
+/// "skip: ".
+#define QVERIFY_NO_PROBLEM(text)                                                                                       \
+    do {                                                                                                               \
+        const QString problemText{text};                                                                               \
+        if (problemText.startsWith(QLatin1String("skip: ")))                                                           \
+            QSKIP(qPrintable(problemText.mid(6)));                                                                     \
+        QVERIFY2(problemText.isEmpty(), qPrintable(problemText));                                                      \
+    } while (false)
+
+/// Runs a function in a child process of which every system call waits for a verdict before the kernel acts on it, so
+/// that a test can let any of them fail, end the process there, or change files just before it.
+namespace supervisor {
 
 /// What becomes of a call: `proceed`, `kill` the process before it, `pretend` that it succeeded without doing it, or a
 /// positive number to fail with as errno.
@@ -16,8 +27,8 @@ constexpr Verdict proceed{0};
 constexpr Verdict kill{-1};
 constexpr Verdict pretend{-2};
 
-/// Gets the number of the system call (SYS_...) and how many were judged before it.
-using Judge = std::function<Verdict(int call, int index)>;
+/// Called in this process with the number of a system call (SYS_...) and how many calls had a verdict before it.
+using Policy = std::function<Verdict(int call, int index)>;
 
 struct Outcome
 {
@@ -26,11 +37,11 @@ struct Outcome
     int result{-1}; ///< what the function returned, -1 when it did not
 };
 
-/// Runs `function` (which returns 0 to 127) under `judge`. Calls that touch no file (memory, signals, clocks) proceed
-/// without a judgement.
-Outcome run(const std::function<int()> &function, const Judge &judge);
+/// Runs `function` (which returns 0 to 127) under `policy`. Calls that touch no file (memory, signals, clocks) proceed
+/// without a verdict.
+Outcome run(const std::function<int()> &function, const Policy &policy);
 
-} // namespace syscalljudge
+} // namespace supervisor
 
 /// Runs `function` in a child process and returns the text that it returned; "the child died" when it did not.
 QString inChild(const std::function<QString()> &function);

@@ -19,6 +19,7 @@
 #include <array>
 #include <cerrno>
 #include <csignal>
+#include <cstdio>
 #include <cstring>
 #include <memory>
 
@@ -34,15 +35,6 @@
 #include <sys/wait.h>
 #include <sys/xattr.h>
 #include <unistd.h>
-
-// Of a child process or a helper that tells what is wrong by its text: "skip: " and a reason is no failure.
-#define QVERIFY_NO_PROBLEM(text)                                                                                       \
-    do {                                                                                                               \
-        const QString problemText{text};                                                                               \
-        if (problemText.startsWith(QLatin1String("skip: ")))                                                           \
-            QSKIP(qPrintable(problemText.mid(6)));                                                                     \
-        QVERIFY2(problemText.isEmpty(), qPrintable(problemText));                                                      \
-    } while (false)
 
 namespace {
 
@@ -174,15 +166,15 @@ void giveAway(const QString &path)
         QCOMPARE(lchown(local(path).constData(), nobody, nobody), 0);
 }
 
-syscalljudge::Outcome saveJudged(const QString &path, const QByteArray &content, const syscalljudge::Judge &judge)
+supervisor::Outcome saveSupervised(const QString &path, const QByteArray &content, const supervisor::Policy &policy)
 {
-    return syscalljudge::run([&] { return fileio::replaceFile(path, content) ? 0 : 1; }, judge);
+    return supervisor::run([&] { return fileio::replaceFile(path, content) ? 0 : 1; }, policy);
 }
 
 // Syncing takes most of the time of a save and makes no difference to a machine that keeps running.
-syscalljudge::Verdict unlessSync(int call, int /*index*/ = 0)
+supervisor::Verdict unlessSync(int call, int /*index*/ = 0)
 {
-    return call == SYS_fsync ? syscalljudge::pretend : syscalljudge::proceed;
+    return call == SYS_fsync ? supervisor::pretend : supervisor::proceed;
 }
 
 // How a file may stand where it is to be replaced.
@@ -242,6 +234,9 @@ private slots:
     void writesToAPipe();
     void survivesAPipeWithoutReader();
     void givesUpOnAPipeThatNobodyEmpties();
+
+    void followsNoLinkThatWasSwappedIn_data();
+    void followsNoLinkThatWasSwappedIn();
 
     void failsWhenFull_data();
     void failsWhenFull();
@@ -386,9 +381,9 @@ void FileIoTest::readsThroughInterruptions()
     writeTestFile(paths::configuration(), oldContent);
     const auto read = [] { return fileio::readFile(paths::configuration()) == oldContent ? 0 : 1; };
     QMap<int, int> interrupted;
-    const syscalljudge::Outcome outcome{syscalljudge::run(read, [&](int call, int) {
+    const supervisor::Outcome outcome{supervisor::run(read, [&](int call, int) {
         const bool mayBeInterrupted{call == SYS_openat || call == SYS_pread64};
-        return mayBeInterrupted && interrupted[call]++ < 2 ? EINTR : syscalljudge::proceed;
+        return mayBeInterrupted && interrupted[call]++ < 2 ? EINTR : supervisor::proceed;
     })};
     if (!outcome.unsupported.isEmpty())
         QSKIP(qPrintable(outcome.unsupported));
@@ -403,8 +398,8 @@ void FileIoTest::readErrorGivesNothing()
         QString reason;
         return !fileio::readFile(paths::configuration(), &reason) && reason == errorText(EIO) ? 0 : 1;
     };
-    const syscalljudge::Outcome outcome{
-        syscalljudge::run(read, [](int call, int) { return call == SYS_pread64 ? EIO : syscalljudge::proceed; })};
+    const supervisor::Outcome outcome{
+        supervisor::run(read, [](int call, int) { return call == SYS_pread64 ? EIO : supervisor::proceed; })};
     if (!outcome.unsupported.isEmpty())
         QSKIP(qPrintable(outcome.unsupported));
     QCOMPARE(outcome.result, 0);
@@ -448,7 +443,7 @@ void FileIoTest::leavesNothingOpenWhereFoldersCannotBeListed()
     };
     // Of what a save calls, only the opening of a directory's stream asks for the flags of a descriptor.
     int refused{};
-    const syscalljudge::Outcome outcome{syscalljudge::run(save, [&](int call, int) {
+    const supervisor::Outcome outcome{supervisor::run(save, [&](int call, int) {
         refused += call == SYS_fcntl ? 1 : 0;
         return call == SYS_fcntl ? ENOMEM : unlessSync(call);
     })};
@@ -671,6 +666,50 @@ void FileIoTest::givesUpOnAPipeThatNobodyEmpties()
     close(reader);
 }
 
+void FileIoTest::followsNoLinkThatWasSwappedIn_data()
+{
+    QTest::addColumn<int>("opening");
+    QTest::addColumn<bool>("saved");
+    QTest::addColumn<QString>("reason");
+    // The directory is opened first, and listed between the two.
+    QTest::addRow("before the file is opened") << 1 << false << errorText(ELOOP);
+    QTest::addRow("before the old content is read") << 3 << true << QString{};
+}
+
+// Somebody puts a link to another file in place of the one that was found.
+void FileIoTest::followsNoLinkThatWasSwappedIn()
+{
+    QFETCH(int, opening);
+    QFETCH(bool, saved);
+    QFETCH(QString, reason);
+    const QString other{m_root->path(QStringLiteral("/etc/other"))};
+    writeTestFile(other, "another file\n");
+    writeTestFile(paths::configuration(), oldContent);
+    QVERIFY(QFile::link(other, directory() + QStringLiteral("link")));
+
+    int openings{};
+    bool swapped{};
+    const auto save = [&] {
+        QString told;
+        const bool done{fileio::replaceFile(paths::configuration(), newContent, &told)};
+        return done == saved && told == reason ? 0 : 1;
+    };
+    const supervisor::Outcome outcome{supervisor::run(save, [&](int call, int) {
+        if (call == SYS_openat && openings++ == opening) {
+            swapped = std::rename(local(directory() + QStringLiteral("link")).constData(),
+                                  local(paths::configuration()).constData()) == 0;
+        }
+        return supervisor::proceed;
+    })};
+    if (!outcome.unsupported.isEmpty())
+        QSKIP(qPrintable(outcome.unsupported));
+    QVERIFY(swapped);
+    QCOMPARE(outcome.result, 0);
+    QCOMPARE(readTestFile(other), QByteArray{"another file\n"});
+    QCOMPARE(contentOf(paths::configuration()), saved ? newContent : QByteArray{"another file\n"});
+    QVERIFY(namesIn(paths::backupDirectory()).isEmpty()); // neither file was read
+}
+
 void FileIoTest::failsWhenFull_data()
 {
     QTest::addColumn<bool>("severalNames");
@@ -709,11 +748,11 @@ void FileIoTest::overwritesNothingWhenThereIsNoRoom()
         if (!put(paths::configuration(), small) ||
             !addName(paths::configuration(), directory() + QStringLiteral("other")))
             return QStringLiteral("cannot write");
-        syscalljudge::Outcome outcome;
+        supervisor::Outcome outcome;
         for (int step{}; step == 0 || outcome.killed; ++step) {
             QDir{paths::backupDirectory()}.removeRecursively();
-            outcome = saveJudged(paths::configuration(), newContent, [step](int call, int index) {
-                return index == step ? syscalljudge::kill : unlessSync(call);
+            outcome = saveSupervised(paths::configuration(), newContent, [step](int call, int index) {
+                return index == step ? supervisor::kill : unlessSync(call);
             });
             if (!outcome.unsupported.isEmpty())
                 return QStringLiteral("skip: ") + outcome.unsupported;
@@ -733,9 +772,9 @@ void FileIoTest::failsInPlaceWhenFullAndRoomCannotBeReserved()
         if (!put(paths::configuration(), small) ||
             !addName(paths::configuration(), directory() + QStringLiteral("other")))
             return QStringLiteral("cannot write");
-        const syscalljudge::Outcome outcome{syscalljudge::run(
+        const supervisor::Outcome outcome{supervisor::run(
             [&] { return problemOfSaving(paths::configuration(), newContent, false, small).isEmpty() ? 0 : 1; },
-            [](int call, int) { return call == SYS_fallocate ? EOPNOTSUPP : syscalljudge::proceed; })};
+            [](int call, int) { return call == SYS_fallocate ? EOPNOTSUPP : supervisor::proceed; })};
         if (!outcome.unsupported.isEmpty())
             return QStringLiteral("skip: ") + outcome.unsupported;
         return difference("saving", outcome.result, 0) +
@@ -880,12 +919,12 @@ void FileIoTest::writesInPlaceWhenTheAttributesCannotBeGiven()
     QCOMPARE(chmod(local(path).constData(), 01640), 0);
     const ino_t inode{statusOf(path).st_ino};
     bool refused{};
-    const syscalljudge::Outcome outcome{
-        syscalljudge::run([&] { return problemOfSaving(path, newContent, true, oldContent).isEmpty() ? 0 : 1; },
-                          [&](int each, int) {
-                              refused = refused || each == call;
-                              return each == call ? EPERM : syscalljudge::proceed;
-                          })};
+    const supervisor::Outcome outcome{
+        supervisor::run([&] { return problemOfSaving(path, newContent, true, oldContent).isEmpty() ? 0 : 1; },
+                        [&](int each, int) {
+                            refused = refused || each == call;
+                            return each == call ? EPERM : supervisor::proceed;
+                        })};
     if (!outcome.unsupported.isEmpty())
         QSKIP(qPrintable(outcome.unsupported));
     if (!refused)
@@ -908,9 +947,9 @@ void FileIoTest::writesInPlaceWhereRenamingIsRefused()
     const ino_t inode{statusOf(path).st_ino};
     int renamings{};
     const auto save = [&] { return problemOfSaving(path, newContent, true, oldContent).isEmpty() ? 0 : 1; };
-    const syscalljudge::Outcome outcome{syscalljudge::run(save, [&](int call, int) {
+    const supervisor::Outcome outcome{supervisor::run(save, [&](int call, int) {
         // The first renaming is that of the backup.
-        return call == SYS_renameat && renamings++ == 1 ? error : syscalljudge::proceed;
+        return call == SYS_renameat && renamings++ == 1 ? error : supervisor::proceed;
     })};
     if (!outcome.unsupported.isEmpty())
         QSKIP(qPrintable(outcome.unsupported));
@@ -980,10 +1019,10 @@ void FileIoTest::savesOfSeveralProcessesDoNotMix()
         children.at(static_cast<size_t>(i)) = fork();
         if (children.at(static_cast<size_t>(i)) == 0) {
             bool saved{true};
-            for (int j{}; j < saves; ++j)
-                saved =
-                    fileio::replaceFile(paths::configuration(), QByteArray{50000 + i, static_cast<char>('a' + i)}) &&
-                    saved;
+            for (int j{}; j < saves; ++j) {
+                const QByteArray content{50000 + i, static_cast<char>('a' + i)};
+                saved = fileio::replaceFile(paths::configuration(), content) && saved;
+            }
             _exit(saved ? 0 : 1);
         }
     }
@@ -1067,7 +1106,7 @@ QString FileIoTest::problemAfterwards(Standing standing, const QString &path, co
     if (standing != Standing::Absent)
         problem += difference("attributes", attributesOf(QFileInfo{path}.canonicalFilePath()), attributes);
 
-    problem += difference("next save", saveJudged(path, laterContent, unlessSync).result, 0);
+    problem += difference("next save", saveSupervised(path, laterContent, unlessSync).result, 0);
     problem += difference("next content", contentOf(path), laterContent);
     if (standing != Standing::Absent)
         problem += difference("next attributes", attributesOf(QFileInfo{path}.canonicalFilePath()), attributes);
@@ -1089,9 +1128,9 @@ void FileIoTest::killedAtEveryStep()
         const QString path{standFile(standing)};
         const QString attributes{attributesOf(QFileInfo{path}.canonicalFilePath())};
         int last{};
-        const syscalljudge::Outcome outcome{saveJudged(path, newContent, [&](int call, int index) {
+        const supervisor::Outcome outcome{saveSupervised(path, newContent, [&](int call, int index) {
             last = call;
-            return index == steps ? syscalljudge::kill : unlessSync(call);
+            return index == steps ? supervisor::kill : unlessSync(call);
         })};
         if (!outcome.unsupported.isEmpty())
             QSKIP(qPrintable(outcome.unsupported));
@@ -1130,7 +1169,7 @@ void FileIoTest::failedAtEveryStep()
         const QString attributes{attributesOf(QFileInfo{path}.canonicalFilePath())};
         int failed{};
         reached = false;
-        const syscalljudge::Outcome outcome{saveJudged(path, newContent, [&](int call, int index) {
+        const supervisor::Outcome outcome{saveSupervised(path, newContent, [&](int call, int index) {
             reached = reached || index == steps;
             failed = index == steps ? call : failed;
             return index == steps ? error : unlessSync(call);

@@ -29,9 +29,10 @@ public:
     {
         const QByteArray name{(language + QLatin1Char('.') + charset).toLatin1()};
         const QString localedef{QStandardPaths::findExecutable(QStringLiteral("localedef"))};
-        if (!localedef.isEmpty())
+        if (!localedef.isEmpty()) {
             QProcess::execute(localedef, {QStringLiteral("--quiet"), QStringLiteral("-i"), language,
                                           QStringLiteral("-f"), charset, m_folder.filePath(QString::fromLatin1(name))});
+        }
         qputenv("LOCPATH", m_folder.path().toLocal8Bit());
         m_set = std::setlocale(LC_CTYPE, name.constData());
         qunsetenv("LOCPATH");

@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/dhcpdleasesmodel.h"
+
+#include "leases/leaseproxymodel.h"
 #include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
@@ -52,6 +54,7 @@ private slots:
     void isATableOfSixColumns();
     void hasHeaders();
     void hasDataOnlyForTextRoles();
+    void tellsTheNumbersOfAddresses();
     void isAFlatReadOnlyList();
     void showsFilesOfTheServer_data();
     void showsFilesOfTheServer();
@@ -134,6 +137,26 @@ void DhcpdLeasesModelTest::hasDataOnlyForTextRoles()
     QVERIFY(QFile::remove(m_path));
     model.reload(m_path);
     QVERIFY(!model.data(index, Qt::DisplayRole).isValid()); // an index of a row that is no more
+}
+
+/// By which the rows are ordered, also where the address is shown in another way or not at all.
+void DhcpdLeasesModelTest::tellsTheNumbersOfAddresses()
+{
+    DhcpdLeasesModel model;
+    LeaseProxyModel proxy;
+    proxy.setSourceModel(&model);
+    writeTestFile(m_path, "lease 10.0.0.10 {\n}\nlease 10.0.0.9 {\n}\nlease 255.255.255.255 {\n}\n"
+                          "lease ::ffff:10.0.0.11 {\n}\nlease 2001:db8::1 {\n}\n");
+    model.reload(m_path);
+    const QVector<quint32> numbers{0, 0x0A000009, 0x0A00000A, 0x0A00000B, 0xFFFFFFFF};
+    QCOMPARE(model.rowCount(), numbers.size());
+    for (int row{0}; row < numbers.size(); ++row) {
+        for (int column{0}; column < model.columnCount(); ++column) {
+            QCOMPARE(model.index(row, column).data(DhcpdLeasesModel::AddressRole), QVariant{numbers[row]});
+            QCOMPARE(proxy.index(row, column).data(DhcpdLeasesModel::AddressRole), QVariant{numbers[row]});
+        }
+    }
+    QVERIFY(!model.data({}, DhcpdLeasesModel::AddressRole).isValid());
 }
 
 void DhcpdLeasesModelTest::isAFlatReadOnlyList()

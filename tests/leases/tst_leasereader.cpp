@@ -3,13 +3,18 @@
 
 #include "leases/leasefile.h"
 #include "leases/leasetable.h"
+#include "tests/common/childprocess.h"
 #include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
 
+#include <QDir>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTest>
+
+#include <sys/mount.h>
+#include <sys/stat.h>
 
 /// Files that change between being opened and being read.
 class LeaseReaderTest final : public QObject
@@ -23,6 +28,7 @@ private slots:
     void endsWhereTheFileWasCut();
     void readsTheOpenedFileAfterItWasReplaced();
     void isNotContinuedByAnother();
+    void isNotContinuedByAFileOnAnotherDevice();
     void noticesChangesInWhatCameInSmallPieces_data();
     void noticesChangesInWhatCameInSmallPieces();
 
@@ -105,6 +111,39 @@ void LeaseReaderTest::isNotContinuedByAnother()
     m_reader.clear();
     QVERIFY(!m_reader.continues(LeaseFile{m_path}));
     QCOMPARE(m_table.size(), 0);
+}
+
+/// A copy that has the same inode number, as another file system gives to its first file.
+void LeaseReaderTest::isNotContinuedByAFileOnAnotherDevice()
+{
+    const QString folder{m_folder->filePath(QStringLiteral("folder"))};
+    const QString path{folder + QStringLiteral("/dhcpd.leases")};
+    QVERIFY(QDir{}.mkdir(folder));
+    const auto mountWithLeases = [&] {
+        if (mount("none", QFile::encodeName(folder).constData(), "tmpfs", 0, nullptr) < 0)
+            return false;
+        QFile file{path};
+        const QByteArray text{leaseBlock(0, 1, 1)};
+        return file.open(QIODevice::WriteOnly) && file.write(text) == text.size();
+    };
+    const auto inodeNumber = [&] {
+        struct stat status
+        {
+        };
+        return stat(QFile::encodeName(path).constData(), &status) == 0 ? status.st_ino : 0;
+    };
+    QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
+        if (!mountWithLeases())
+            return QStringLiteral("skip: no tmpfs");
+        const ino_t inode{inodeNumber()};
+        if (!m_reader.readOn(LeaseFile{path}) || !m_reader.continues(LeaseFile{path}))
+            return QStringLiteral("not continued by itself");
+        if (!mountWithLeases())
+            return QStringLiteral("skip: no second tmpfs");
+        if (inodeNumber() != inode)
+            return QStringLiteral("skip: the first files of two file systems have different inode numbers");
+        return m_reader.continues(LeaseFile{path}) ? QStringLiteral("continued by another") : QString{};
+    }));
 }
 
 void LeaseReaderTest::noticesChangesInWhatCameInSmallPieces_data()

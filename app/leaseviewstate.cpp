@@ -1,18 +1,16 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "app/leaseplace.h"
+#include "app/leaseviewstate.h"
 
 #include "leases/dhcpdleasesmodel.h"
 
-#include <QHostAddress>
 #include <QScrollBar>
 #include <QTableView>
 
 namespace {
 
-/// The number by which the leases are ordered.
 quint32 addressAt(const QAbstractItemModel &leases, int row)
 {
-    return QHostAddress{leases.index(row, DhcpdLeasesModel::Address).data().toString()}.toIPv4Address();
+    return leases.index(row, DhcpdLeasesModel::Address).data(DhcpdLeasesModel::AddressRole).toUInt();
 }
 
 std::optional<quint32> addressOf(const QModelIndex &index)
@@ -23,10 +21,10 @@ std::optional<quint32> addressOf(const QModelIndex &index)
 /// The first row whose address is not below `address`; the number of rows when there is none.
 int lowerBound(const QAbstractItemModel &leases, quint32 address)
 {
-    int first = 0;
-    int last = leases.rowCount();
+    int first{0};
+    int last{leases.rowCount()};
     while (first < last) {
-        const int middle = first + (last - first) / 2;
+        const int middle{first + (last - first) / 2};
         if (addressAt(leases, middle) < address)
             first = middle + 1;
         else
@@ -37,7 +35,7 @@ int lowerBound(const QAbstractItemModel &leases, quint32 address)
 
 } // namespace
 
-LeasePlace::LeasePlace(const QTableView &table)
+LeaseViewState::LeaseViewState(const QTableView &table)
     : m_current{addressOf(table.currentIndex())}
     , m_column{table.currentIndex().column()}
     , m_cellSelected{table.selectionModel()->selectedIndexes().size() == 1}
@@ -46,14 +44,15 @@ LeasePlace::LeasePlace(const QTableView &table)
 {
 }
 
-void LeasePlace::restoreIn(QTableView &table) const
+void LeaseViewState::restoreIn(QTableView &table) const
 {
-    const QAbstractItemModel &leases = *table.model();
+    const QAbstractItemModel &leases{*table.model()};
     // When the current row goes, the table makes its neighbour current; another lease than the user chose.
     if (addressOf(table.currentIndex()) != m_current) {
-        const int row = m_current ? lowerBound(leases, *m_current) : leases.rowCount();
+        const int row{m_current ? lowerBound(leases, *m_current) : leases.rowCount()};
         if (row < leases.rowCount() && addressAt(leases, row) == *m_current) {
-            const auto extent = m_cellSelected ? QItemSelectionModel::NoUpdate : QItemSelectionModel::Rows;
+            const QItemSelectionModel::SelectionFlags extent{m_cellSelected ? QItemSelectionModel::NoUpdate
+                                                                            : QItemSelectionModel::Rows};
             table.selectionModel()->setCurrentIndex(leases.index(row, m_column),
                                                     QItemSelectionModel::ClearAndSelect | extent);
         } else {
