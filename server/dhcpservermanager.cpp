@@ -1,12 +1,26 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/dhcpservermanager.h"
 
+namespace {
+
+void startCommand(QProcess &process, const QString &verb)
+{
+    process.start(QStringLiteral("systemctl"), {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
+}
+
+} // namespace
+
 DhcpServerManager::DhcpServerManager(QObject *parent)
     : QObject{parent}
     , m_process{new QProcess{this}}
 {
     qRegisterMetaType<DhcpServerManager::ServerStates>("DhcpServerManager::ServerStates");
     connect(this, &DhcpServerManager::interfacesChanged, this, &DhcpServerManager::writeDHCPServerConfig);
+    connect(m_process, qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this,
+            &DhcpServerManager::handleProcessFinished);
+    // Queued, because a process that could not be started is cleaned up only after its signal and cannot be reused
+    // before.
+    connect(m_process, &QProcess::errorOccurred, this, &DhcpServerManager::handleProcessError, Qt::QueuedConnection);
     updateInterfaces();
 }
 
@@ -48,22 +62,21 @@ void DhcpServerManager::checkRunning()
 {
     if (m_process->state() != QProcess::NotRunning)
         return;
-    // The end of the query is not the end of an operation.
-    disconnect(m_process, nullptr, this, nullptr);
-    startCommand(QStringLiteral("status"));
-    m_process->waitForFinished(-1);
+    QProcess query;
+    startCommand(query, QStringLiteral("status"));
+    query.waitForFinished(-1);
 
-    if (m_process->exitStatus() != QProcess::NormalExit) {
-        emit error(QObject::tr("Checking DHCP-server status failed\n%1")
-                       .arg(QString::fromUtf8(m_process->readAllStandardError())));
+    if (query.exitStatus() != QProcess::NormalExit) {
+        emit error(
+            QObject::tr("Checking DHCP-server status failed\n%1").arg(QString::fromUtf8(query.readAllStandardError())));
         return;
     }
     // The exit code is deliberately not looked at: it is not 0 for a stopped service either.
-    const QString status = QString::fromUtf8(m_process->readAllStandardOutput());
-    if (status.contains(QLatin1String("Active: inactive (dead)")) || status.contains(QLatin1String("Active: failed")))
+    const QString status{QString::fromUtf8(query.readAllStandardOutput())};
+    if (status.contains(QLatin1String{"Active: inactive (dead)"}) || status.contains(QLatin1String{"Active: failed"}))
         setState(Stopped);
     // Deliberately no "else": of a text that has both, running is what counts.
-    if (status.contains(QLatin1String("Active: active (running)")))
+    if (status.contains(QLatin1String{"Active: active (running)"}))
         setState(Running);
 }
 
@@ -80,13 +93,7 @@ void DhcpServerManager::setState(ServerStates state)
     emit serverStateChanged(m_state);
 }
 
-void DhcpServerManager::startCommand(const QString &verb)
-{
-    m_process->start(QStringLiteral("systemctl"), {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
-}
-
-// Sends the service the command `verb`, unless the service turns out to be in the state `exceptIn`: then does
-// `instead`.
+// Sends the service the command `verb`, or calls `instead` when the service turns out to be in the state `exceptIn`.
 void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead)
 {
     if (m_state == Updating) {
@@ -99,11 +106,7 @@ void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, cons
         return;
     }
     setState(Updating);
-    connect(m_process, qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this,
-            &DhcpServerManager::handleProcessFinished);
-    // Queued: a process that could not be started is cleaned up only after its signal, and cannot be used before.
-    connect(m_process, &QProcess::errorOccurred, this, &DhcpServerManager::handleProcessError, Qt::QueuedConnection);
-    startCommand(verb);
+    startCommand(*m_process, verb);
 }
 
 void DhcpServerManager::handleProcessError(QProcess::ProcessError processError)

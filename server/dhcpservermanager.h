@@ -30,8 +30,8 @@ public:
     };
     Q_ENUM(ServerStates)
 
-    /// Collects the interfaces and reads the defaults file, but asks nothing about the service: until the first
-    /// checkRunning() its state is `Updating`.
+    /// Collects the interfaces and reads the defaults file, but does not ask for the state of the service, which is
+    /// `Updating` until the first checkRunning().
     explicit DhcpServerManager(QObject *parent = nullptr);
     /// A `systemctl` under way is killed and nothing more is reported; what it has already asked of the service manager
     /// goes on.
@@ -45,15 +45,15 @@ public:
 
     /// Collects the system's interfaces and reads the defaults file again; an unsaved choice is lost.
     void updateInterfaces();
-    /// Fills the map with the system's interfaces that have an IPv4 address, without loopback, none of them served.
-    /// When the system does not tell, the map stays empty.
+    /// Fills the map with the system's interfaces that have an IPv4 address, except loopback, none of them served. The
+    /// map is empty when the system cannot list them.
     void collectSystemInterfaces();
     /// Reads the lines of the defaults file at `path` and marks the interfaces that it names as served; reports an
     /// error() when it cannot be read.
     void readInterfacesFile(const QString &path);
     /// Interface names, each with whether it is served.
     const QMap<QString, bool> &interfaces() const;
-    /// Takes the choice over and writes the defaults file. An empty map or an equal one changes nothing.
+    /// Adopts the choice and writes the defaults file. An empty map or an equal one changes nothing.
     void setInterfaces(const QMap<QString, bool> &interfaces);
 
 signals:
@@ -61,9 +61,9 @@ signals:
     void information(const QString &message);
     /// An operation was refused or failed, or a file could not be opened.
     void error(const QString &message);
-    /// The state was set, also to the value that it had.
+    /// The state was set, possibly to the value that it already had.
     void serverStateChanged(const DhcpServerManager::ServerStates &state);
-    /// The served interfaces changed; the defaults file at `path` shall say so.
+    /// The served interfaces changed, and the defaults file at `path` has to follow.
     void interfacesChanged(const QString &path);
 
 public slots:
@@ -78,19 +78,18 @@ public slots:
     void checkRunning();
     /// The end of a start, stop or restart.
     void handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus);
-    /// Writes the lines last read with the served interfaces of the map over the file at `path`. When that fails, the
-    /// choice is given up for what the system and the file say, and an error() reported. A file that exists but could
-    /// not be read is never written over.
+    /// Overwrites the file at `path` with the lines last read and the served interfaces of the map. When that fails,
+    /// the choice is discarded for what the system and the file say, and an error() is reported. A file that exists but
+    /// could not be read is never overwritten.
     void writeDHCPServerConfig(const QString &path = paths::serverDefaults());
 
 private:
     void setState(ServerStates state);
-    void startCommand(const QString &verb);
     void operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead);
     void handleProcessError(QProcess::ProcessError processError);
     void reportFailedOperation(const QString &detail);
 
-    QProcess *m_process;
+    QProcess *m_process; // of the operation under way, if any
     ServerStates m_state{Updating};
     QStringList m_fileLines; // with their terminators
     QMap<QString, bool> m_interfaces;
