@@ -11,7 +11,7 @@ DomainInputDialog::DomainInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::DomainInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrain(m_ui->domainName, patterns::domain());
+    fields::validate(m_ui->domainName, patterns::domain());
     fields::widenForName(m_ui->domainName);
 }
 

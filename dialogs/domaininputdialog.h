@@ -9,8 +9,8 @@ namespace Ui {
 class DomainInputDialog;
 }
 
-/// Asks for a domain name, shown bare. The configuration keeps it in double quotes, so that the setter takes quotes off
-/// and the getter puts them on.
+/// Asks for a domain name, shown bare. The configuration keeps it in double quotes, so the setter takes quotes off and
+/// the getter puts them on.
 class DomainInputDialog final : public QDialog
 {
     Q_OBJECT

@@ -9,12 +9,12 @@
 
 namespace fields {
 
-void restrain(QLineEdit *field, const QRegularExpression &pattern)
+void validate(QLineEdit *field, const QRegularExpression &pattern)
 {
     field->setValidator(new QRegularExpressionValidator{pattern, field});
 }
 
-void restrainToMac(QLineEdit *field)
+void maskAsMac(QLineEdit *field)
 {
     field->setInputMask(patterns::macInputMask());
     widenFor(field, QStringLiteral("DD:DD:DD:DD:DD:DD"));
@@ -25,12 +25,12 @@ void widenFor(QLineEdit *field, const QString &widest)
     // The size hint of a line edit is made for 17 times the letter x and includes what the style puts around the text.
     constexpr int hintLetters{17};
     const QFontMetrics metrics{field->fontMetrics()};
-    const int surroundings{field->sizeHint().width() - hintLetters * metrics.horizontalAdvance(QLatin1Char('x'))};
+    const int surroundings{field->sizeHint().width() - hintLetters * metrics.horizontalAdvance(QLatin1Char{'x'})};
     field->setMinimumWidth(surroundings + metrics.horizontalAdvance(widest));
 }
 
 void widenForAddress(QLineEdit *field) { widenFor(field, QStringLiteral("255.255.255.255")); }
 
-void widenForName(QLineEdit *field) { widenFor(field, QString{32, QLatin1Char('x')}); }
+void widenForName(QLineEdit *field) { widenFor(field, QString{32, QLatin1Char{'x'}}); }
 
 } // namespace fields

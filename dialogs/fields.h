@@ -8,10 +8,10 @@ class QString;
 /// What the fields of several dialogs have in common.
 namespace fields {
 
-/// Only texts of `pattern`, and what may become one, can be typed into `field`.
-void restrain(QLineEdit *field, const QRegularExpression &pattern);
-/// `field` takes the digits of a MAC address between colons.
-void restrainToMac(QLineEdit *field);
+/// Lets only texts that match `pattern`, or may come to, be typed into `field`.
+void validate(QLineEdit *field, const QRegularExpression &pattern);
+/// Lets only the digits of a MAC address be typed into `field`, between the colons that it shows.
+void maskAsMac(QLineEdit *field);
 /// `field` never gets too narrow to show a text as wide as `widest`.
 void widenFor(QLineEdit *field, const QString &widest);
 /// `field` never gets too narrow to show an address.

@@ -10,10 +10,10 @@ HostInputDialog::HostInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::HostInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrain(m_ui->hostName, patterns::hostName());
+    fields::validate(m_ui->hostName, patterns::hostName());
     fields::widenForName(m_ui->hostName);
-    fields::restrainToMac(m_ui->hostMac);
-    fields::restrain(m_ui->hostIp, patterns::looseAddress());
+    fields::maskAsMac(m_ui->hostMac);
+    fields::validate(m_ui->hostIp, patterns::looseAddress());
 }
 
 HostInputDialog::~HostInputDialog() = default;

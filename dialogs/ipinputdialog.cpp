@@ -10,7 +10,7 @@ IpInputDialog::IpInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::IpInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrain(m_ui->ip, patterns::looseAddress());
+    fields::validate(m_ui->ip, patterns::looseAddress());
     fields::widenForAddress(m_ui->ip);
 }
 

@@ -9,7 +9,7 @@ MacInputDialog::MacInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::MacInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrainToMac(m_ui->mac);
+    fields::maskAsMac(m_ui->mac);
 }
 
 MacInputDialog::~MacInputDialog() = default;
@@ -17,7 +17,7 @@ MacInputDialog::~MacInputDialog() = default;
 void MacInputDialog::setMac(const QString &text)
 {
     m_ui->mac->setText(text);
-    // Behind the last digit of a full mask nothing can be typed.
+    // Nothing can be typed behind the last digit of a full mask.
     m_ui->mac->setCursorPosition(0);
 }
 

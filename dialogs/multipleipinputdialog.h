@@ -21,7 +21,7 @@ public:
 
     /// The caption of the list: what the addresses are.
     void setLabel(const QString &text);
-    /// Lists the addresses of a comma separated text. What is no address, loopback or broadcast is left out.
+    /// Lists the addresses of a comma-separated text, except loopback, broadcast and whatever is no address.
     void setIps(const QString &text);
     /// The listed addresses, separated by comma and space.
     QString ips() const;

@@ -5,7 +5,7 @@ class QRegularExpression;
 class QString;
 
 /// What may be typed into the fields of the dialogs. Each pattern is built once for the whole program and is meant to
-/// match a whole text. They only restrain typing: the configuration model judges the values.
+/// match a whole text. They only limit what can be typed: the configuration model checks the values.
 namespace patterns {
 
 /// An address, its octets not range-checked, with an optional prefix length of 0 to 32: "192.168.1.0/24".

@@ -12,7 +12,7 @@ RangeInputDialog::RangeInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::RangeInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrain(m_ui->startIP, patterns::strictAddress());
+    fields::validate(m_ui->startIP, patterns::strictAddress());
     m_ui->endIP->setValidator(m_ui->startIP->validator());
     for (QLineEdit *field : {m_ui->startIP, m_ui->endIP})
         fields::widenForAddress(field);

@@ -24,7 +24,7 @@ public:
     bool setData(const QModelIndex &index, const QVariant &value, int role = Qt::EditRole) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
 
-    /// Appends a row for every three words; cells that the last words do not reach stay empty.
+    /// Appends a row for every three words; where there are too few for the last row, its cells stay empty.
     void addRoutes(const QStringList &words);
     /// Removes the row of `index`, if there is one.
     void removeRoute(const QModelIndex &index);

@@ -16,8 +16,8 @@
 
 namespace {
 
-/// A word of the option value as the table shows it. Every plain number is deliberately read as a prefix length, a
-/// network of one octet too; 0 is none.
+/// A word of the option value as the table shows it. Every plain number but 0 is deliberately read as a prefix length,
+/// even a network of one octet.
 QString shownWord(const QString &word)
 {
     if (const int prefixLength{word.toInt()}; prefixLength != 0)
@@ -25,8 +25,8 @@ QString shownWord(const QString &word)
     return QString{word}.replace(QLatin1Char{','}, QLatin1Char{'.'});
 }
 
-/// The text of a cell as a word of the option value. Every net mask is deliberately written as its prefix length, a
-/// network that looks like one (192.0.0.0) too.
+/// The text of a cell as a word of the option value. Every net mask is deliberately written as its prefix length, even
+/// a network that looks like one (192.0.0.0).
 QString optionWord(const QString &cell)
 {
     if (QString{cell}.remove(patterns::netmask()).isEmpty())
@@ -34,7 +34,7 @@ QString optionWord(const QString &cell)
     return QString{cell}.replace(QLatin1Char{'.'}, QLatin1Char{','});
 }
 
-/// Lets a screen reader say which column the cell is in that is being edited.
+/// Lets a screen reader say which column is being edited.
 class RouteDelegate final : public QStyledItemDelegate
 {
 public:

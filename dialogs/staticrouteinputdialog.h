@@ -11,7 +11,8 @@ namespace Ui {
 class StaticRouteInputDialog;
 }
 
-/// Asks for the static routes that the server hands out, edited in place in a table of net mask, network and gateway.
+/// Asks for the static routes that clients get from the server, edited in place in a table of net mask, network and
+/// gateway.
 class StaticRouteInputDialog final : public QDialog
 {
     Q_OBJECT
@@ -27,12 +28,12 @@ public:
     /// The words of the option value: prefix length, network and gateway of every route.
     QStringList routes() const;
     bool isMsRoute() const;
-    /// The check box for MS systems shows the kind of the routes and cannot be changed.
+    /// Makes the check box for MS systems show the kind of the routes only, without a way to change it.
     void lockMsRoute();
 
 public slots:
     void handleAddStaticRoute();
-    /// Says so and does nothing while a cell is empty.
+    /// While a cell is empty, says so and does nothing else.
     void accept() override;
 
 private:
@@ -40,5 +41,5 @@ private:
     QStringList cellTexts() const;
 
     const std::unique_ptr<Ui::StaticRouteInputDialog> m_ui;
-    RouteModel *const m_model;
+    RouteModel *m_model;
 };

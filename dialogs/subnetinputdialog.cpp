@@ -19,9 +19,9 @@ SubnetInputDialog::SubnetInputDialog(QWidget *parent)
     , m_ui{std::make_unique<Ui::SubnetInputDialog>()}
 {
     m_ui->setupUi(this);
-    fields::restrain(m_ui->address, patterns::subnet());
+    fields::validate(m_ui->address, patterns::subnet());
     fields::widenFor(m_ui->address, QStringLiteral("255.255.255.255/32"));
-    fields::restrain(m_ui->netmask, patterns::netmask());
+    fields::validate(m_ui->netmask, patterns::netmask());
     connect(m_ui->address, &QLineEdit::textEdited, this, &SubnetInputDialog::handleAddressEdited);
     connect(m_ui->address, &QLineEdit::textChanged, this, &SubnetInputDialog::handleAddressEdited);
 }

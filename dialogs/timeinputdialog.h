@@ -12,8 +12,8 @@ namespace Ui {
 class TimeInputDialog;
 }
 
-/// Asks for a duration, as months of 30 days, days, hours, minutes and seconds. That hours go to 24, minutes and
-/// seconds to 60, and the spelling of "Mounth" are deliberate.
+/// Asks for a duration, as months of 30 days, days, hours, minutes and seconds. The limits of 24 hours, 60 minutes and
+/// 60 seconds are deliberate, and so is the spelling of "Mounth".
 class TimeInputDialog final : public QDialog
 {
     Q_OBJECT
@@ -23,7 +23,7 @@ public:
     ~TimeInputDialog() override;
     Q_DISABLE_COPY_MOVE(TimeInputDialog)
 
-    /// Shows `value` seconds. A part that its field cannot hold is cut to the nearest that it can.
+    /// Shows `value` seconds. A part that does not fit its field becomes the nearest that does.
     void setSeconds(int value);
     /// The duration in seconds, as decimal text.
     QString seconds() const;

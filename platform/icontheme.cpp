@@ -17,7 +17,7 @@ struct IconTheme
     QStringList parents;
 };
 
-// The theme's own entries stand in the first group; the groups after it, one for each folder, are most of the file.
+// The theme's own entries are in the first group; the groups after it, one for each folder, are most of the file.
 std::optional<IconTheme> readIndex(const QString &path)
 {
     QFile file{path};
@@ -27,39 +27,39 @@ std::optional<IconTheme> readIndex(const QString &path)
     bool inFirstGroup{false};
     while (!file.atEnd()) {
         const QString line{QString::fromUtf8(file.readLine()).trimmed()};
-        if (line.startsWith(QLatin1Char('['))) {
+        if (line.startsWith(QLatin1Char{'['})) {
             if (inFirstGroup)
                 break;
             inFirstGroup = true;
         }
-        const QString key{line.section(QLatin1Char('='), 0, 0).trimmed()};
-        const QStringList values{line.section(QLatin1Char('='), 1).split(QLatin1Char(','), Qt::SkipEmptyParts)};
-        if (key == QLatin1String("Directories"))
+        const QString key{line.section(QLatin1Char{'='}, 0, 0).trimmed()};
+        const QStringList values{line.section(QLatin1Char{'='}, 1).split(QLatin1Char{','}, Qt::SkipEmptyParts)};
+        if (key == QLatin1String{"Directories"})
             theme.folders = values;
-        else if (key == QLatin1String("Inherits"))
+        else if (key == QLatin1String{"Inherits"})
             theme.parents = values;
-        else if (key == QLatin1String("Hidden") && values.value(0) == QLatin1String("true"))
+        else if (key == QLatin1String{"Hidden"} && values.value(0) == QLatin1String{"true"})
             return {};
     }
     return theme;
 }
 
-// A theme in several search paths is the first of them that has a valid index.
+// Of a theme in several search paths, the first that has a valid index counts.
 IconTheme findTheme(const QStringList &searchPaths, const QString &name)
 {
     for (const QString &searchPath : searchPaths) {
-        const QString root{searchPath + QLatin1Char('/') + name + QLatin1Char('/')};
+        const QString root{searchPath + QLatin1Char{'/'} + name + QLatin1Char{'/'}};
         std::optional<IconTheme> theme{readIndex(root + QStringLiteral("index.theme"))};
         if (!theme || theme->folders.isEmpty())
             continue;
         for (QString &folder : theme->folders)
-            folder = root + folder.trimmed() + QLatin1Char('/');
+            folder = root + folder.trimmed() + QLatin1Char{'/'};
         return *theme;
     }
     return {};
 }
 
-// The folders of the theme and of all that it inherits from, themes visited before left out.
+// The folders of the theme and of all that it inherits from, except those of the `visited` themes.
 QStringList foldersOf(const QStringList &searchPaths, const QString &name, QSet<QString> &visited)
 {
     if (visited.contains(name))
@@ -67,7 +67,7 @@ QStringList foldersOf(const QStringList &searchPaths, const QString &name, QSet<
     visited.insert(name);
     const IconTheme theme{findTheme(searchPaths, name)};
     QStringList folders{theme.folders};
-    // Without folders it is a theme of cursors, and what it inherits is not the icons' concern.
+    // A theme without folders is one of cursors, and what it inherits does not concern icons.
     if (!folders.isEmpty()) {
         for (const QString &parent : theme.parents)
             folders += foldersOf(searchPaths, parent.trimmed(), visited);
@@ -83,7 +83,7 @@ bool hasIcon(const QStringList &folders, const QString &name)
     });
 }
 
-// Looks for no more names than it takes to know: a name that is missing is looked for in every folder.
+// Stops as soon as the answer is known: a missing name costs a look into every folder.
 bool hasHalf(const QStringList &folders, const QStringList &names)
 {
     int found{0};
@@ -96,7 +96,7 @@ bool hasHalf(const QStringList &folders, const QStringList &names)
     return 2 * found >= names.size();
 }
 
-// Those that look best beside the bundled icons come first.
+// The themes that look best beside the bundled icons come first.
 int preference(const QString &theme)
 {
     static const QStringList preferred{
@@ -110,8 +110,8 @@ int preference(const QString &theme)
 
 bool suitsPalette(const QString &theme, bool darkPalette)
 {
-    const bool dark{theme.contains(QLatin1String("dark"), Qt::CaseInsensitive)};
-    const bool highContrast{theme.contains(QLatin1String("contrast"), Qt::CaseInsensitive)};
+    const bool dark{theme.contains(QLatin1String{"dark"}, Qt::CaseInsensitive)};
+    const bool highContrast{theme.contains(QLatin1String{"contrast"}, Qt::CaseInsensitive)};
     return !highContrast && dark == darkPalette;
 }
 
@@ -133,10 +133,10 @@ QString suitableIconTheme(const QStringList &searchPaths, const QStringList &nam
     };
     std::sort(themes.begin(), themes.end(),
               [&rank](const QString &left, const QString &right) { return rank(left) < rank(right); });
-    const auto chosen{std::find_if(themes.cbegin(), themes.cend(), [&](const QString &theme) {
+    const auto chosen = std::find_if(themes.cbegin(), themes.cend(), [&](const QString &theme) {
         // What every theme falls back on says nothing about this one.
         QSet<QString> visited{fallbackIconTheme};
         return hasHalf(foldersOf(searchPaths, theme, visited), names);
-    })};
+    });
     return chosen == themes.cend() ? QString{} : *chosen;
 }

@@ -7,7 +7,7 @@
 
 namespace {
 
-// The text of a line: what the few escapes that the page uses stand for.
+// The text of a line, with the few escapes that the page uses replaced by what they stand for.
 QString plainText(QString line)
 {
     static const QRegularExpression escape{QStringLiteral(R"(\\(-|&|f[BIR]|\(bu))")};
@@ -17,8 +17,8 @@ QString plainText(QString line)
 
 } // namespace
 
-// Only the macros that the page uses: headings, paragraphs, emphasis, and tagged paragraphs, whose first line is the
-// tag.
+// Knows only the macros that the page uses: headings, paragraphs, emphasis, and tagged paragraphs, whose first line is
+// the tag.
 QString manualPageHtml()
 {
     static const QHash<QString, QString> forms{
@@ -33,15 +33,15 @@ QString manualPageHtml()
     bool tagFollows{false};
     while (!page.atEnd()) {
         const QString line{QString::fromUtf8(page.readLine()).trimmed()};
-        const QString macro{line.section(QLatin1Char(' '), 0, 0)};
-        const bool isMacro{line.startsWith(QLatin1Char('.'))};
+        const QString macro{line.section(QLatin1Char{' '}, 0, 0)};
+        const bool isMacro{line.startsWith(QLatin1Char{'.'})};
         if (forms.contains(macro))
-            html += forms.value(macro).arg(plainText(line.section(QLatin1Char(' '), 1)));
+            html += forms.value(macro).arg(plainText(line.section(QLatin1Char{' '}, 1)));
         else if (!isMacro)
-            html += plainText(line) + QLatin1Char(' ');
+            html += plainText(line) + QLatin1Char{' '};
         if (tagFollows)
             html += QStringLiteral("<br>");
-        tagFollows = macro == QLatin1String(".TP");
+        tagFollows = macro == QLatin1String{".TP"};
     }
     return html;
 }

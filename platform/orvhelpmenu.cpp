@@ -26,12 +26,12 @@ void OrvHelpMenu::showManual()
         m_manual = new QDialog{parentWidget()};
         m_manual->setAttribute(Qt::WA_DeleteOnClose);
         m_manual->setWindowTitle(tr("Manual"));
-        auto *text{new QTextBrowser};
+        auto *text = new QTextBrowser;
         text->setAccessibleName(m_manual->windowTitle());
         text->setHtml(manualPageHtml());
-        auto *buttons{new QDialogButtonBox{QDialogButtonBox::Close}};
+        auto *buttons = new QDialogButtonBox{QDialogButtonBox::Close};
         connect(buttons, &QDialogButtonBox::rejected, m_manual, &QDialog::reject);
-        auto *layout{new QVBoxLayout{m_manual}};
+        auto *layout = new QVBoxLayout{m_manual};
         layout->addWidget(text);
         layout->addWidget(buttons);
         m_manual->resize(640, 560);

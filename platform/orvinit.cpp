@@ -17,7 +17,7 @@ QString &description()
     return text;
 }
 
-// The names that the program asks for are those it bundles a drawing for.
+// The program asks for the icons that it bundles, and for no others.
 QStringList usedIconNames()
 {
     QStringList names;
@@ -27,8 +27,8 @@ QStringList usedIconNames()
     return names;
 }
 
-// Qt reads one index for a theme, the first that it finds. The system's index of the fallback theme lists hundreds of
-// folders, takes longer to read than all the icons do to draw, and has nothing that ours lacks and we look for.
+// Qt reads one index for each theme, the first that it finds. The system's index of the fallback theme lists hundreds
+// of folders, takes longer to read than all the icons take to draw, and has none that the program needs and ours lacks.
 void useBundledIcons()
 {
     const QString bundled{QStringLiteral(":/icons")};

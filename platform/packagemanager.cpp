@@ -8,7 +8,7 @@ namespace {
 
 constexpr int longestWait{5000}; // milliseconds
 
-// Whatever else dpkg-query takes for a package (a pattern, an option) is not the name of one.
+// Not everything that dpkg-query accepts is the name of a package: it also takes patterns and options.
 bool isPackageName(const QString &text)
 {
     static const QRegularExpression name{QStringLiteral("\\A[a-z0-9][a-z0-9+.-]+\\z")};
@@ -36,7 +36,7 @@ QStringList PackageManager::getInstalledPackagesVersions(const QString &package)
         return {};
     // A removed package whose configuration files were left is still in the database.
     const QString installed{QStringLiteral("installed ")};
-    const QStringList packages{QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char('\n'))};
+    const QStringList packages{QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char{'\n'})};
     QStringList versions;
     for (const QString &line : packages) {
         if (line.startsWith(installed))

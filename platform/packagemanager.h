@@ -10,7 +10,7 @@ class PackageManager final
 {
 public:
     /// The versions of the installed package named `package`, one for each architecture that it is installed for. Empty
-    /// when it is not installed, unknown, or the database cannot be asked.
+    /// when it is not installed or unknown, or when the database cannot be queried.
     static QStringList getInstalledPackagesVersions(const QString &package);
 };
 

@@ -10,15 +10,15 @@
 #include <QApplication>
 #include <QPointer>
 
-/// An application of which one instance runs for a user at a time: later ones find it running, hand it a message and
+/// An application of which one instance runs for a user at a time: later ones find it running, send it a message and
 /// end. Stands in for the class of the same name where that is not installed, with the same interface.
 class QtSingleApplication final : public QApplication
 {
     Q_OBJECT
 
 public:
-    /// The identity is the executable's name. The last argument is there for the interface's sake: a QApplication of
-    /// Qt 5 always has a user interface.
+    /// The identity is the executable's name. The last argument is ignored, since a QApplication of Qt 5 always has a
+    /// user interface.
     QtSingleApplication(int &argc, char **argv, bool guiEnabled = true);
     Q_DISABLE_COPY_MOVE(QtSingleApplication)
 
@@ -31,7 +31,7 @@ public:
     QWidget *activationWindow() const;
 
 public slots:
-    /// Hands `message` to the first instance; false when it did not confirm it within `timeout` milliseconds.
+    /// Sends `message` to the first instance. False when it was not confirmed within `timeout` milliseconds.
     bool sendMessage(const QString &message, int timeout = 5000);
     void activateWindow();
 

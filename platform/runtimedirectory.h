@@ -6,7 +6,7 @@
 /// Whether `path` is a folder (no symbolic link to one) that belongs to this user and that nobody else can enter.
 bool isPrivateDirectory(const QString &path);
 
-/// Makes the folder `path` unless it is there; false when it is then not private.
+/// Makes the folder `path` unless it exists. Returns whether it is private then.
 bool makePrivateDirectory(const QString &path);
 
 /// Where the program makes a folder of its own when the session has no runtime directory.

@@ -19,7 +19,7 @@ constexpr int clientPatience{5000};          // milliseconds until a client that
 constexpr unsigned long retryInterval{20};   // milliseconds
 const QByteArray receipt{QByteArrayLiteral("ack")};
 
-// The folder keeps other users out already; this holds even where its mode was loosened.
+// The folder keeps other users out already; this does so even where its mode was loosened.
 bool isSameUser(const QLocalSocket &client)
 {
     ucred peer{};
@@ -35,8 +35,8 @@ int remainingTime(const QDeadlineTimer &deadline) { return static_cast<int>(dead
 SingleInstance::SingleInstance(const QString &directory, const QString &id)
 {
     if (!directory.isEmpty()) {
-        m_socketPath = directory + QLatin1Char('/') + id + QStringLiteral(".socket");
-        m_lockFile.setFileName(directory + QLatin1Char('/') + id + QStringLiteral(".lock"));
+        m_socketPath = directory + QLatin1Char{'/'} + id + QStringLiteral(".socket");
+        m_lockFile.setFileName(directory + QLatin1Char{'/'} + id + QStringLiteral(".lock"));
     }
     connect(&m_server, &QLocalServer::newConnection, this, &SingleInstance::acceptClients);
 }
@@ -50,7 +50,7 @@ bool SingleInstance::isOtherRunning()
         m_lockFile.close();
         return otherHoldsIt;
     }
-    // Whoever left a socket file behind is gone, or it would still hold the lock.
+    // The process that left a socket file behind is gone, or it would still hold the lock.
     QLocalServer::removeServer(m_socketPath);
     m_server.listen(m_socketPath);
     return false;
@@ -59,7 +59,7 @@ bool SingleInstance::isOtherRunning()
 bool SingleInstance::send(const QString &message, int timeout)
 {
     const QByteArray text{message.toUtf8()};
-    const auto size{static_cast<quint32>(text.size())};
+    const auto size = static_cast<quint32>(text.size());
     if (size > longestMessage || !isOtherRunning())
         return false;
 
@@ -86,7 +86,8 @@ bool SingleInstance::send(const QString &message, int timeout)
 
 void SingleInstance::acceptClients()
 {
-    while (QLocalSocket * client{m_server.nextPendingConnection()}) {
+    while (m_server.hasPendingConnections()) {
+        QLocalSocket *client{m_server.nextPendingConnection()};
         connect(client, &QLocalSocket::disconnected, client, &QObject::deleteLater);
         if (!isSameUser(*client)) {
             client->abort();
@@ -102,7 +103,7 @@ void SingleInstance::receive(QLocalSocket *client)
 {
     if (client->bytesAvailable() < headerSize)
         return;
-    const auto size{qFromBigEndian<quint32>(client->peek(headerSize).constData())};
+    const auto size = qFromBigEndian<quint32>(client->peek(headerSize).constData());
     if (size > longestMessage) {
         client->abort();
         return;
@@ -111,7 +112,7 @@ void SingleInstance::receive(QLocalSocket *client)
         return;
     client->skip(headerSize);
     const QString message{QString::fromUtf8(client->read(size))};
-    // The receipt goes first: what the message starts here may take long.
+    // The receipt goes first, since what the message starts here may take long.
     client->write(receipt);
     client->flush();
     client->disconnectFromServer();

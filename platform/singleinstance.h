@@ -5,8 +5,8 @@
 #include <QLocalServer>
 #include <QObject>
 
-/// One program's claim to be the only instance, held by a lock that the system takes back however the process ends, and
-/// the socket through which later instances talk to the first. Only processes of the same user are heard.
+/// A program's claim to be the only instance, held by a lock that the system releases however the process ends, and the
+/// socket through which later instances talk to the first. Only processes of the same user are heard.
 class SingleInstance final : public QObject
 {
     Q_OBJECT
@@ -16,7 +16,7 @@ public:
     SingleInstance(const QString &directory, const QString &id);
     Q_DISABLE_COPY_MOVE(SingleInstance)
 
-    /// Whether another process holds the lock; otherwise this one takes it, if it has not yet, and listens.
+    /// Whether another process holds the lock; otherwise this one takes it, unless it has it already, and listens.
     bool isOtherRunning();
 
     /// Sends `message` (at most 64 KiB of UTF-8) to the first instance and waits for its receipt, at most `timeout`

@@ -15,12 +15,12 @@ namespace {
 
 const QLatin1String interfacesKey{"INTERFACESv4"};
 
-// The lines of `text` with their terminators; what follows the last terminator is a line if not empty.
+// The lines of `text` with their terminators; the last one may have none.
 QStringList linesOf(const QString &text)
 {
     QStringList lines;
-    for (int begin = 0; begin < text.size(); begin += lines.constLast().size()) {
-        const int end = text.indexOf(QLatin1Char('\n'), begin);
+    for (int begin{0}; begin < text.size(); begin += lines.constLast().size()) {
+        const int end{text.indexOf(QLatin1Char{'\n'}, begin)};
         lines.append(text.mid(begin, end < 0 ? -1 : end + 1 - begin));
     }
     return lines;
@@ -29,24 +29,24 @@ QStringList linesOf(const QString &text)
 // What ends `line`: LF, CR LF, or nothing at the end of the file.
 QString terminatorOf(const QString &line)
 {
-    for (const QLatin1String terminator : {QLatin1String("\r\n"), QLatin1String("\n")}) {
+    for (const QLatin1String terminator : {QLatin1String{"\r\n"}, QLatin1String{"\n"}}) {
         if (line.endsWith(terminator))
             return terminator;
     }
     return {};
 }
 
-// Replaces `pieces` by the names between the first quotes after the first equals sign of `line`. Where the line lacks
-// one of them it returns false and leaves in `pieces` what there is of the last split.
+// Replaces `pieces` by the names between the first quotes after the first equals sign of `line`. Returns false where
+// the line lacks one of these, with the parts of the last split left in `pieces`.
 bool splitInterfacesLine(const QString &line, QStringList &pieces)
 {
-    pieces = line.chopped(terminatorOf(line).size()).split(QLatin1Char('='));
+    pieces = line.chopped(terminatorOf(line).size()).split(QLatin1Char{'='});
     if (pieces.size() < 2)
         return false;
-    pieces = pieces.at(1).split(QLatin1Char('"'));
+    pieces = pieces.at(1).split(QLatin1Char{'"'});
     if (pieces.size() < 2)
         return false;
-    pieces = pieces.at(1).split(QLatin1Char(' '));
+    pieces = pieces.at(1).split(QLatin1Char{' '});
     if (pieces == QStringList{QString{}})
         pieces.clear();
     return true;
@@ -54,16 +54,16 @@ bool splitInterfacesLine(const QString &line, QStringList &pieces)
 
 QString interfacesLine(const QMap<QString, bool> &interfaces)
 {
-    QString line = interfacesKey + QLatin1String("=\"");
+    QString line{interfacesKey + QLatin1String{"=\""}};
     for (auto entry = interfaces.cbegin(); entry != interfaces.cend(); ++entry) {
         if (!entry.value())
             continue;
         line += entry.key();
-        // Deliberately a space after every name but the map's last, be that one served or not.
+        // Deliberately a space after every name but the map's last, whether or not that one is served.
         if (std::next(entry) != interfaces.cend())
-            line += QLatin1Char(' ');
+            line += QLatin1Char{' '};
     }
-    return line + QLatin1Char('"');
+    return line + QLatin1Char{'"'};
 }
 
 } // namespace
@@ -81,8 +81,8 @@ void DhcpServerManager::collectSystemInterfaces()
     if (getifaddrs(&first) == -1)
         return;
     const std::unique_ptr<ifaddrs, decltype(&freeifaddrs)> list{first, &freeifaddrs};
-    for (const ifaddrs *entry = list.get(); entry; entry = entry->ifa_next) {
-        const bool isIpv4 = entry->ifa_addr && entry->ifa_addr->sa_family == AF_INET;
+    for (const ifaddrs *entry{list.get()}; entry; entry = entry->ifa_next) {
+        const bool isIpv4{entry->ifa_addr && entry->ifa_addr->sa_family == AF_INET};
         if (isIpv4 && !(entry->ifa_flags & IFF_LOOPBACK))
             m_interfaces.insert(QString::fromLatin1(entry->ifa_name), false);
     }
@@ -91,7 +91,7 @@ void DhcpServerManager::collectSystemInterfaces()
 void DhcpServerManager::readInterfacesFile(const QString &path)
 {
     m_fileLines.clear();
-    const std::optional<QByteArray> content = fileio::readFile(path);
+    const std::optional<QByteArray> content{fileio::readFile(path)};
     m_fileWasRead = content.has_value();
     if (!content) {
         emit error(QObject::tr("Unable to open file '%1' for read").arg(path));
@@ -102,7 +102,7 @@ void DhcpServerManager::readInterfacesFile(const QString &path)
     // Deliberately one list for all lines: the last line with the key decides, even one that cannot be taken apart.
     // Such a line is dropped, so that the next write leaves it out, but its pieces count as names.
     QStringList served;
-    const QStringList lines = linesOf(m_fileEncoding.decode(*content));
+    const QStringList lines{linesOf(m_fileEncoding.decode(*content))};
     for (const QString &line : lines) {
         if (!line.contains(interfacesKey) || splitInterfacesLine(line, served))
             m_fileLines.append(line);
@@ -123,12 +123,12 @@ void DhcpServerManager::setInterfaces(const QMap<QString, bool> &interfaces)
 
 void DhcpServerManager::writeDHCPServerConfig(const QString &path)
 {
-    // Commented lines with the key are deliberately replaced too.
+    // Deliberately replaces commented lines with the key too.
     for (QString &line : m_fileLines) {
         if (line.contains(interfacesKey))
             line = interfacesLine(m_interfaces) + terminatorOf(line);
     }
-    const bool wouldLoseFile = !m_fileWasRead && QFileInfo::exists(path);
+    const bool wouldLoseFile{!m_fileWasRead && QFileInfo::exists(path)};
     if (wouldLoseFile || !fileio::replaceFile(path, m_fileEncoding.encode(m_fileLines.join(QString{})))) {
         updateInterfaces();
         emit error(QObject::tr("Unable to open file '%1' for write").arg(path));

@@ -52,8 +52,8 @@ void InterfacesDialog::fillGroupBox(const QMap<QString, bool> &interfaces)
     }
 }
 
-// A layout makes its window as tall as its widgets need. Beyond two thirds of the screen, the height that Qt itself
-// keeps to for a new window, the list is scrolled instead, so that the buttons stay in reach.
+// A layout makes its window as tall as its widgets need. Beyond two thirds of the screen, the limit that Qt itself sets
+// for a new window, the list scrolls instead, so that the buttons stay within reach.
 void InterfacesDialog::scrollWhenTooTall()
 {
     if (sizeHint().height() * 3 <= screen()->availableGeometry().height() * 2)
@@ -63,7 +63,7 @@ void InterfacesDialog::scrollWhenTooTall()
     scrollArea->setFocusPolicy(Qt::NoFocus); // the keyboard moves from box to box, and the area follows
     scrollArea->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     scrollArea->setWidgetResizable(true);
-    // The area would ask for the width of the check boxes only, not of the group's title.
+    // By itself the area asks for the width of the check boxes only, not for that of the group's title.
     scrollArea->setMinimumWidth(m_groupBox->minimumSizeHint().width() +
                                 scrollArea->verticalScrollBar()->sizeHint().width());
     const std::unique_ptr<QLayoutItem> replaced{layout()->replaceWidget(m_groupBox, scrollArea)};
