@@ -12,7 +12,7 @@ void readConfiguration(benchmark::State &state)
     for (auto _ : state) {
         state.PauseTiming();
         {
-            const double before = inputs::heapBytes();
+            const double before{inputs::heapBytes()};
             DhcpdConfigModel model{{QStringLiteral("Topology"), QStringLiteral("Value")}};
             state.ResumeTiming();
             model.read(inputs::configuration());

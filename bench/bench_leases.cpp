@@ -12,7 +12,7 @@ void loadLeases(benchmark::State &state)
     for (auto _ : state) {
         state.PauseTiming();
         {
-            const double before = inputs::heapBytes();
+            const double before{inputs::heapBytes()};
             DhcpdLeasesModel model;
             state.ResumeTiming();
             model.reload(inputs::leases());

@@ -70,11 +70,11 @@ void addHost(benchmark::State &state)
 {
     Site site{inputs::configuration(), {}};
     for (auto _ : state) {
-        auto *tree = site.child<QTreeView>("topologyTree");
+        QTreeView *tree{site.child<QTreeView>("topologyTree")};
         tree->setCurrentIndex(tree->model()->index(0, 0));
         QElapsedTimer sinceSave;
         QTimer::singleShot(0, &site.window(), [&site, &sinceSave] {
-            auto *dialog = site.window().findChild<HostInputDialog *>();
+            HostInputDialog *dialog{site.window().findChild<HostInputDialog *>()};
             dialog->setName(QStringLiteral("new.example.org"));
             sinceSave.start();
             dialog->accept();
@@ -90,7 +90,7 @@ void searchKey(benchmark::State &state, const QString &before, const QString &te
     Site site{{}, inputs::leases()};
     site.child<QTabWidget>("mainTabWidget")->setCurrentIndex(1);
     Site::paint();
-    auto *search = site.child<QLineEdit>("searchLease");
+    QLineEdit *search{site.child<QLineEdit>("searchLease")};
     for (auto _ : state) {
         search->setText(before);
         Site::paint();
@@ -151,6 +151,6 @@ void registerSearches()
     }
 }
 
-const bool registered = (registerSearches(), true);
+const bool registered{(registerSearches(), true)};
 
 } // namespace

@@ -51,7 +51,7 @@ public:
 
 void waitForFirstPaint()
 {
-    QCoreApplication *application = QCoreApplication::instance();
+    QCoreApplication *application{QCoreApplication::instance()};
     application->installEventFilter(new FirstPaint{application});
 }
 

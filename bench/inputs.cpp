@@ -14,7 +14,10 @@ QString leases() { return qEnvironmentVariable("ORV_BENCH_LEASES"); }
 
 double heapBytes()
 {
-    const struct mallinfo2 info = mallinfo2();
+    const struct mallinfo2 info
+    {
+        mallinfo2()
+    };
     return static_cast<double>(info.uordblks + info.hblkhd);
 }
 

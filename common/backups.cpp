@@ -60,7 +60,7 @@ QByteArray baseName(const QString &path)
     return name.size() <= longestBaseName ? name : QCryptographicHash::hash(full, QCryptographicHash::Sha1).toHex();
 }
 
-// A folder that others could write to, or a link that they could turn, must not receive what only the superuser may
+// A folder that others could write to, or a link that they could redirect, must not receive what only the superuser may
 // see.
 FileDescriptor openBackupFolder()
 {

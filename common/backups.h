@@ -7,8 +7,8 @@
 namespace backups {
 
 /// Keeps `content`, a version of the file at the absolute `path`, in the backup folder: readable by its owner only,
-/// synced, named after the path and the time (UTC). Of each path the first version and the newest twenty stay. A
-/// content that is the newest version already is not kept again.
+/// synced, named after the path and the time (UTC). Of each path the first version and the newest twenty stay. Content
+/// that equals the newest version is not kept again.
 /// Returns the path of the version, empty when it could not be kept.
 QString keep(const QString &path, const QByteArray &content);
 

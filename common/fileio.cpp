@@ -27,9 +27,9 @@ namespace {
 using ExtendedStatus = struct statx;
 
 constexpr int longestLinkChain{40}; // as the kernel's
-constexpr int pipePatience{1000};   // ms that a full pipe may take to be read from
+constexpr int pipePatience{1000};   // ms to wait until somebody reads from a full pipe
 
-// Makes a write past the size limit or to a pipe without reader fail instead of ending the process.
+// Makes a write past the size limit or to a pipe without a reader fail instead of ending the process.
 class FatalSignalsBlocked final
 {
 public:

@@ -24,8 +24,8 @@ std::optional<QByteArray> readFile(const QString &path, QString *reason = nullpt
 /// the old content is written back. To a device or pipe `content` is written unchecked.
 bool replaceFile(const QString &path, const QByteArray &content, QString *reason = nullptr);
 
-/// Keeps `content` among the backups of the file at `path`, for what could not be written there. Returns the path of
-/// the copy, empty when it could not be kept either.
+/// Keeps `content`, which could not be written to `path`, among the backups of that file. Returns the path of the copy,
+/// empty when it could not be kept either.
 QString keepCopy(const QString &path, const QByteArray &content);
 
 } // namespace fileio

@@ -98,7 +98,7 @@ void TemporaryFile::removeLeftOvers(int directory, const QByteArray &name, uid_t
     for (const QByteArray &entry : entries) {
         if (entry.size() != prefix.size() + suffixLength || !entry.startsWith(prefix))
             continue;
-        // The lock is held until the name is gone, so that its writer cannot be one that just begins.
+        // The lock is held until the name is gone, so that its writer cannot be one that is just beginning.
         const FileDescriptor file{posix::openAt(directory, entry, O_RDONLY | O_NOFOLLOW)};
         if (isLeftOver(file, owner))
             unlinkat(directory, entry.constData(), 0);

@@ -21,7 +21,7 @@ class DhcpdLeasesModel final : public QAbstractListModel
     Q_OBJECT
 
 public:
-    /// The columns as an index counts them.
+    /// The columns, as numbers for an index.
     enum Column
     {
         Address = static_cast<int>(LeaseColumn::Address),
@@ -32,7 +32,7 @@ public:
         End = static_cast<int>(LeaseColumn::End)
     };
 
-    /// The role of the number by which the rows are ordered, that of the address as a quint32; in every column.
+    /// The address as a quint32, by which the rows are ordered; in every column.
     static constexpr int AddressRole{Qt::UserRole + 1};
 
     explicit DhcpdLeasesModel(QObject *parent = nullptr);
@@ -53,11 +53,12 @@ signals:
     void error(const QString &message);
 
 public slots:
-    /// Replaces everything by what the file at `path` holds, in one reset.
+    /// Replaces everything with what the file at `path` holds, in one reset.
     void reload(const QString &path);
 
-    /// Brings the model up to date with the file at `path`. If that only grew since it was last read, just what was
-    /// appended is read, and a few new leases are announced as changed and inserted rows; else it is a reload.
+    /// Brings the model up to date with the file at `path`. If the file has only grown since it was last read, just
+    /// what was appended is read, and a few new leases are announced as changed and inserted rows; otherwise this is
+    /// a reload.
     void update(const QString &path);
 
 private:

@@ -9,7 +9,7 @@ namespace {
 
 constexpr int octets{4};
 
-/// Whether the text of an octet can stand where part `part` of a needle that was split at its dots is.
+/// Whether the text of an octet fits part `part` of a needle that was split at its dots.
 bool octetFits(const QString &octet, const QStringList &parts, int part, Qt::CaseSensitivity sensitivity)
 {
     if (part < 0 || part >= parts.size())

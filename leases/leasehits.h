@@ -5,7 +5,7 @@
 
 #include <vector>
 
-/// The leases in which a search found its text; to be used until the leases change.
+/// The leases in which a search found its text; valid until the leases change.
 class LeaseHits final
 {
 public:
@@ -14,7 +14,7 @@ public:
     bool isEmpty() const { return m_isEmpty; }
     bool contains(int row) const { return containsInFile(m_table->placeInFile(row)); }
 
-    /// The same by the place of a lease in the order of the file.
+    /// The same by the place in the file.
     bool containsInFile(int place) const { return m_isHit[static_cast<std::size_t>(place)]; }
     void addInFile(int place);
 

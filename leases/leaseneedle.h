@@ -3,7 +3,7 @@
 
 #include <QString>
 
-/// A text to look for, and whether letter case matters: it is in another text if QString::contains() says so.
+/// A text to look for, and whether letter case matters. It is in another text if QString::contains() says so.
 struct LeaseNeedle
 {
     bool isIn(const QString &whole) const { return whole.contains(text, sensitivity); }

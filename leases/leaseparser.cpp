@@ -21,8 +21,8 @@ constexpr std::array usualStates{"active"sv,   "free"sv,  "expired"sv, "released
 bool startsWith(std::string_view text, std::string_view start) { return text.substr(0, start.size()) == start; }
 bool contains(std::string_view text, std::string_view part) { return text.find(part) != npos; }
 
-/// The place in `line` of the quote that ends a quoted text beginning at `begin`, or npos. A backslash takes away the
-/// meaning of the character after it.
+/// The place in `line` of the quote that ends a quoted text beginning at `begin`, or npos. A backslash escapes the
+/// character after it.
 std::size_t closingQuote(std::string_view line, std::size_t begin)
 {
     std::size_t quote{line.find('"', begin)};
@@ -37,7 +37,8 @@ std::size_t closingQuote(std::string_view line, std::size_t begin)
     return quote;
 }
 
-/// What of a line is neither quoted nor a comment. The quotes stay, so that what they part is not joined.
+/// The parts of a line that are neither quoted nor a comment. The quotes stay, so that what they separate is not
+/// joined.
 std::string outsideOfQuotes(std::string_view line)
 {
     std::string outside;
@@ -84,7 +85,7 @@ std::size_t wordPlace(std::string_view line, int index)
     return begin;
 }
 
-/// Word `index` of a line split at single spaces, empty if the line has not so many.
+/// Word `index` of a line split at single spaces, empty if the line has fewer.
 std::string_view word(std::string_view line, int index)
 {
     const std::size_t begin{wordPlace(line, index)};

@@ -12,10 +12,10 @@
 
 /// Reads the text of a lease file, given piece by piece, into a table of leases.
 ///
-/// It goes by lines in the layout that the DHCP server writes, not by the grammar: the first keyword or brace in a line
-/// decides what the line is, and its words, counted between single spaces, are the values. Only what stands outside
+/// It relies on the layout in which the DHCP server writes lines, not on the grammar: the first keyword or brace in a
+/// line decides what the line is, and its words, split at single spaces, are the values. Only what stands outside
 /// double quotes and comments counts as a keyword or a brace, since what is quoted was sent by clients. Values are kept
-/// from block to block: what a block does not say is as in the block before it.
+/// from block to block: what a block does not state is as in the block before it.
 class LeaseParser final
 {
 public:
@@ -28,15 +28,15 @@ public:
     /// Takes the next piece of the text; its leases are pending in the table.
     void feed(std::string_view bytes);
 
-    /// Takes what follows the last line feed as a line, for there is no more text now; once until more is fed.
+    /// Reads what follows the last line feed as a line, since there is no more text for now. Does nothing when called
+    /// again before more is fed.
     void finish();
 
-    /// Whether the table holds after finish() what more text can be added to. Not so if a line that was not complete
-    /// yet ended a block.
+    /// Whether more text can be fed after finish(): not if a line that was not complete yet has ended a block.
     bool canContinue() const { return !m_blockEnded; }
 
 private:
-    /// The values that a block is given when it ends.
+    /// What a block holds when it ends.
     struct Values
     {
         Lease lease;
@@ -56,8 +56,8 @@ private:
 
     LeaseTable &m_table;
     Values m_values;
-    std::string m_unfinished; // what was fed of the last line
+    std::string m_unfinished; // the part of the last line that was fed
     std::optional<Values> m_beforeUnfinished;
     bool m_blockEnded{false};                  // since finish() began to read the unfinished line
-    std::vector<LeaseTexts::Id> m_usualStates; // those that occurred, at their places in the list of usual states
+    std::vector<LeaseTexts::Id> m_usualStates; // by their places in the list of usual states
 };

@@ -14,8 +14,8 @@ class LeaseSearch;
 
 /// A filter and search for a DhcpdLeasesModel that keep up with typing over a million leases.
 ///
-/// All of QSortFilterProxyModel works as ever, through a pointer to it also. Its own filter, set by this class's
-/// setFilterFixedString(), stands beside the base's: a row is shown if both accept it.
+/// All of QSortFilterProxyModel keeps working, also through a pointer to it. The filter that this class's
+/// setFilterFixedString() sets comes on top of the base's: a row is shown if both accept it.
 class LeaseProxyModel final : public QSortFilterProxyModel
 {
     Q_OBJECT
@@ -26,11 +26,11 @@ public:
 
     void setSourceModel(QAbstractItemModel *model) override;
 
-    /// Shows only the leases that have `text`, in the same letter case, in any column; all if it is empty. The views
-    /// see one reset.
+    /// Shows only the leases that have `text`, in the same letter case, in any column; all if it is empty. Views see
+    /// a single reset.
     void setFilterFixedString(const QString &text);
 
-    /// As the base's, and fast for Qt::MatchContains.
+    /// Like the base's, but fast for Qt::MatchContains.
     QModelIndexList match(const QModelIndex &start, int role, const QVariant &value, int hits = 1,
                           Qt::MatchFlags flags = {Qt::MatchStartsWith | Qt::MatchWrap}) const override;
 
@@ -39,7 +39,7 @@ protected:
 
 private:
     const DhcpdLeasesModel *leases() const;
-    /// Whether match() can do such a search without the base.
+    /// Whether match() can do without the base's search.
     bool isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const;
     void search(const QAbstractItemModel *model);
     void searchAgain();

@@ -11,7 +11,7 @@ namespace {
 // Small enough that a piece is still in the processor's cache when it is parsed.
 constexpr std::size_t pieceSize{std::size_t{1} << 18U};
 
-// Of what was read, so much at the beginning and at the end is compared, and a sample each so many bytes.
+// How much of what was read is compared: at the beginning and at the end, and in samples at regular distances.
 constexpr int comparedAtEnds{4096};
 constexpr int sampleSize{64};
 constexpr qint64 sampleDistance{1 << 20};
@@ -39,8 +39,8 @@ bool LeaseReader::continues(const LeaseFile &file) const
         const auto size = static_cast<std::size_t>(now.size());
         return file.read(offset, now.data(), size) == size && now == bytes;
     };
-    return m_position > 0 && m_parser.canContinue() && file.isOpen() && file.identity() == m_identity &&
-           file.size() >= m_position && isUnchanged(m_position - m_lastBytes.size(), m_lastBytes) &&
+    return m_position > 0 && m_parser.canContinue() && file.identity() == m_identity && file.size() >= m_position &&
+           isUnchanged(m_position - m_lastBytes.size(), m_lastBytes) &&
            std::all_of(m_samples.cbegin(), m_samples.cend(),
                        [&](const Sample &sample) { return isUnchanged(sample.offset, sample.bytes); });
 }
@@ -68,14 +68,14 @@ bool LeaseReader::readOn(const LeaseFile &file)
     return true;
 }
 
-/// Keeps samples of the bytes that stand at m_position in the file.
+/// Keeps samples of `bytes`, which are at m_position in the file.
 void LeaseReader::remember(std::string_view bytes)
 {
     if (m_samples.empty() || m_position >= m_samples.back().offset + sampleDistance)
         m_samples.push_back({m_position, {}});
     const QByteArray read{QByteArray::fromRawData(bytes.data(), static_cast<int>(bytes.size()))};
     QByteArray &sample{m_samples.back().bytes};
-    // One that is not full yet ends where these bytes begin.
+    // A sample that is not full yet ends where these bytes begin.
     sample += read.left((m_samples.size() == 1 ? comparedAtEnds : sampleSize) - sample.size());
     m_lastBytes += read.right(comparedAtEnds);
     m_lastBytes = m_lastBytes.right(comparedAtEnds);

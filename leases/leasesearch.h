@@ -28,7 +28,7 @@ public:
     /// Whether the text is in any column of a row.
     bool contains(int row) const;
 
-    /// All leases that have the text in any column.
+    /// All leases that have the text in any column; as find() below, for the leases that there were at the start.
     LeaseHits find() const;
     /// All leases that have the text in `column`; if `among` is given, only of those that it contains.
     LeaseHits find(LeaseColumn column, const LeaseHits *among = nullptr) const;
@@ -38,7 +38,7 @@ private:
 
     static const Columns &allColumns();
     LeaseHits findIn(Columns columns, const LeaseHits *among) const;
-    /// Whether it may be worth while to look into the cells of a column.
+    /// Whether the text may be in any cell of a column.
     bool canBeIn(LeaseColumn column) const;
     bool isInAny(const Lease &lease, const Columns &columns) const;
     bool isIn(const Lease &lease, LeaseColumn column) const;

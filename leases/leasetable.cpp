@@ -8,16 +8,16 @@
 
 namespace {
 
-// The room that is made ahead, from the bytes of a usual block and of the texts in it; memory that is not needed is
-// never touched.
+// How much room is made ahead, by the size of a usual block and of the texts in it. Memory that turns out not to be
+// needed is never touched.
 constexpr qint64 bytesPerLease{256};
 constexpr qint64 bytesPerTextByte{8};
 constexpr qint64 mostBytesAhead{qint64{1} << 30};
 
-// So many pending leases are settled at once, lest a file of many blocks for few addresses take memory for them all.
+// When so many are pending they are settled, so that a file of many blocks for few addresses does not fill the memory.
 constexpr std::size_t manyPending{std::size_t{1} << 20U};
 
-// An address and a place in the list of leases in one number: sorted, the leases of an address stay in their order.
+// An address and a place in the list of leases in one number; sorting keeps the leases of an address in their order.
 quint64 sortKey(quint32 address, std::size_t place) { return quint64{address} << 32U | place; }
 quint32 addressOf(quint64 key) { return static_cast<quint32>(key >> 32U); }
 quint32 placeOf(quint64 key) { return static_cast<quint32>(key); }
@@ -53,8 +53,8 @@ void LeaseTable::settleAll()
         keys.push_back(sortKey(m_leases[place].address, place));
     std::sort(keys.begin(), keys.end());
 
-    // Merge the last lease of each address into the rows. A lease whose address has a row already moves to that one's
-    // place; `rowOf` is the row of every other, so that those without one can be told.
+    // Merge the last lease of each address into the rows. One whose address has a row already takes the place of the
+    // old one; `rowOf` has the rows of the others, and no row for leases that were replaced by later ones.
     constexpr quint32 none{std::numeric_limits<quint32>::max()};
     std::vector<quint32> rows;
     std::vector<quint32> rowOf(keys.size(), none);

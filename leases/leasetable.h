@@ -12,7 +12,7 @@
 
 /// The leases by address, one for each; a later one replaces an earlier one.
 ///
-/// What is added is pending, and no row, until it is settled: all at once, which sorts but once, or one by one for a
+/// What is added is pending and has no row until it is settled: all at once, which sorts only once, or one by one for a
 /// model that announces each change.
 class LeaseTable final
 {
@@ -25,13 +25,13 @@ public:
     };
 
     void clear();
-    /// Makes room for the leases of a file of so many bytes.
+    /// Makes room for the leases of a file of that many bytes.
     void reserveForFile(qint64 bytes);
 
     LeaseTexts &texts() { return m_texts; }
     const LeaseTexts &texts() const { return m_texts; }
 
-    /// Adds a pending lease. `addressText` is given for an address that is not shown as its number would be.
+    /// Adds a pending lease. `addressText` is given if the address is not shown the way its number would be.
     void add(const Lease &lease, const std::optional<QString> &addressText);
 
     bool hasPending() const { return m_rows.size() < m_leases.size(); }
@@ -44,11 +44,11 @@ public:
     int size() const { return static_cast<int>(m_rows.size()); }
     const Lease &at(int row) const { return m_leases[m_rows[static_cast<std::size_t>(row)]]; }
     QString addressText(quint32 address) const;
-    /// The text of an address that is not shown as its number would be; null for any other.
+    /// The text of an address that is not shown the way its number would be; null for any other.
     const QString *irregularAddressText(quint32 address) const;
     bool hasIrregularAddresses() const { return !m_addressTexts.isEmpty(); }
 
-    /// The same leases in the order of the file. They and their texts lie in memory like this, so that reading all is
+    /// The same leases in the order of the file, in which they and their texts lie in memory: reading all of them is
     /// several times as fast as by row.
     const Lease &inFileOrder(int place) const { return m_leases[static_cast<std::size_t>(place)]; }
     int placeInFile(int row) const { return static_cast<int>(m_rows[static_cast<std::size_t>(row)]); }

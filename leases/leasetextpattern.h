@@ -6,7 +6,7 @@
 #include <string_view>
 #include <vector>
 
-/// Tells whether a needle is in the text of a lease's bytes, from the bytes alone where those are ASCII.
+/// Tells whether a needle is in a text of a lease, from the bytes of the text alone where those are ASCII.
 class LeaseTextPattern final
 {
 public:
@@ -20,7 +20,7 @@ public:
     std::size_t nextCandidate(std::string_view memory, std::size_t from) const;
 
 private:
-    /// What bytes are, or for letters without case become by setting a bit.
+    /// The value that bytes must have; for letters whose case does not matter, after a bit is set.
     struct ByteTest
     {
         bool accepts(char byte) const { return (static_cast<quint8>(byte) | setBits) == value; }

@@ -18,12 +18,6 @@ QString decodeLeaseText(std::string_view text)
     return TextEncoding::detect(bytes).decode(bytes);
 }
 
-void LeaseTexts::clear()
-{
-    m_bytes.assign(1, '\0'); // the empty text
-    m_bytes.shrink_to_fit();
-}
-
 LeaseTexts::Id LeaseTexts::add(std::string_view text)
 {
     const std::size_t id{m_bytes.size()};

@@ -11,8 +11,6 @@ namespace {
 constexpr std::string_view usualLayout{"0000/00/00 00:00:00"};
 constexpr std::size_t dateLength{10};
 constexpr std::size_t timeLength{8};
-// Far more days than a lease file names, and few enough to forget about their memory.
-constexpr int rememberedDates{10'000};
 
 static_assert(usualLayout.size() == LeaseTime::usualLength && dateLength + 1 + timeLength == LeaseTime::usualLength);
 
@@ -60,7 +58,8 @@ LeaseTime LeaseTime::parse(std::string_view date, std::string_view time)
 {
     if (date.size() != dateLength || time.size() != timeLength)
         return {};
-    // Apart: together they would be refused where the local clock skips that hour. Qt's parser takes more than digits.
+    // One by one: a QDateTime would be invalid where the local clock skips that hour. Qt's parser takes more than
+    // digits.
     const QDate qDate{QDate::fromString(QString::fromLatin1(date.data(), dateLength), QStringLiteral("yyyy/MM/dd"))};
     const QTime qTime{QTime::fromString(QString::fromLatin1(time.data(), timeLength), QStringLiteral("hh:mm:ss"))};
     if (!qDate.isValid() || !qTime.isValid())

@@ -6,12 +6,12 @@
 
 #include <string_view>
 
-/// A date and a time of day as a lease file states them. It has no time zone, so that one inside a daylight saving gap
-/// of the local zone is shown like any other.
+/// A date and a time of day as a lease file states them. It has no time zone, so that a time that the local clock skips
+/// is shown like any other.
 class LeaseTime final
 {
 public:
-    /// The length of a usual "yyyy/MM/dd hh:mm:ss".
+    /// The length of the usual layout, "yyyy/MM/dd hh:mm:ss".
     static constexpr std::size_t usualLength{19};
 
     /// An invalid time.
@@ -20,7 +20,7 @@ public:
     /// The time of a date "yyyy/MM/dd" and a time "hh:mm:ss"; invalid unless QDateTime takes both.
     static LeaseTime parse(std::string_view date, std::string_view time);
 
-    /// Whether the usualLength bytes at `text` are digits, slashes, a space and colons in the usual places.
+    /// Whether the usualLength bytes at `text` have the usual layout, whatever the digits.
     static bool hasUsualLayout(const char *text);
     /// The time of a text of the usual layout; invalid if there is no such day or second.
     static LeaseTime fromUsualLayout(const char *text);
@@ -29,7 +29,7 @@ public:
     QDate date() const;
     QTime time() const;
 
-    /// Numbers that stand for the date and for the time of day, each unique among its kind.
+    /// Numbers that identify the date and the time of day.
     quint32 dateKey() const { return m_date; }
     quint32 timeKey() const { return m_time; }
     /// The number of seconds since midnight.

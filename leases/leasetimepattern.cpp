@@ -8,8 +8,8 @@
 namespace {
 
 constexpr std::size_t secondsOfDay{86'400};
-// No text of a time has more separators.
-constexpr int mostSplits{13};
+// As many as have a bit each; no text of a time of day has more separators.
+constexpr std::size_t mostSplits{13};
 
 } // namespace
 
@@ -19,10 +19,9 @@ LeaseTimePattern::LeaseTimePattern(LeaseNeedle needle, LeaseTimeTexts &texts)
     , m_timesOfDay(secondsOfDay)
 {
     const QString &text{m_needle.text};
-    if (text.count(LeaseTimeTexts::separator) <= mostSplits)
-        for (int at{text.indexOf(LeaseTimeTexts::separator)}; at >= 0;
-             at = text.indexOf(LeaseTimeTexts::separator, at + 1))
-            m_splits.push_back({text.left(at), text.mid(at + 1)});
+    for (int at{text.indexOf(LeaseTimeTexts::separator)}; at >= 0 && m_splits.size() < mostSplits;
+         at = text.indexOf(LeaseTimeTexts::separator, at + 1))
+        m_splits.push_back({text.left(at), text.mid(at + 1)});
 }
 
 template<typename FitsSplit>

@@ -12,8 +12,8 @@
 
 class LeaseTimeTexts;
 
-/// Tells whether a needle is in the text of a time. Whether it is in, or which part of it ends or begins, a time of day
-/// or a date is found out once for each.
+/// Tells whether a needle is in the text of a time. What of it is in each time of day and in each date is found out
+/// only once.
 class LeaseTimePattern final
 {
 public:
@@ -22,22 +22,22 @@ public:
     bool isIn(LeaseTime time) const { return time.isValid() && (timeOfDayFits(time) & dateFits(time) & ~known) != 0; }
 
 private:
-    /// The bit `known`, and one for each place that the needle can have in a text: in the time of day, in the date, and
-    /// over the separator with any of its own separators there.
+    /// The bit `known`, and one for each place where the needle can be in a text: in the time of day, in the date, and
+    /// across the separator, with any one of its own separators there.
     using Fits = quint16; // small, for there are many
     static constexpr unsigned known{1U};
     static constexpr unsigned inTimeOfDay{2U};
     static constexpr unsigned inDate{4U};
     static constexpr unsigned firstSplit{8U};
 
-    /// What of the needle stands before and after the separator.
+    /// The parts of the needle before and after the separator.
     struct Split
     {
         QString before;
         QString after;
     };
 
-    // By month and day as they are in a key.
+    // By month and day, as a key has them.
     static constexpr std::size_t daysOfMonth{32};
     using Year = std::array<Fits, 13 * daysOfMonth>;
 

@@ -5,7 +5,7 @@
 
 namespace {
 
-// Far more days than a lease file names, and few enough to forget about their memory.
+// Far more days than a lease file names, and too few to take much memory.
 constexpr int rememberedDates{10'000};
 
 } // namespace
@@ -44,7 +44,7 @@ void LeaseTimeTexts::followLocale()
     }
 }
 
-/// Once a second, which is when the name changes, for the locale takes microseconds to tell.
+/// At most once a second, since the locale takes microseconds to tell and the name changes with a second.
 void LeaseTimeTexts::followZone()
 {
     const std::time_t now{std::time(nullptr)};

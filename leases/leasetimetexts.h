@@ -12,8 +12,8 @@
 #include <optional>
 
 /// The texts of times in the default locale: its long time, a separator and its narrow date. Long times usually name
-/// the local zone, as it is called when the text is made: with daylight saving time or without. The locale takes
-/// microseconds a text and the distinct ones are few, so they are remembered.
+/// the local zone as it is called when the text is made, with daylight saving time or without. The locale takes
+/// microseconds for a text and few are distinct, so they are remembered.
 class LeaseTimeTexts final
 {
 public:
@@ -21,7 +21,7 @@ public:
 
     /// The text of `time`, empty when it is invalid.
     QString text(LeaseTime time);
-    /// What stands before and after the separator in the text of a valid time.
+    /// What comes before and after the separator in the text of a valid time.
     QString timeOfDayText(LeaseTime time);
     QString dateText(LeaseTime time);
 

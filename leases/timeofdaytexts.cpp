@@ -8,7 +8,7 @@
 
 TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
 {
-    // Two numbers without a digit in common.
+    // Two numbers with no digit in common.
     constexpr int number{11};
     constexpr int otherNumber{22};
     const auto text = [&locale](int hour, int minute, int second) {
@@ -30,7 +30,7 @@ TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
     }
 }
 
-/// The part of `left` that is another in `right`, which is as long.
+/// Where `left` differs from `right`, which has the same length.
 TimeOfDayTexts::Field TimeOfDayTexts::difference(const QString &left, const QString &right)
 {
     const auto begin = std::mismatch(left.cbegin(), left.cend(), right.cbegin(), right.cend()).first;
@@ -47,7 +47,7 @@ QString TimeOfDayTexts::text(QTime time) const
     const auto put = [&text](Field field, const QString &number) {
         text.replace(field.position, field.length, number);
     };
-    // The latter first, so that the former stays where it is.
+    // From the back, so that the position of the other stays right.
     if (hour.minute.position < hour.second.position) {
         put(hour.second, second);
         put(hour.minute, minute);

@@ -8,8 +8,8 @@
 
 class QLocale;
 
-/// The long texts of all times of day in one locale. The locale takes microseconds a text, but within an hour texts
-/// differ only where the minute and the second stand, so that it need be asked for a few dozen only.
+/// The long texts of all times of day in one locale. The locale takes microseconds for each, but within an hour texts
+/// differ only in their minutes and seconds, so it is enough to ask for a few dozen.
 class TimeOfDayTexts final
 {
 public:

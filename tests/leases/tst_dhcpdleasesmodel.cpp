@@ -2,6 +2,7 @@
 #include "leases/dhcpdleasesmodel.h"
 
 #include "leases/leaseproxymodel.h"
+#include "tests/common/childprocess.h"
 #include "tests/leases/irregularleases.h"
 #include "tests/leases/referencereader.h"
 #include "tests/support/temporaryroot.h"
@@ -14,11 +15,14 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <cerrno>
+
 #include <sys/stat.h>
+#include <sys/syscall.h>
 
 namespace {
 
-/// Changes the file in place: the same file afterwards, with all that it had kept or not.
+/// These change the file in place, so that it is the same file afterwards.
 void appendTo(const QString &path, const QByteArray &bytes)
 {
     QFile file{path};
@@ -72,6 +76,7 @@ private slots:
     void updateOfAnUnchangedFileSaysNothing();
     void updateReadsTheWholeOfAnotherFile_data();
     void updateReadsTheWholeOfAnotherFile();
+    void updateReadsEverythingAfterAnError();
     void updateEqualsReload();
 
 private:
@@ -136,7 +141,7 @@ void DhcpdLeasesModelTest::hasDataOnlyForTextRoles()
     QVERIFY(!model.index(0, 6).isValid());
     QVERIFY(QFile::remove(m_path));
     model.reload(m_path);
-    QVERIFY(!model.data(index, Qt::DisplayRole).isValid()); // an index of a row that is no more
+    QVERIFY(!model.data(index, Qt::DisplayRole).isValid()); // an index of a row that has gone
 }
 
 /// By which the rows are ordered, also where the address is shown in another way or not at all.
@@ -458,7 +463,44 @@ void DhcpdLeasesModelTest::updateReadsTheWholeOfAnotherFile()
     QCOMPARE(rowsOf(model), referenceRows(readTestFile(m_path)));
 }
 
-/// Whatever happens to the file between two updates, the model shows what a whole reading does.
+/// Each reading of a piece of the file fails once; in the end all of them fail.
+void DhcpdLeasesModelTest::updateReadsEverythingAfterAnError()
+{
+    DhcpdLeasesModel model;
+    writeTestFile(m_path, leaseBlock(0, 1, 1));
+    model.reload(m_path);
+    appendTo(m_path, leaseBlock(0, 2, 2));
+    const auto outcomeOfUpdate = [&](const supervisor::Policy &policy) {
+        const auto update = [&] {
+            const QSignalSpy errors{&model, &DhcpdLeasesModel::error};
+            model.update(m_path);
+            return model.rowCount() * 10 + errors.size();
+        };
+        return supervisor::run(update, policy);
+    };
+
+    int readings{0};
+    const supervisor::Outcome undisturbed{outcomeOfUpdate([&readings](int call, int) {
+        readings += call == SYS_pread64 ? 1 : 0;
+        return supervisor::proceed;
+    })};
+    if (!undisturbed.unsupported.isEmpty())
+        QSKIP(qPrintable(undisturbed.unsupported));
+    QCOMPARE(undisturbed.result, 20);
+    QVERIFY(readings > 2);
+
+    for (int failing{0}; failing < readings; ++failing) {
+        int reading{0};
+        const supervisor::Outcome failedOnce{outcomeOfUpdate(
+            [&](int call, int) { return call == SYS_pread64 && reading++ == failing ? EIO : supervisor::proceed; })};
+        QCOMPARE(failedOnce.result, 20);
+    }
+    const supervisor::Outcome failed{
+        outcomeOfUpdate([](int call, int) { return call == SYS_pread64 ? EIO : supervisor::proceed; })};
+    QCOMPARE(failed.result, 1);
+}
+
+/// Whatever happens to the file between two updates, the model shows what reading all of it would.
 void DhcpdLeasesModelTest::updateEqualsReload()
 {
     QRandomGenerator random{5};

@@ -121,7 +121,7 @@ void LeaseParserTest::readsALineOfABlock_data()
     QTest::addColumn<QString>("shown");
 
     const auto addRow = [](int column, const char *line, const char *shown) {
-        QTest::addRow("%s", line) << QByteArray{line} << column << QString::fromUtf8(shown);
+        QTest::addRow("%s", line) << QByteArray{line} << column << text(shown);
     };
     addRow(Mac, "  hardware ethernet 00:0c:01:02:03:04;", "00:0c:01:02:03:04");
     addRow(Mac, "  hardware token-ring aa:bb;", "aa:bb");
@@ -216,7 +216,7 @@ void LeaseParserTest::readsTheAddress_data()
     QTest::addColumn<QString>("shown");
 
     const auto addRow = [](const char *line, const char *shown) {
-        QTest::addRow("%s", line) << QByteArray{line} << QString::fromUtf8(shown);
+        QTest::addRow("%s", line) << QByteArray{line} << text(shown);
     };
     addRow("lease 10.0.0.1 {", "10.0.0.1");
     addRow("lease 255.255.255.255 {", "255.255.255.255");

@@ -18,7 +18,7 @@
 
 namespace {
 
-/// The filter that Qt has, for comparison.
+/// Qt's own filter, for comparison.
 class StockFilter final : public QSortFilterProxyModel
 {
 public:
@@ -259,7 +259,7 @@ void LeaseProxyModelTest::followsUpdates_data()
         QTest::addRow("'%s'", wanted) << text(wanted);
 }
 
-/// Leases that are added, and others that match no more, or now.
+/// Leases that are added, and others that no longer match, or do from now on.
 void LeaseProxyModelTest::followsUpdates()
 {
     QFETCH(const QString, wanted);
@@ -272,7 +272,7 @@ void LeaseProxyModelTest::followsUpdates()
     for (int i{0}; i < 150; ++i) {
         const int version{random.bounded(30) + i};
         const QString newName{QStringLiteral("host-%1").arg(version)};
-        // Whatever is remembered of this must be forgotten by the update.
+        // The update must forget whatever is remembered of this.
         if (random.bounded(2) == 0) {
             m_proxy->setFilterFixedString({});
             m_proxy->setFilterFixedString(wanted);

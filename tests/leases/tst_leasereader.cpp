@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasereader.h"
 
+#include "common/posix.h"
 #include "leases/leasefile.h"
 #include "leases/leasetable.h"
 #include "tests/common/childprocess.h"
@@ -14,7 +15,6 @@
 #include <QTest>
 
 #include <sys/mount.h>
-#include <sys/stat.h>
 
 /// Files that change between being opened and being read.
 class LeaseReaderTest final : public QObject
@@ -127,9 +127,7 @@ void LeaseReaderTest::isNotContinuedByAFileOnAnotherDevice()
         return file.open(QIODevice::WriteOnly) && file.write(text) == text.size();
     };
     const auto inodeNumber = [&] {
-        struct stat status
-        {
-        };
+        FileStatus status{};
         return stat(QFile::encodeName(path).constData(), &status) == 0 ? status.st_ino : 0;
     };
     QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {

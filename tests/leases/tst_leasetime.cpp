@@ -18,7 +18,7 @@ LeaseTime parsed(const QByteArray &date, const QByteArray &time)
                             {time.constData(), static_cast<std::size_t>(time.size())});
 }
 
-/// While it exists, the local time zone is another one.
+/// While this exists, the local time zone is another one.
 class LocalZone final
 {
 public:
