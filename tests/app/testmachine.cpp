@@ -15,7 +15,7 @@
 
 namespace {
 
-constexpr int patience = 60'000; // milliseconds until a command that does not end fails the test
+constexpr int patience{60'000}; // milliseconds until a command that does not end fails the test
 
 } // namespace
 
@@ -65,8 +65,14 @@ void clickTab(const FMain &window, int tab)
 
 bool isCursorBusy()
 {
-    const QCursor *cursor = QGuiApplication::overrideCursor();
+    const QCursor *cursor{QGuiApplication::overrideCursor()};
     return cursor && cursor->shape() == Qt::WaitCursor;
+}
+
+ModalBoxes::Box saveQuestion(const QString &text)
+{
+    return {QMessageBox::Information, QStringLiteral("Information"), text, QMessageBox::Save | QMessageBox::Cancel,
+            QMessageBox::Save};
 }
 
 ModalBoxes::Box cannotRead()

@@ -21,9 +21,10 @@ public:
     ~FakePrograms();
     Q_DISABLE_COPY_MOVE(FakePrograms)
 
-    /// Makes the lines of a shell script a program, in place of the one of that name.
+    /// Installs a shell script of these lines in place of the program of that name.
     void install(const QString &name, const QByteArray &lines) const;
-    /// The path of a file beside the programs, where they leave what a test looks for ("${0%/*}/name" for them).
+    /// The path of a file beside the programs, in which they leave something for the test; to them it is
+    /// "${0%/*}/name".
     QString file(const QString &name) const;
 
 private:
@@ -31,9 +32,9 @@ private:
     QByteArray m_oldPath;
 };
 
-/// The machine that a main window under test runs on, with nothing of the one that runs the test: files in a folder of
-/// its own, a stopped DHCP service that obeys, a DHCP server that finds no fault with any configuration, no package,
-/// and no settings.
+/// The machine that a main window under test sees, with nothing of the one that runs the test: files in a folder of its
+/// own, a stopped DHCP service that does as it is told, a DHCP server that accepts every configuration, no packages and
+/// no settings.
 class TestMachine final
 {
 public:
@@ -41,7 +42,7 @@ public:
     ~TestMachine();
     Q_DISABLE_COPY_MOVE(TestMachine)
 
-    /// Makes the main window, shows it and waits until it is active.
+    /// Makes and shows the main window, and waits until it is active.
     std::unique_ptr<FMain> openWindow() const;
 
     const FakePrograms &programs() const { return m_programs; }
@@ -60,9 +61,16 @@ void clickTab(const FMain &window, int tab);
 /// Whether every window shows that the program is busy.
 bool isCursorBusy();
 
-/// The box that tells that the configuration could not be read.
+/// The question before the configuration is saved, of a file that is as the program left it or has changed since.
+inline const QString rewriteText{
+    QStringLiteral("Current configuration in file will be rewrited.\nDo you want to save changes?")};
+inline const QString overwriteText{
+    QStringLiteral("The configuration has been changed.\nDo you want to overwrite the configuration?")};
+ModalBoxes::Box saveQuestion(const QString &text = rewriteText);
+
+/// The box that says that the configuration could not be read.
 ModalBoxes::Box cannotRead();
 
-/// Runs a shell command with `path` as its argument and `input` as its input, while the windows go on. Fails the test
-/// when the command does.
+/// Runs a shell command with `path` as its argument and `input` on its standard input; meanwhile the event loop runs.
+/// Fails the test when the command fails.
 void runOutside(const QString &path, const QByteArray &command, const QByteArray &input = {});

@@ -4,7 +4,7 @@
 #include "common/paths.h"
 #include "config/dhcpdconfigmodel.h"
 #include "dialogs/ipinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QAction>
 #include <QApplication>
@@ -24,6 +24,7 @@
 #include <QWindow>
 
 #include <algorithm>
+#include <optional>
 
 namespace {
 
@@ -31,8 +32,8 @@ using Visit = std::function<void(const QModelIndex &index)>;
 
 void forEachIndex(const QAbstractItemModel &model, const QModelIndex &parent, const Visit &visit)
 {
-    for (int row = 0; row < model.rowCount(parent); ++row) {
-        const QModelIndex index = model.index(row, 0, parent);
+    for (int row{0}; row < model.rowCount(parent); ++row) {
+        const QModelIndex index{model.index(row, 0, parent)};
         visit(index);
         forEachIndex(model, index, visit);
     }
@@ -40,22 +41,22 @@ void forEachIndex(const QAbstractItemModel &model, const QModelIndex &parent, co
 
 QString wordsOf(const DhcpdConfigModel &model, const QModelIndex &index)
 {
-    const DhcpdConfigStatement &statement = *model.statementFor(index);
+    const DhcpdConfigStatement &statement{*model.statementFor(index)};
     return statement.isRoot() ? QString{} : statement.joinedWords();
 }
 
-/// Every statement of a configuration in the program's own layout, behind the blocks that it stands in.
+/// Every statement of a configuration in the program's own layout, behind the blocks around it.
 QStringList placedLines(const QByteArray &content)
 {
     QStringList placed;
     QStringList blocks;
     for (const QByteArray &bytes : content.split('\n')) {
-        QString line = QString::fromUtf8(bytes).trimmed();
+        QString line{QString::fromUtf8(bytes).trimmed()};
         if (line == QLatin1String{"}"}) {
             blocks.removeLast();
             continue;
         }
-        const bool opens = line.endsWith(QLatin1String{" {"});
+        const bool opens{line.endsWith(QLatin1String{" {"})};
         if (opens)
             line.chop(2);
         if (!line.isEmpty())
@@ -66,9 +67,34 @@ QStringList placedLines(const QByteArray &content)
     return placed;
 }
 
+/// The rows of a tree, each as "label: value", or as its label where it has no value.
+QStringList shownRows(const QAbstractItemModel &model)
+{
+    QStringList rows;
+    forEachIndex(model, {}, [&](const QModelIndex &index) {
+        const QString value{index.siblingAtColumn(1).data().toString().trimmed()};
+        rows.append(index.data().toString() + (value.isEmpty() ? QString{} : QStringLiteral(": ") + value));
+    });
+    return rows;
+}
+
+/// The lines that are only in `before`, behind a "-", and those that are only in `after`, behind a "+".
+QStringList differences(const QStringList &before, const QStringList &after)
+{
+    QStringList added{after};
+    QStringList changes;
+    for (const QString &line : before) {
+        if (!added.removeOne(line))
+            changes.append(QLatin1Char{'-'} + line);
+    }
+    for (const QString &line : qAsConst(added))
+        changes.append(QLatin1Char{'+'} + line);
+    return changes;
+}
+
 QAction *entryOf(const QMenu &menu, const QString &text)
 {
-    const QList<QAction *> actions = menu.actions();
+    const QList<QAction *> actions{menu.actions()};
     const auto found =
         std::find_if(actions.cbegin(), actions.cend(), [&](const QAction *action) { return action->text() == text; });
     return found == actions.cend() ? nullptr : *found;
@@ -77,7 +103,7 @@ QAction *entryOf(const QMenu &menu, const QString &text)
 QStringList itemsOf(const QListWidget &list)
 {
     QStringList items;
-    for (int row = 0; row < list.count(); ++row)
+    for (int row{0}; row < list.count(); ++row)
         items.append(list.item(row)->text());
     return items;
 }
@@ -85,8 +111,8 @@ QStringList itemsOf(const QListWidget &list)
 QStringList cellsOf(const QTableView &table)
 {
     QStringList cells;
-    for (int row = 0; row < table.model()->rowCount(); ++row) {
-        for (int column = 0; column < table.model()->columnCount(); ++column)
+    for (int row{0}; row < table.model()->rowCount(); ++row) {
+        for (int column{0}; column < table.model()->columnCount(); ++column)
             cells.append(table.model()->index(row, column).data().toString());
     }
     return cells;
@@ -98,32 +124,40 @@ QString stateOf(const QCheckBox &box)
            (box.isEnabled() ? QString{} : QStringLiteral("*")) + QLatin1Char{' '} + box.text();
 }
 
+/// The text of a field or caption; none for a widget that only holds others.
+std::optional<QString> textOf(const QWidget *widget)
+{
+    const QString comma{QStringLiteral(", ")};
+    if (const auto *label = qobject_cast<const QLabel *>(widget))
+        return label->text();
+    if (const auto *line = qobject_cast<const QLineEdit *>(widget))
+        return line->text();
+    if (const auto *text = qobject_cast<const QTextEdit *>(widget))
+        return text->toPlainText();
+    if (const auto *number = qobject_cast<const QSpinBox *>(widget))
+        return number->text();
+    if (const auto *list = qobject_cast<const QListWidget *>(widget))
+        return itemsOf(*list).join(comma);
+    if (const auto *table = qobject_cast<const QTableView *>(widget))
+        return cellsOf(*table).join(comma);
+    if (const auto *box = qobject_cast<const QCheckBox *>(widget))
+        return stateOf(*box);
+    return {};
+}
+
 void appendShown(const QWidget &parent, QStringList &texts)
 {
-    const QString comma = QStringLiteral(", ");
     for (QObject *child : parent.children()) {
         const auto *widget = qobject_cast<const QWidget *>(child);
         if (!widget || widget->isHidden() || qobject_cast<const QDialogButtonBox *>(widget))
             continue;
-        if (const auto *label = qobject_cast<const QLabel *>(widget))
-            texts.append(label->text());
-        else if (const auto *line = qobject_cast<const QLineEdit *>(widget))
-            texts.append(line->text());
-        else if (const auto *text = qobject_cast<const QTextEdit *>(widget))
-            texts.append(text->toPlainText());
-        else if (const auto *number = qobject_cast<const QSpinBox *>(widget))
-            texts.append(number->text());
-        else if (const auto *list = qobject_cast<const QListWidget *>(widget))
-            texts.append(itemsOf(*list).join(comma));
-        else if (const auto *table = qobject_cast<const QTableView *>(widget))
-            texts.append(cellsOf(*table).join(comma));
-        else if (const auto *box = qobject_cast<const QCheckBox *>(widget))
-            texts.append(stateOf(*box));
-        else {
-            if (const auto *group = qobject_cast<const QGroupBox *>(widget))
-                texts.append(group->title());
-            appendShown(*widget, texts);
+        if (const std::optional<QString> text{textOf(widget)}) {
+            texts.append(*text);
+            continue;
         }
+        if (const auto *group = qobject_cast<const QGroupBox *>(widget))
+            texts.append(group->title());
+        appendShown(*widget, texts);
     }
 }
 
@@ -146,6 +180,7 @@ TopologyWindow::TopologyWindow(const QByteArray &configuration)
     writeTestFile(paths::configuration(), configuration);
     m_window = m_machine.openWindow();
     m_opened = content();
+    m_shownAtFirst = shownRows(model());
     QObject::connect(&model(), &DhcpdConfigModel::dataChanged, &window(), [this] { ++m_notices; });
     QObject::connect(&model(), &DhcpdConfigModel::modelReset, &window(), [this] { ++m_resets; });
 }
@@ -166,7 +201,7 @@ QAction &TopologyWindow::action(const char *name) const
 
 QModelIndex TopologyWindow::find(const QString &statement, int column) const
 {
-    const QModelIndex network = model().index(0, column);
+    const QModelIndex network{model().index(0, column)};
     if (statement.isEmpty())
         return network;
     QModelIndex found;
@@ -193,13 +228,13 @@ QStringList TopologyWindow::openBranches() const
 
 bool TopologyWindow::isInView(const QModelIndex &index) const
 {
-    const QRect rectangle = tree().visualRect(index);
+    const QRect rectangle{tree().visualRect(index)};
     return !rectangle.isEmpty() && tree().viewport()->rect().contains(rectangle.center());
 }
 
 void TopologyWindow::select(const QString &statement, int column) const
 {
-    const QModelIndex index = find(statement, column);
+    const QModelIndex index{find(statement, column)};
     tree().scrollTo(index);
     QTest::mouseClick(tree().viewport(), Qt::LeftButton, {}, tree().visualRect(index).center());
     QCOMPARE(tree().currentIndex(), index);
@@ -216,10 +251,10 @@ void TopologyWindow::choose(ModalBoxes &boxes, const QString &statement, const Q
 {
     const auto clickEntries = [entries](QMenu *menu) {
         for (const QString &entry : entries) {
-            QAction *action = menu ? entryOf(*menu, entry) : nullptr;
+            QAction *action{menu ? entryOf(*menu, entry) : nullptr};
             if (!action)
                 qFatal("no entry \"%s\"", qPrintable(entry));
-            QMenu *submenu = action->menu();
+            QMenu *submenu{action->menu()};
             QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(action).center());
             if (submenu)
                 QTRY_VERIFY(submenu->isVisible());
@@ -232,7 +267,7 @@ void TopologyWindow::choose(ModalBoxes &boxes, const QString &statement, const Q
 void TopologyWindow::openMenu(ModalBoxes &boxes, const QString &statement, const std::function<void(QMenu *menu)> &use,
                               const std::function<void()> &expectAnswers) const
 {
-    const QModelIndex index = find(statement);
+    const QModelIndex index{find(statement)};
     tree().scrollTo(index);
     boxes.expectMenu(use);
     if (expectAnswers)
@@ -244,20 +279,19 @@ void TopologyWindow::openMenu(ModalBoxes &boxes, const QString &statement, const
 
 QByteArray TopologyWindow::content() const { return model().fileContent(); }
 
-QStringList TopologyWindow::changes() const
-{
-    QStringList came = placedLines(content());
-    QStringList changes;
-    for (const QString &line : placedLines(m_opened)) {
-        if (!came.removeOne(line))
-            changes.append(QLatin1Char{'-'} + line);
-    }
-    for (const QString &line : qAsConst(came))
-        changes.append(QLatin1Char{'+'} + line);
-    return changes;
-}
+QStringList TopologyWindow::changes() const { return differences(placedLines(m_opened), placedLines(content())); }
+
+QStringList TopologyWindow::shownChanges() const { return differences(m_shownAtFirst, shownRows(model())); }
 
 bool TopologyWindow::offersSave() const { return action("aSave").isEnabled(); }
+
+QByteArray TopologyWindow::saveToFile(ModalBoxes &boxes) const
+{
+    boxes.expectBox(saveQuestion(), QMessageBox::Save);
+    QTest::keyClick(window().windowHandle(), Qt::Key_S, Qt::ControlModifier);
+    boxes.verify();
+    return readTestFile(paths::configuration());
+}
 
 QStringList shownIn(const QWidget &dialog)
 {
@@ -269,7 +303,7 @@ QStringList shownIn(const QWidget &dialog)
 Fill type(const QStringList &texts)
 {
     return [texts](ModalBoxes & /*boxes*/, QDialog * /*dialog*/) {
-        for (int i = 0; i < texts.size(); ++i) {
+        for (int i{0}; i < texts.size(); ++i) {
             if (i > 0)
                 driver::press(Qt::Key_Tab);
             if (!texts.at(i).isNull())
@@ -295,7 +329,7 @@ Fill typeInCell(int row, int column, const QString &text)
 {
     return [=](ModalBoxes & /*boxes*/, QDialog *dialog) {
         auto *table = driver::find<QTableView>(*dialog);
-        const QPoint center = table->visualRect(table->model()->index(row, column)).center();
+        const QPoint center{table->visualRect(table->model()->index(row, column)).center()};
         QTest::mouseClick(table->viewport(), Qt::LeftButton, {}, center);
         QTest::mouseDClick(table->viewport(), Qt::LeftButton, {}, center);
         QVERIFY(qobject_cast<QLineEdit *>(QApplication::focusWidget()));
@@ -308,8 +342,8 @@ Fill addRoute(const QStringList &cells, bool ms)
 {
     return [=](ModalBoxes &boxes, QDialog *dialog) {
         driver::click(driver::find<QPushButton>(*dialog, QStringLiteral("addButton")));
-        const int row = driver::find<QTableView>(*dialog)->model()->rowCount() - 1;
-        for (int column = 0; column < cells.size(); ++column)
+        const int row{driver::find<QTableView>(*dialog)->model()->rowCount() - 1};
+        for (int column{0}; column < cells.size(); ++column)
             typeInCell(row, column, cells.at(column))(boxes, dialog);
         auto *kind = driver::find<QCheckBox>(*dialog);
         if (kind->isChecked() != ms)
@@ -321,7 +355,8 @@ void save(const QDialog &dialog)
 {
     const auto *buttons = driver::find<QDialogButtonBox>(dialog, QStringLiteral("buttonBox"));
     // The dialog of routes deliberately says Yes.
-    const auto accepting = buttons->button(QDialogButtonBox::Save) ? QDialogButtonBox::Save : QDialogButtonBox::Yes;
+    const QDialogButtonBox::StandardButton accepting{buttons->button(QDialogButtonBox::Save) ? QDialogButtonBox::Save
+                                                                                             : QDialogButtonBox::Yes};
     driver::click(dialog, accepting);
 }
 

@@ -4,6 +4,7 @@
 #include "app/fmain.h"
 #include "tests/app/testmachine.h"
 #include "tests/support/modalboxes.h"
+#include "tests/support/text.h"
 
 #include <QByteArray>
 #include <QModelIndex>
@@ -19,11 +20,14 @@ class QDialog;
 class QMenu;
 class QTreeView;
 
-inline QString text(const char *utf8) { return QString::fromUtf8(utf8); }
 /// The texts between " | ".
 inline QStringList list(const char *bars) { return text(bars).split(text(" | ")); }
 
-/// The main window on a configuration, whose topology tree is driven as by a user. The bind9 package is installed.
+/// The entries that lead to a command of a submenu of the context menus.
+inline QStringList parameter(const char *entry) { return {text("Add parameter"), text(entry)}; }
+inline QStringList option(const char *entry) { return {text("Add parameter"), text("Add option"), text(entry)}; }
+
+/// The main window on a configuration, its topology tree driven the way a user does it. The bind9 package is installed.
 ///
 /// A statement is named by the beginning of its words, joined by spaces; the "All network" node by an empty text.
 class TopologyWindow final
@@ -53,17 +57,22 @@ public:
     /// opens is to be announced in `expectAnswers`.
     void choose(ModalBoxes &boxes, const QString &statement, const QStringList &entries,
                 const std::function<void()> &expectAnswers = {}) const;
-    /// Clicks the statement with the right button and hands over the menu that opens.
+    /// Clicks the statement with the right button and passes the menu that opens to `use`.
     void openMenu(ModalBoxes &boxes, const QString &statement, const std::function<void(QMenu *menu)> &use,
                   const std::function<void()> &expectAnswers = {}) const;
 
     /// The configuration as a save would write it.
     QByteArray content() const;
-    /// What has changed since the window opened: every line that went ("-") or came ("+"), behind those of the blocks
-    /// around it.
+    /// What has changed since the window opened: every line that was removed ("-") or added ("+"), behind the headings
+    /// of the blocks around it.
     QStringList changes() const;
+    /// What has changed in the tree since the window opened: every row that was removed ("-") or added ("+"), as
+    /// "label: value".
+    QStringList shownChanges() const;
     bool offersSave() const;
-    /// How often the model told of a change since the window opened.
+    /// Saves the configuration with the keyboard, and returns what the file holds then.
+    QByteArray saveToFile(ModalBoxes &boxes) const;
+    /// How often the model has reported a change since the window opened.
     int notices() const { return m_notices; }
     int resets() const { return m_resets; }
 
@@ -71,6 +80,7 @@ private:
     TestMachine m_machine;
     std::unique_ptr<FMain> m_window;
     QByteArray m_opened;
+    QStringList m_shownAtFirst;
     int m_notices{};
     int m_resets{};
 };
@@ -79,7 +89,7 @@ private:
 using Fill = std::function<void(ModalBoxes &boxes, QDialog *dialog)>;
 Q_DECLARE_METATYPE(Fill)
 
-/// What an input dialog is to show, and what to do in it.
+/// What an input dialog should show, and what to do in it.
 struct Input final
 {
     QString title;
@@ -104,10 +114,10 @@ Fill typeInCell(int row, int column, const QString &text);
 /// Presses the button that accepts a dialog.
 void save(const QDialog &dialog);
 
-/// The question of all commands on free text.
+/// The question before every editor of free text.
 ModalBoxes::Box advancedBox();
 
-/// The next dialog is like `input`, filled and saved; with an `error`, this box comes next.
+/// The next dialog is like `input`, is filled and saved; with an `error`, a box that says it comes next.
 void expectSaved(ModalBoxes &boxes, const Input &input, const QString &error = {});
-/// The next dialog is like `input`, filled and cancelled.
+/// The next dialog is like `input`, is filled and cancelled.
 void expectCancelled(ModalBoxes &boxes, const Input &input);

@@ -26,31 +26,22 @@
 #include <algorithm>
 #include <csignal>
 #include <sys/resource.h>
+#include <sys/syscall.h>
+#include <unistd.h>
 
 namespace {
 
-const QByteArray configuration = R"(default-lease-time 600;
+const QByteArray configuration{R"(default-lease-time 600;
 max-lease-time 7200;
 option domain-name "example.org";
 option ntp-servers 10.0.0.4;
 subnet 10.0.0.0 netmask 255.255.255.0 {
     range 10.0.0.10 10.0.0.99;
 }
-)";
+)"};
 
-// What reading and writing leave of it.
-const QByteArray lastStatement = "subnet 10.0.0.0 netmask 255.255.255.0";
-
-const QString rewriteText =
-    QStringLiteral("Current configuration in file will be rewrited.\nDo you want to save changes?");
-const QString overwriteText =
-    QStringLiteral("The configuration has been changed.\nDo you want to overwrite the configuration?");
-
-ModalBoxes::Box saveQuestion(const QString &text = rewriteText)
-{
-    return {QMessageBox::Information, QStringLiteral("Information"), text, QMessageBox::Save | QMessageBox::Cancel,
-            QMessageBox::Save};
-}
+// The configuration as it is written after it was read.
+const QByteArray lastStatement{"subnet 10.0.0.0 netmask 255.255.255.0"};
 
 ModalBoxes::Box reloadQuestion()
 {
@@ -64,7 +55,7 @@ ModalBoxes::Box cannotWrite()
     return errorBox(QStringLiteral("Unable to open file '%1' for write").arg(paths::configuration()));
 }
 
-/// The window on the configuration, and how often it is told of a change of the file.
+/// The window on the configuration, and how often it was notified of a change of the file.
 struct Site final
 {
     Site(const TestMachine &machine, ModalBoxes &modalBoxes)
@@ -91,7 +82,7 @@ struct Site final
     void pressSave() const { QTest::keyClick(window.get(), Qt::Key_S, Qt::ControlModifier); }
     void pressReload() const { QTest::keyClick(window.get(), Qt::Key_F5); }
 
-    /// Changes something and saves it; the question is expected to read so.
+    /// Changes something and saves it; `text` is what the question should say.
     void save(const QString &text) const
     {
         modify();
@@ -108,10 +99,10 @@ struct Site final
         boxes.verify();
     }
 
-    /// Lets the notices come that are due.
+    /// Waits until every notice that is due has come.
     void settle() const
     {
-        int before = 0;
+        int before{0};
         do {
             before = notices.count();
             QTest::qWait(250);
@@ -125,16 +116,16 @@ struct Site final
     QSignalSpy notices;
 };
 
-/// A change of the file in one notice.
+/// Changes the file so that there is one notice of it.
 void changeOutside(const Site &site)
 {
-    const int before = site.notices.count();
+    const int before{site.notices.count()};
     runOutside(paths::configuration(), R"(echo '# by hand' >>"$1")");
     QTRY_VERIFY(site.notices.count() > before);
     site.settle();
 }
 
-/// What tells the window's watch that the system has seen a change of `file`.
+/// The watcher from which the window learns of changes of `file`.
 const QFileSystemWatcher *watcherOf(const FMain &window, const QString &file)
 {
     const auto watchers = window.findChildren<QFileSystemWatcher *>();
@@ -143,7 +134,10 @@ const QFileSystemWatcher *watcherOf(const FMain &window, const QString &file)
     return found == watchers.end() ? nullptr : *found;
 }
 
-/// Every write fails while this object lives, with no file or directory changed for it.
+/// What happens, once, as soon as a save has renamed its file into place, with nobody watching the file yet.
+std::function<void()> afterRename;
+
+/// Makes every write fail while it lives, without any change to a file or directory.
 class FullDisk final
 {
 public:
@@ -175,7 +169,7 @@ QList<QByteArray> backups()
     return contents;
 }
 
-// Closes the window with its changes saved, which fails.
+// Closes the window and chooses to save the changes, which fails.
 void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
 {
     boxes.expectDialog<QMessageBox>(
@@ -188,6 +182,16 @@ void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
 }
 
 } // namespace
+
+// In place of the system library's. A save syncs the directory once the new file is there.
+int fsync(int descriptor)
+{
+    const auto result = static_cast<int>(syscall(SYS_fsync, descriptor));
+    const QFileInfo synced{QFile::symLinkTarget(QStringLiteral("/proc/self/fd/%1").arg(descriptor))};
+    if (afterRename && synced == QFileInfo{paths::configurationDirectory()})
+        std::exchange(afterRename, {})();
+    return result;
+}
 
 class FileCommandsTest final : public QObject
 {
@@ -210,6 +214,7 @@ private slots:
     void failedSaveKeepsChangedOutside();
     void changeWhileAFailureIsShownIsNoticed();
     void noticeOfTheReplacedVersionIsDropped();
+    void changeRightAfterTheWriteIsNoticed();
     void nothingIsSavedFromNothing_data();
     void nothingIsSavedFromNothing();
     void bytesSurvive_data();
@@ -267,7 +272,7 @@ void FileCommandsTest::savesWhatTheTreeShows()
     const Site site{*m_machine, *m_boxes};
     site.save(rewriteText);
     QVERIFY(!site.isModified());
-    const QByteArray saved = readTestFile(paths::configuration());
+    const QByteArray saved{readTestFile(paths::configuration())};
     QCOMPARE(saved, site.model->fileContent());
     QVERIFY(saved.contains("option ntp-servers 10.0.0.4;"));
     QVERIFY(!saved.contains(lastStatement));
@@ -278,9 +283,9 @@ void FileCommandsTest::savingShowsTheWholeTopology()
 {
     const Site site{*m_machine, *m_boxes};
     site.tree->collapseAll();
-    for (int section = 0; section < 2; ++section)
+    for (int section{0}; section < 2; ++section)
         site.tree->header()->resizeSection(section, site.tree->header()->minimumSectionSize());
-    const int narrow = site.tree->header()->sectionSize(0);
+    const int narrow{site.tree->header()->sectionSize(0)};
     site.save(rewriteText);
     QCOMPARE(site.tree->currentIndex(), site.network());
     QVERIFY(site.tree->isExpanded(site.network()));
@@ -308,7 +313,7 @@ void FileCommandsTest::savesInARowRewrite()
     site.save(rewriteText);
     site.settle();
     QCOMPARE(site.notices.count(), 0);
-    // Neither of the two hides a change by others.
+    // Neither of the two hides a change by somebody else.
     changeOutside(site);
     site.save(overwriteText);
     site.save(rewriteText);
@@ -334,10 +339,10 @@ void FileCommandsTest::outsideChangeIsNoticed()
     runOutside(paths::configuration(), command);
     QTRY_VERIFY(site.notices.count() > 0);
     site.settle();
-    changeOutside(site); // the file that is there now is watched
+    changeOutside(site); // the file that is there now is being watched
     site.save(overwriteText);
     QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
-    changeOutside(site); // and the one that was saved
+    changeOutside(site); // and so is the one that was saved
     site.save(overwriteText);
 }
 
@@ -349,7 +354,7 @@ void FileCommandsTest::burstOfWritesIsFewNotices()
     runOutside(paths::configuration(), R"(i=0; while [ $i -lt 1000 ]; do echo '# again' >>"$1"; i=$((i + 1)); done)");
     site.settle();
     QVERIFY(site.notices.count() > 0);
-    // Each notice ends a tenth of a second, however long the writes took.
+    // Each notice covers a tenth of a second, however long the writes took.
     QVERIFY(site.notices.count() <= timer.elapsed() / 100 + 1);
     site.notices.clear();
     changeOutside(site);
@@ -368,7 +373,7 @@ void FileCommandsTest::changeDuringTheQuestionIsIgnored()
 {
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&site](QMessageBox *box) {
         changeOutside(site);
         QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
@@ -384,8 +389,8 @@ void FileCommandsTest::failedSaveChangesNothing()
 {
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    const QByteArray unsaved = site.model->fileContent();
-    ModalBoxes &boxes = *m_boxes;
+    const QByteArray unsaved{site.model->fileContent()};
+    ModalBoxes &boxes{*m_boxes};
     std::unique_ptr<FullDisk> disk;
     boxes.expectDialog<QMessageBox>([&disk](QMessageBox *box) {
         disk = std::make_unique<FullDisk>();
@@ -399,8 +404,8 @@ void FileCommandsTest::failedSaveChangesNothing()
     QCOMPARE(site.model->fileContent(), unsaved);
     QCOMPARE(readTestFile(paths::configuration()), configuration);
 
-    // No notice of a write that never was: the next change is still taken for the program's own, as after a cancelled
-    // save.
+    // There was no write, so there is no notice of it, and the next change is still taken for the program's own, as
+    // after a cancelled save.
     site.settle();
     changeOutside(site);
     site.save(rewriteText);
@@ -412,7 +417,7 @@ void FileCommandsTest::failedSaveKeepsChangedOutside()
     runOutside(paths::configuration(), R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
     boxes.expectBox(cannotWrite(), QMessageBox::Ok);
     site.pressSave();
@@ -429,7 +434,7 @@ void FileCommandsTest::changeWhileAFailureIsShownIsNoticed()
 {
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     std::unique_ptr<FullDisk> disk;
     boxes.expectDialog<QMessageBox>([&disk](QMessageBox *box) {
         disk = std::make_unique<FullDisk>();
@@ -451,7 +456,7 @@ void FileCommandsTest::noticeOfTheReplacedVersionIsDropped()
 {
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&site](QMessageBox *box) {
         // Saved as soon as the system tells of the change, before that becomes a notice.
         QSignalSpy told{watcherOf(*site.window, paths::configuration()), &QFileSystemWatcher::fileChanged};
@@ -465,6 +470,20 @@ void FileCommandsTest::noticeOfTheReplacedVersionIsDropped()
     site.save(rewriteText);
 }
 
+void FileCommandsTest::changeRightAfterTheWriteIsNoticed()
+{
+    const Site site{*m_machine, *m_boxes};
+    const QByteArray others{"group others {\n}\ngroup more {\n}\n"};
+    afterRename = [&others] { writeTestFile(paths::configuration(), others); };
+    site.save(rewriteText);
+    QVERIFY(!afterRename);
+    site.settle();
+    QCOMPARE(readTestFile(paths::configuration()), others);
+    QVERIFY(site.model->fileContent().contains("group others"));
+    site.save(overwriteText);
+    site.save(rewriteText);
+}
+
 void FileCommandsTest::nothingIsSavedFromNothing_data()
 {
     QTest::addColumn<bool>("missingAtStart");
@@ -475,7 +494,7 @@ void FileCommandsTest::nothingIsSavedFromNothing_data()
 void FileCommandsTest::nothingIsSavedFromNothing()
 {
     QFETCH(bool, missingAtStart);
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     const auto remove = [&boxes] {
         QVERIFY(QFile::remove(paths::configuration()));
         boxes.expectBox(cannotRead(), QMessageBox::Ok);
@@ -491,7 +510,7 @@ void FileCommandsTest::nothingIsSavedFromNothing()
     boxes.verify();
     QCOMPARE(site.model->rowCount(), 0);
 
-    // No command adds anything to it, or opens a dialog that could.
+    // No command adds anything, or opens a dialog that could.
     for (QAction *action : site.window->findChildren<QAction *>(QRegularExpression{QStringLiteral("^aAdd")})) {
         action->setEnabled(true);
         action->trigger();
@@ -521,9 +540,9 @@ void FileCommandsTest::bytesSurvive()
     QFETCH(QByteArray, statement);
     writeTestFile(paths::configuration(), statement + configuration);
     const Site site{*m_machine, *m_boxes};
-    for (int round = 0; round < 2; ++round) {
+    for (int round{0}; round < 2; ++round) {
         site.save(rewriteText);
-        const QByteArray saved = readTestFile(paths::configuration());
+        const QByteArray saved{readTestFile(paths::configuration())};
         QVERIFY2(saved.contains(statement), saved.constData());
     }
 }
@@ -534,7 +553,7 @@ void FileCommandsTest::reloadReadsTheFile()
     site.modify();
     writeTestFile(paths::configuration(), "group {\n    host a {\n    }\n}\n");
     site.tree->collapseAll();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     site.pressReload();
     boxes.verify();
@@ -550,8 +569,8 @@ void FileCommandsTest::reloadCanBeDeclined()
     for (const auto answer : {Qt::Key_Escape, Qt::Key_N}) {
         const Site site{*m_machine, *m_boxes};
         site.modify();
-        const QByteArray unsaved = site.model->fileContent();
-        ModalBoxes &boxes = *m_boxes;
+        const QByteArray unsaved{site.model->fileContent()};
+        ModalBoxes &boxes{*m_boxes};
         if (answer == Qt::Key_Escape)
             boxes.expectBox(reloadQuestion(), answer);
         else
@@ -567,7 +586,7 @@ void FileCommandsTest::reloadKeepsChangedOutside()
 {
     const Site site{*m_machine, *m_boxes};
     changeOutside(site);
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     site.pressReload();
     boxes.verify();
@@ -604,9 +623,9 @@ void FileCommandsTest::busyCursorShowsWhileMuchIsLoaded()
     QFETCH(bool, busy);
     writeTestFile(paths::configuration(), configuration + '#' + QByteArray(size, 'x') + '\n');
     const Site site{*m_machine, *m_boxes};
-    bool wasBusy = false;
+    bool wasBusy{false};
     connect(site.model, &DhcpdConfigModel::dataChanged, this, [&wasBusy] { wasBusy = isCursorBusy(); });
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     site.pressReload();
     boxes.verify();
@@ -621,10 +640,10 @@ void FileCommandsTest::busyCursorShowsWhileMuchIsSaved()
     writeTestFile(paths::configuration(), configuration + '#' + QByteArray(size, 'x') + '\n');
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    const FullDisk full; // so that something is told while the file is written
-    bool wasBusy = false;
+    const FullDisk full; // so that a message comes up while the file is being written
+    bool wasBusy{false};
     connect(site.model, &DhcpdConfigModel::error, this, [&wasBusy] { wasBusy = isCursorBusy(); });
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(saveQuestion(), QMessageBox::Save);
     boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
         QCOMPARE(box->text(), cannotWrite().text);
@@ -641,7 +660,7 @@ void FileCommandsTest::refusedLoadIsToldWithoutTheBusyCursor()
 {
     const Site site{*m_machine, *m_boxes};
     writeTestFile(paths::configuration(), QByteArray{"group {\n"}.repeated(600'000)); // nested too deep
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
         QCOMPARE(box->text(), cannotRead().text);
@@ -677,7 +696,7 @@ void FileCommandsTest::closing()
     if (modified)
         site.modify();
 
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     QStringList texts;
     for (const int answer : answers) {
         boxes.expectDialog<QMessageBox>([&texts, answer](QMessageBox *box) {
@@ -701,7 +720,7 @@ void FileCommandsTest::closingQuestionHasNoDefault()
 {
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
         QCOMPARE(box->icon(), QMessageBox::Question);
         QCOMPARE(box->windowTitle(), QStringLiteral("Confirmation"));
@@ -720,7 +739,7 @@ void FileCommandsTest::unwrittenConfigurationIsKept()
     runOutside(paths::configuration(), R"(rm "$1"; mkdir "$1")");
     site.settle();
     site.modify();
-    const QByteArray unsaved = site.model->fileContent();
+    const QByteArray unsaved{site.model->fileContent()};
     closeAlthoughNothingCanBeSaved(site, *m_boxes);
     QCOMPARE(backups(), QList<QByteArray>{unsaved});
 }
@@ -728,7 +747,7 @@ void FileCommandsTest::unwrittenConfigurationIsKept()
 void FileCommandsTest::nothingIsKeptOfNothing()
 {
     const Site site{*m_machine, *m_boxes};
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     QVERIFY(QFile::remove(paths::configuration()));
     boxes.expectBox(reloadQuestion(), QMessageBox::Yes);
     boxes.expectBox(cannotRead(), QMessageBox::Ok);
@@ -757,13 +776,13 @@ void FileCommandsTest::servedInterfaces()
     QFETCH(bool, changed);
     QFETCH(bool, accepted);
     QFETCH(bool, saved);
-    // Names that come after those of any machine: only the last of all is written without a space behind it.
-    const QByteArray before = "# kept\nINTERFACESv4=\"zz7 zz8\"  \nINTERFACESv6=\"\"";
-    const QByteArray after = "# kept\nINTERFACESv4=\"zz8\"\nINTERFACESv6=\"\"";
+    // Names that sort behind those of any machine: only the very last is written without a space behind it.
+    const QByteArray before{"# kept\nINTERFACESv4=\"zz7 zz8\"  \nINTERFACESv6=\"\""};
+    const QByteArray after{"# kept\nINTERFACESv4=\"zz8\"\nINTERFACESv6=\"\""};
     writeTestFile(paths::serverDefaults(), before);
     const Site site{*m_machine, *m_boxes};
 
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<InterfacesDialog>([&site, changed, accepted](InterfacesDialog *dialog) {
         QCOMPARE(dialog->windowTitle(), QStringLiteral("Select interfaces"));
         QCOMPARE(dialog->parent(), site.window.get());
@@ -788,7 +807,7 @@ void FileCommandsTest::defaultsFileIsReadAgain()
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"zz7\"\n");
     const Site site{*m_machine, *m_boxes};
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"zz9\"\n");
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     QStringList checked;
     boxes.expectDialog<InterfacesDialog>([&checked](InterfacesDialog *dialog) {
         for (const QCheckBox *box : dialog->findChildren<QCheckBox *>()) {
@@ -804,11 +823,11 @@ void FileCommandsTest::defaultsFileIsReadAgain()
 
 namespace {
 
-const QByteArray banner = "Internet Systems Consortium DHCP Server 4.4.3-P1\n"
-                          "For info, please visit https://www.isc.org/software/dhcp/\n";
+const QByteArray banner{"Internet Systems Consortium DHCP Server 4.4.3-P1\n"
+                        "For info, please visit https://www.isc.org/software/dhcp/\n"};
 
-/// The lines of a DHCP server that leaves its process number and the text that it was given, prints `output`, in which
-/// "$3" is the path of that text, and ends with the commands.
+/// The script of a DHCP server that leaves its process id and the text that it was given, prints `output`, in which
+/// "$3" is the path of that text, and ends with `commands`.
 QByteArray server(const QByteArray &output, const QByteArray &end)
 {
     return "here=${0%/*}\n"
@@ -821,9 +840,9 @@ QByteArray server(const QByteArray &output, const QByteArray &end)
            end + "\n";
 }
 
-constexpr int verdictMilliseconds = 120'000; // how long a test waits for the real server's at most
+constexpr int verdictMilliseconds{120'000}; // how long a test waits at most for the real server's
 
-/// Whether the server that was asked has ended; false while it was not asked yet.
+/// Whether the server that was asked has ended; false before it was asked.
 bool hasEnded(const TestMachine &machine)
 {
     QFile file{machine.programs().file(QStringLiteral("process"))};
@@ -838,7 +857,7 @@ void FileCommandsTest::verdictOfTheServer_data()
 {
     QTest::addColumn<QByteArray>("output");
     QTest::addColumn<QByteArray>("end");
-    QTest::addColumn<QString>("complaint"); // null when nothing is to be said
+    QTest::addColumn<QString>("complaint"); // null: none
     QTest::addRow("accepted") << banner << QByteArray{"exit 0"} << QString{};
     QTest::addRow("accepted with a warning") << banner + "WARNING: no subnet\n" << QByteArray{"exit 0"} << QString{};
     QTest::addRow("refused") << banner + "WARNING: old\n$3 line 3: semicolon expected.\n  x\n  ^\n$3 line 9: bad.\n"
@@ -861,7 +880,7 @@ void FileCommandsTest::verdictOfTheServer()
     const Site site{*m_machine, *m_boxes};
     site.modify();
 
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&](QMessageBox *box) {
         QTRY_VERIFY(hasEnded(*m_machine));
         if (complaint.isNull()) {
@@ -870,9 +889,9 @@ void FileCommandsTest::verdictOfTheServer()
         } else {
             QTRY_COMPARE(box->informativeText(),
                          QStringLiteral("The DHCP server refuses this configuration:\n") + complaint);
-            // All that it said, with the path that it was given.
-            const QString detail = box->detailedText();
-            const QString said = QString::fromLatin1(output);
+            // Everything that the server said, with the path that it was given.
+            const QString detail{box->detailedText()};
+            const QString said{QString::fromLatin1(output)};
             QVERIFY(QRegularExpression{QRegularExpression::anchoredPattern(QRegularExpression::escape(said).replace(
                                            QStringLiteral("\\$3"), QStringLiteral("/proc/self/fd/[0-9]+")))}
                         .match(detail)
@@ -898,7 +917,7 @@ void FileCommandsTest::serverSeesWhatIsWritten()
     m_machine->programs().install(QStringLiteral("dhcpd"), server({}, "exit 0"));
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&](QMessageBox *box) {
         QTRY_VERIFY(hasEnded(*m_machine));
         QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
@@ -915,7 +934,7 @@ void FileCommandsTest::answerEndsTheCheck()
     m_machine->programs().install(QStringLiteral("dhcpd"), server("$3 line 1: late.\n", "exec sleep 60"));
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&](QMessageBox *box) {
         QTRY_VERIFY(QFile::exists(m_machine->programs().file(QStringLiteral("process"))));
         QVERIFY(!hasEnded(*m_machine));
@@ -933,7 +952,7 @@ void FileCommandsTest::missingServerSaysNothing()
     if (QFile::exists(QStringLiteral("/usr/sbin/dhcpd")))
         QSKIP("a DHCP server is installed in /usr/sbin, where it is always found");
     const Site site{*m_machine, *m_boxes};
-    const QByteArray path = qgetenv("PATH");
+    const QByteArray path{qgetenv("PATH")};
     qputenv("PATH", QFile::encodeName(QFileInfo{paths::configurationDirectory()}.absolutePath()));
     site.cancelSave(rewriteText);
     qputenv("PATH", path);
@@ -960,16 +979,16 @@ void FileCommandsTest::verdictOfTheRealServer()
     m_machine->programs().install(QStringLiteral("dhcpd"), "\"" + QFile::encodeName(m_dhcpd) +
                                                                "\" \"$@\"\nstatus=$?\n"
                                                                "echo $$ >\"${0%/*}/process\"\nexit $status\n");
-    QByteArray text = statement + configuration;
-    for (int host = 0; host < hosts; ++host)
+    QByteArray text{statement + configuration};
+    for (int host{0}; host < hosts; ++host)
         text += "host campus-" + QByteArray::number(host) + " {\n}\n";
     writeTestFile(paths::configuration(), text);
     const Site site{*m_machine, *m_boxes};
     site.modify();
-    const QString complaint = complaintOf(m_dhcpd, site.model->fileContent());
+    const QString complaint{complaintOf(m_dhcpd, site.model->fileContent())};
     QCOMPARE(complaint.isEmpty(), accepted);
 
-    ModalBoxes &boxes = *m_boxes;
+    ModalBoxes &boxes{*m_boxes};
     boxes.expectDialog<QMessageBox>([&](QMessageBox *box) {
         QTRY_VERIFY_WITH_TIMEOUT(hasEnded(*m_machine), verdictMilliseconds);
         if (complaint.isEmpty()) {

@@ -5,6 +5,7 @@
 #include "dialogs/hostinputdialog.h"
 #include "leases/dhcpdleasesmodel.h"
 #include "tests/app/testmachine.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/modalboxes.h"
 #include "tests/support/temporaryroot.h"
 
@@ -24,8 +25,8 @@
 
 namespace {
 
-const QString foundStyle = QStringLiteral("QLineEdit { color: black; }");
-const QString notFoundStyle = QStringLiteral("QLineEdit { color: red; }");
+const QString foundStyle{QStringLiteral("QLineEdit { color: black; }")};
+const QString notFoundStyle{QStringLiteral("QLineEdit { color: red; }")};
 
 QByteArray lease(const QByteArray &address, const QByteArray &name, const QByteArray &state = "active",
                  const QByteArray &mac = "00:00:5e:00:53:01", const QByteArray &end = "2026/03/02 20:00:00")
@@ -34,7 +35,7 @@ QByteArray lease(const QByteArray &address, const QByteArray &name, const QByteA
            ";\n  hardware ethernet " + mac + ";\n  client-hostname \"" + name + "\";\n}\n";
 }
 
-const QByteArray configuration = R"(ddns-hostname gamma;
+const QByteArray configuration{R"(ddns-hostname gamma;
 subnet 10.0.0.0 netmask 255.255.255.0 {
     host nested {
     }
@@ -44,9 +45,9 @@ host delta {
 host delta {
     fixed-address 10.0.0.77;
 }
-)";
+)"};
 
-/// The window, with the leases in front, driven as by a user.
+/// The window with the leases in front, driven the way a user does it.
 struct Site final
 {
     explicit Site(const TestMachine &machine)
@@ -66,7 +67,7 @@ struct Site final
     QStringList addresses() const
     {
         QStringList texts;
-        for (int row = 0; row < table->model()->rowCount(); ++row)
+        for (int row{0}; row < table->model()->rowCount(); ++row)
             texts.append(cell(row, DhcpdLeasesModel::Address));
         return texts;
     }
@@ -81,7 +82,7 @@ struct Site final
     int rowOf(const char *address) const { return addresses().indexOf(QString::fromLatin1(address)); }
     QPoint centre(const char *address, int column = 0) const
     {
-        const QModelIndex index = table->model()->index(rowOf(address), column);
+        const QModelIndex index{table->model()->index(rowOf(address), column)};
         table->scrollTo(index);
         return table->visualRect(index).center();
     }
@@ -107,8 +108,8 @@ struct Site final
     QStringList values() const
     {
         QStringList texts;
-        const QModelIndex network = model->index(0, 0);
-        for (int row = 0; row < model->rowCount(network); ++row)
+        const QModelIndex network{model->index(0, 0)};
+        for (int row{0}; row < model->rowCount(network); ++row)
             texts.append(model->index(row, 1, network).data().toString());
         return texts;
     }
@@ -130,12 +131,7 @@ ModalBoxes::Box goToTopology()
             QMessageBox::Yes};
 }
 
-void press(const QDialog &dialog, QDialogButtonBox::StandardButton button)
-{
-    QTest::mouseClick(dialog.findChild<QDialogButtonBox *>()->button(button), Qt::LeftButton);
-}
-
-void save(HostInputDialog *dialog) { press(*dialog, QDialogButtonBox::Save); }
+void save(HostInputDialog *dialog) { driver::click(*dialog, QDialogButtonBox::Save); }
 
 } // namespace
 
@@ -164,11 +160,14 @@ private slots:
     void reservationIsAdded();
     void reservationGoesToTopology_data();
     void reservationGoesToTopology();
+    void reservationLeavesOutSyntax_data();
+    void reservationLeavesOutSyntax();
     void reservationTakesTheTypedValues();
     void reservationOutlivesAReload();
     void reservationNeedsAConfiguration();
     void reservationNeedsALease();
 
+    void rowsAreAsTallAsALine();
     void placeIsKeptOverAutomaticReloads_data();
     void placeIsKeptOverAutomaticReloads();
     void searchIsKeptOverAutomaticReloads();
@@ -242,7 +241,7 @@ void LeaseCommandsTest::search()
 void LeaseCommandsTest::searchForAnEnd()
 {
     const Site site{*m_machine};
-    const QString end = site.cell(site.rowOf("10.0.1.9"), DhcpdLeasesModel::End);
+    const QString end{site.cell(site.rowOf("10.0.1.9"), DhcpdLeasesModel::End)};
     QVERIFY(!end.isEmpty());
     site.type(end);
     QCOMPARE(site.addresses(), QStringList{QStringLiteral("10.0.1.9")});
@@ -253,7 +252,7 @@ void LeaseCommandsTest::searchForAnEnd()
 void LeaseCommandsTest::clearedSearchShowsEverything()
 {
     const Site site{*m_machine};
-    const QStringList all = site.addresses();
+    const QStringList all{site.addresses()};
     QCOMPARE(all.join(QLatin1Char{' '}), QStringLiteral("10.0.0.9 10.0.0.10 10.0.0.11 10.0.1.9 10.0.1.10"));
     for (const QString &text : {QStringLiteral("beta"), QStringLiteral("zeta")}) {
         site.type(text);
@@ -269,7 +268,7 @@ void LeaseCommandsTest::clearedSearchShowsEverything()
 void LeaseCommandsTest::matchesAreScrolledTo()
 {
     QByteArray leases;
-    for (int i = 0; i < 200; ++i)
+    for (int i{0}; i < 200; ++i)
         leases += lease("10.0.0." + QByteArray::number(i), "some");
     writeTestFile(paths::leases(), leases);
     const Site site{*m_machine};
@@ -278,7 +277,7 @@ void LeaseCommandsTest::matchesAreScrolledTo()
     };
     site.type(QStringLiteral("some"));
     QCOMPARE(site.table->model()->rowCount(), 200);
-    for (int i = 0; i < 199; ++i)
+    for (int i{0}; i < 199; ++i)
         site.press(site.next);
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.199"));
     QVERIFY(currentIsShown());
@@ -308,12 +307,12 @@ void LeaseCommandsTest::stepsVisitOneColumn()
     site.type(QStringLiteral("10.0.0.1"));
     QCOMPARE(site.table->model()->rowCount(), 3);
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.10"));
-    for (int i = 0; i < 3; ++i)
+    for (int i{0}; i < 3; ++i)
         site.press(site.next);
-    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11")); // not the one with the text in its name
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11")); // rather than the one with the text in its name
 }
 
-// Where the user selected a whole row, the steps go on from the match that was last stepped to.
+// After the user has selected a whole row, stepping goes on from the last match that was stepped to.
 void LeaseCommandsTest::stepsForgetASelectedRow()
 {
     const Site site{*m_machine};
@@ -326,7 +325,7 @@ void LeaseCommandsTest::stepsForgetASelectedRow()
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11"));
 
     site.click("10.0.0.9");
-    site.press(site.next); // there is none behind the last
+    site.press(site.next); // there is none after the last
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.9"));
     QCOMPARE(site.table->selectionModel()->selectedIndexes().size(), 6);
     site.press(site.previous);
@@ -355,7 +354,7 @@ void LeaseCommandsTest::menuOpensOverALease()
     QString address;
     boxes.expectDialog<HostInputDialog>([&address](HostInputDialog *dialog) {
         address = dialog->ip();
-        press(*dialog, QDialogButtonBox::Cancel);
+        driver::click(*dialog, QDialogButtonBox::Cancel);
     });
     site.rightClick(site.centre("10.0.0.10", 2));
     boxes.verify();
@@ -378,7 +377,7 @@ void LeaseCommandsTest::dialogShowsTheLease()
 {
     QFETCH(bool, byAction);
     const Site site{*m_machine};
-    site.type(QStringLiteral("10.0.0.1")); // the table's rows are not the model's any more
+    site.type(QStringLiteral("10.0.0.1")); // now the rows of the table are not those of the model
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>([&site](HostInputDialog *dialog) {
         QCOMPARE(dialog->windowTitle(), QStringLiteral("Reserve an IP address"));
@@ -387,7 +386,7 @@ void LeaseCommandsTest::dialogShowsTheLease()
         QCOMPARE(dialog->mac(), QStringLiteral("00:00:5e:00:53:04"));
         QCOMPARE(dialog->name(), QStringLiteral("at-10.0.0.1"));
         QCOMPARE(dialog->size(), dialog->sizeHint());
-        press(*dialog, QDialogButtonBox::Cancel);
+        driver::click(*dialog, QDialogButtonBox::Cancel);
     });
     if (byAction) {
         site.click("10.0.1.9", 4);
@@ -401,7 +400,7 @@ void LeaseCommandsTest::dialogShowsTheLease()
 void LeaseCommandsTest::cancelledReservationChangesNothing()
 {
     const Site site{*m_machine};
-    const QByteArray before = site.model->fileContent();
+    const QByteArray before{site.model->fileContent()};
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>([](HostInputDialog *dialog) { QTest::keyClick(dialog, Qt::Key_Escape); });
     site.doubleClick("10.0.0.10");
@@ -414,28 +413,28 @@ void LeaseCommandsTest::cancelledReservationChangesNothing()
 void LeaseCommandsTest::reservationIsAdded()
 {
     const Site site{*m_machine};
-    const QStringList before = site.values();
+    const QStringList before{site.values()};
     site.tree->collapseAll();
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>(save);
     boxes.expectBox(goToTopology(), QMessageBox::No);
-    site.doubleClick("10.0.1.9"); // in no subnet of the configuration
+    site.doubleClick("10.0.1.9"); // is in no subnet of the configuration
     boxes.verify();
 
     QCOMPARE(site.tabs->currentIndex(), 1);
     QCOMPARE(site.values(), before + QStringList{QStringLiteral("at-10.0.0.1")});
     QVERIFY(site.model->isModified());
-    const QByteArray content = site.model->fileContent();
+    const QByteArray content{site.model->fileContent()};
     QVERIFY(content.contains("host at-10.0.0.1 {"));
     QVERIFY(content.contains("hardware ethernet 00:00:5e:00:53:04;"));
     QVERIFY(content.contains("fixed-address 10.0.1.9;"));
-    const QModelIndex network = site.model->index(0, 0);
+    const QModelIndex network{site.model->index(0, 0)};
     QCOMPARE(site.tree->currentIndex(), network);
-    // The tree is not in view: what adds to it stays off.
+    // The tree is not in view, so the commands that add to it stay disabled.
     QVERIFY(!site.window->findChild<QAction *>(QStringLiteral("aAddHost"))->isEnabled());
     QVERIFY(site.tree->isExpanded(network));
-    for (int row = 1; row < site.model->rowCount(network); ++row) {
-        const QModelIndex child = site.model->index(row, 0, network);
+    for (int row{1}; row < site.model->rowCount(network); ++row) {
+        const QModelIndex child{site.model->index(row, 0, network)};
         QCOMPARE(site.tree->isExpanded(child), site.model->hasChildren(child));
     }
 }
@@ -444,7 +443,7 @@ void LeaseCommandsTest::reservationGoesToTopology_data()
 {
     QTest::addColumn<QByteArray>("leaseName");
     QTest::addColumn<QString>("typedName"); // null: as in the lease
-    QTest::addColumn<int>("row");           // the child of the network that is current in the end; -1: none of them
+    QTest::addColumn<int>("row");           // the child of the network that is current afterwards; -1: none of them
     // The children of the network: ddns-hostname gamma, the subnet, two hosts delta, and the new one.
     QTest::addRow("new host") << QByteArray{"beta"} << QString{} << 4;
     QTest::addRow("name changed") << QByteArray{"beta"} << QStringLiteral("eta") << -1;
@@ -472,10 +471,44 @@ void LeaseCommandsTest::reservationGoesToTopology()
     site.doubleClick("10.0.0.10");
     boxes.verify();
     QCOMPARE(site.tabs->currentIndex(), 0);
-    const QModelIndex network = site.model->index(0, 0);
+    const QModelIndex network{site.model->index(0, 0)};
     QCOMPARE(site.model->rowCount(network), 5);
-    const QModelIndex current = site.tree->currentIndex();
+    const QModelIndex current{site.tree->currentIndex()};
     QCOMPARE(current.isValid() && current.parent() == network ? current.row() : -1, row);
+}
+
+void LeaseCommandsTest::reservationLeavesOutSyntax_data()
+{
+    QTest::addColumn<QByteArray>("leaseName");
+    QTest::addColumn<QString>("name");
+    QTest::addRow("end of a statement") << QByteArray{"pc; deny booting"} << QStringLiteral("pc deny booting");
+    QTest::addRow("block") << QByteArray{"pc { } host x"} << QStringLiteral("pc   host x");
+    QTest::addRow("comment") << QByteArray{"pc#1"} << QStringLiteral("pc1");
+    QTest::addRow("quotes") << QByteArray{R"(\"pc\")"} << QStringLiteral(R"(\pc\)");
+    QTest::addRow("tab") << QByteArray{"p\tc"} << QStringLiteral("pc");
+    QTest::addRow("carriage return") << QByteArray{"p\rc"} << QStringLiteral("pc");
+    QTest::addRow("lowest control characters") << QByteArray{"p\x01\x02"
+                                                             "c"}
+                                               << QStringLiteral("pc");
+    QTest::addRow("highest control character") << QByteArray{"p\x1f"
+                                                             "c"}
+                                               << QStringLiteral("pc");
+    QTest::addRow("other signs") << QByteArray{"p!$%&'()*+,-./:<=>?@[]^_`|~c"}
+                                 << QStringLiteral("p!$%&'()*+,-./:<=>?@[]^_`|~c");
+}
+
+void LeaseCommandsTest::reservationLeavesOutSyntax()
+{
+    QFETCH(QByteArray, leaseName);
+    QFETCH(QString, name);
+    writeTestFile(paths::leases(), lease("10.0.0.10", leaseName));
+    const Site site{*m_machine};
+    ModalBoxes boxes;
+    boxes.expectDialog<HostInputDialog>([&name](HostInputDialog *dialog) {
+        QCOMPARE(dialog->name(), name);
+        QTest::keyClick(dialog, Qt::Key_Escape);
+    });
+    site.doubleClick("10.0.0.10");
 }
 
 void LeaseCommandsTest::reservationTakesTheTypedValues()
@@ -492,7 +525,7 @@ void LeaseCommandsTest::reservationTakesTheTypedValues()
     site.doubleClick("10.0.0.10");
     boxes.verify();
     QCOMPARE(site.tabs->currentIndex(), 1);
-    const QByteArray content = site.model->fileContent();
+    const QByteArray content{site.model->fileContent()};
     QVERIFY(content.contains("host eta {"));
     QVERIFY(content.contains("hardware ethernet 00:00:5e:00:53:ff;"));
     QVERIFY(content.contains("fixed-address 10.0.0.200;"));
@@ -536,6 +569,21 @@ void LeaseCommandsTest::reservationNeedsALease()
     QVERIFY(!site.model->isModified());
 }
 
+void LeaseCommandsTest::rowsAreAsTallAsALine()
+{
+    const QByteArray longName{QByteArray{"a name of many words "}.repeated(40)};
+    writeTestFile(paths::leases(), lease("10.0.0.10", "short") + lease("10.0.0.11", longName) + lease("10.0.0.12", "") +
+                                       lease("10.0.0.13", "\xe2\x80\xa8 two lines"));
+    const Site site{*m_machine};
+    const int line{site.table->fontMetrics().height()};
+    QCOMPARE(site.table->model()->rowCount(), 4);
+    for (int row{0}; row < 4; ++row) {
+        QCOMPARE(site.table->rowHeight(row), site.table->rowHeight(0));
+        QVERIFY(site.table->rowHeight(row) >= line);
+        QVERIFY(site.table->rowHeight(row) < line + line / 2);
+    }
+}
+
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data()
 {
     QTest::addColumn<QByteArray>("command");
@@ -550,7 +598,7 @@ void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
 {
     QFETCH(QByteArray, command);
     QByteArray leases;
-    for (int i = 0; i < 400; ++i)
+    for (int i{0}; i < 400; ++i)
         leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
     writeTestFile(paths::leases(), leases);
     const Site site{*m_machine};
@@ -558,11 +606,11 @@ void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
     site.table->verticalScrollBar()->setValue(site.rowOf("10.0.0.150"));
     QCOMPARE(site.topAddress(), QStringLiteral("10.0.0.150"));
 
-    // Rows come above, within and below what is shown.
+    // Rows appear above, between and below those that are shown.
     QByteArray more;
     for (const char *address : {"9.0.0.1", "10.0.0.201", "10.0.0.202", "11.0.0.1"})
         more += lease(address, "more");
-    for (int round = 0; round < 2; ++round) {
+    for (int round{0}; round < 2; ++round) {
         runOutside(paths::leases(), command, more);
         QTRY_COMPARE(site.table->model()->rowCount(), 404 + round);
         QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.100"));
@@ -592,8 +640,8 @@ void LeaseCommandsTest::busyCursorShowsWhileMuchIsRead_data()
     QTest::addColumn<int>("written");
     QTest::addColumn<int>("after");
     QTest::addColumn<bool>("busy");
-    const QByteArray replace = R"(cat >"$1.new"; mv "$1.new" "$1")";
-    const int many = 32'000;
+    const QByteArray replace{R"(cat >"$1.new"; mv "$1.new" "$1")"};
+    const int many{32'000};
     QTest::addRow("few, replaced") << 1 << replace << 2 << 2 << false;
     QTest::addRow("few, replaced by many") << 1 << replace << many << many << true;
     QTest::addRow("many, replaced") << many << replace << many - 1 << many - 1 << true;
@@ -609,16 +657,16 @@ void LeaseCommandsTest::busyCursorShowsWhileMuchIsRead()
     QFETCH(bool, busy);
     const auto leases = [](int count) {
         QByteArray text;
-        for (int i = 0; i < count; ++i)
+        for (int i{0}; i < count; ++i)
             text += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
         return text;
     };
     writeTestFile(paths::leases(), leases(before));
     const Site site{*m_machine};
 
-    bool wasBusy = false;
+    bool wasBusy{false};
     const auto look = [&wasBusy] { wasBusy = isCursorBusy(); };
-    const QAbstractItemModel *model = site.table->model();
+    const QAbstractItemModel *model{site.table->model()};
     connect(model, &QAbstractItemModel::modelReset, this, look);
     connect(model, &QAbstractItemModel::rowsInserted, this, look);
     runOutside(paths::leases(), command, leases(written));
@@ -634,7 +682,7 @@ void LeaseCommandsTest::clientsNameAddsNoStatements()
     ModalBoxes boxes;
     boxes.expectDialog<HostInputDialog>([](HostInputDialog *dialog) {
         QCOMPARE(dialog->name(), QStringLiteral("x include y"));
-        press(*dialog, QDialogButtonBox::Cancel);
+        driver::click(*dialog, QDialogButtonBox::Cancel);
     });
     site.doubleClick("10.0.0.1");
     boxes.verify();
@@ -649,10 +697,10 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
     QCOMPARE(site.currentAddress(), QStringLiteral("10.0.1.10"));
 
     for (const char *command : {R"(cat >>"$1")", R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")"}) {
-        const int before = site.table->model()->rowCount();
-        const QByteArray address = "9.0.0." + QByteArray::number(before);
+        const int before{site.table->model()->rowCount()};
+        const QByteArray address{"9.0.0." + QByteArray::number(before)};
         runOutside(paths::leases(), command, lease(address, "alphabet") + lease("8.0.0.1", "other"));
-        QTRY_COMPARE(site.table->model()->rowCount(), before + 1); // the filter holds
+        QTRY_COMPARE(site.table->model()->rowCount(), before + 1); // the filter still applies
         QCOMPARE(site.field->text(), QStringLiteral("bet"));
         QCOMPARE(site.field->styleSheet(), foundStyle);
         QVERIFY(site.stepsAreEnabled());
@@ -660,7 +708,7 @@ void LeaseCommandsTest::searchIsKeptOverAutomaticReloads()
         QCOMPARE(site.table->currentIndex().column(), int{DhcpdLeasesModel::HostName});
     }
 
-    // A colour that tells of no match stays as well, although there is one now.
+    // The colour for no match stays as well, although there is one now.
     QTest::keyClick(site.field, Qt::Key_A, Qt::ControlModifier);
     site.type(QStringLiteral("zeta"));
     QCOMPARE(site.field->styleSheet(), notFoundStyle);

@@ -19,7 +19,6 @@
 #include <QScreen>
 #include <QSettings>
 #include <QSortFilterProxyModel>
-#include <QStackedWidget>
 #include <QStatusBar>
 #include <QTableView>
 #include <QTest>
@@ -29,7 +28,7 @@
 
 namespace {
 
-const QByteArray configuration = R"(default-lease-time 600;
+const QByteArray configuration{R"(default-lease-time 600;
 shared-network campus {
     subnet 10.0.1.0 netmask 255.255.255.0 {
         option routers 10.0.1.1;
@@ -40,14 +39,14 @@ subnet 10.0.2.0 netmask 255.255.255.0 {
         hardware ethernet 00:00:5e:00:53:01;
     }
 }
-)";
+)"};
 
 QByteArray lease(const QByteArray &address)
 {
     return "lease " + address + " {\n  hardware ethernet 00:00:5e:00:53:02;\n  binding state active;\n}\n";
 }
 
-// The rows to go down from the top of the tree.
+// The row to take at each level, from the top of the tree down.
 using Place = QVector<int>;
 const Place root{0};
 const Place defaultLeaseTime{0, 0};
@@ -66,7 +65,7 @@ QModelIndex indexOf(const QTreeView *tree, const Place &place)
 
 void click(QTreeView *tree, const Place &place)
 {
-    const QModelIndex index = indexOf(tree, place);
+    const QModelIndex index{indexOf(tree, place)};
     QVERIFY(index.isValid());
     QTest::mouseClick(tree->viewport(), Qt::LeftButton, {}, tree->visualRect(index).center());
     QCOMPARE(tree->currentIndex(), index);
@@ -110,30 +109,6 @@ QStringList enabledAddActions(const FMain &window)
                      {QStringLiteral("aAddSharedNetwork"), QStringLiteral("aAddSubnet"), QStringLiteral("aAddHost")});
 }
 
-// What holds what: a line for each named widget and layout, indented by how deep it lies.
-QStringList outline(const QObject *object, const QString &indent = {})
-{
-    QStringList lines{indent + QString::fromLatin1(object->metaObject()->className()) + QLatin1Char{' '} +
-                      object->objectName()};
-    const auto add = [&](const QObject *child) { lines += outline(child, indent + QLatin1Char{' '}); };
-    if (const auto *layout = qobject_cast<const QLayout *>(object)) {
-        for (int i = 0; i < layout->count(); ++i) {
-            QLayoutItem *item = layout->itemAt(i);
-            add(item->layout() ? static_cast<QObject *>(item->layout()) : item->widget());
-        }
-    } else if (const auto *stack = qobject_cast<const QStackedWidget *>(object)) {
-        for (int i = 0; i < stack->count(); ++i)
-            add(stack->widget(i));
-    } else if (const auto *tabs = qobject_cast<const QTabWidget *>(object)) {
-        for (int i = 0; i < tabs->count(); ++i)
-            add(tabs->widget(i));
-    } else if (const auto *widget = qobject_cast<const QWidget *>(object); widget->layout()) {
-        if (!qobject_cast<const QAbstractItemView *>(object) && !qobject_cast<const QLineEdit *>(object))
-            add(widget->layout());
-    }
-    return lines;
-}
-
 struct ActionRow
 {
     const char *name;
@@ -143,8 +118,8 @@ struct ActionRow
     const char *icon;
 };
 
-// In the order of their creation. Where an action has no tool tip of its own, the tool kit shows its text.
-const ActionRow actionTable[] = {
+// Where an action has no tool tip of its own, Qt shows its text.
+const ActionRow actionTable[]{
     {"aReload", "Reload", "Reload", "F5", "view-refresh"},
     {"aSave", "Save", "Save", "Ctrl+S", "document-save"},
     {"aExit", "Exit", "Exit", "", "application-exit"},
@@ -171,13 +146,13 @@ const ActionRow actionTable[] = {
     {"aAddDHCPDynamicUpdate", "Add DHCP dynamic zone update", "Add DHCP dynamic zone update", "", "configure"},
 };
 
-// An icon theme that has the icons of the window, set while this object lives.
+// An icon theme with all icons of the window, in use while this object lives.
 class IconTheme final
 {
 public:
     IconTheme()
     {
-        const QString theme = m_folder.filePath(QStringLiteral("test-theme"));
+        const QString theme{m_folder.filePath(QStringLiteral("test-theme"))};
         QVERIFY(QDir{}.mkpath(theme + QStringLiteral("/16x16")));
         writeTestFile(theme + QStringLiteral("/index.theme"),
                       "[Icon Theme]\nName=Test\nDirectories=16x16\n[16x16]\nSize=16\nType=Fixed\n");
@@ -222,7 +197,10 @@ private slots:
     void init();
     void cleanup();
 
-    void formIsLaidOut();
+    void widgetsHaveTheirNames_data();
+    void widgetsHaveTheirNames();
+    void widgetsStandInOrder_data();
+    void widgetsStandInOrder();
     void propertiesOfWidgets_data();
     void propertiesOfWidgets();
     void actions_data();
@@ -230,12 +208,14 @@ private slots:
     void actionsComeInOrder();
     void missingIconLeavesNone();
     void menusAndToolBar();
-    void slotsComeInOrder();
+    void slotCanBeInvoked_data();
+    void slotCanBeInvoked();
     void actionOpensItsWindows_data();
     void actionOpensItsWindows();
     void exitClosesTheWindow();
     void removeTakesTheCurrentStatementAway();
     void headersOfTheTree();
+    void rowsOfTheTreeAreEquallyTall();
     void modelsAndTheirParents();
     void searchRowHasIcons();
 
@@ -280,33 +260,93 @@ void MainWindowTest::init()
 
 void MainWindowTest::cleanup() { m_machine.reset(); }
 
-void MainWindowTest::formIsLaidOut()
+void MainWindowTest::widgetsHaveTheirNames_data()
 {
-    const FMain window;
-    const QStringList lines = outline(window.centralWidget());
-    const QStringList expected{
-        QStringLiteral("QWidget centralwidget"),
-        QStringLiteral(" QVBoxLayout verticalLayout"),
-        QStringLiteral("  QStackedWidget swMode"),
-        QStringLiteral("   QWidget mainPage"),
-        QStringLiteral("    QVBoxLayout verticalLayout_3"),
-        QStringLiteral("     QTabWidget mainTabWidget"),
-        QStringLiteral("      QWidget tab"),
-        QStringLiteral("       QHBoxLayout horizontalLayout"),
-        QStringLiteral("        QTreeView topologyTree"),
-        QStringLiteral("      QWidget tab_2"),
-        QStringLiteral("       QHBoxLayout horizontalLayout_2"),
-        QStringLiteral("        QVBoxLayout leasLayoutVertical"),
-        QStringLiteral("         QFormLayout leasFormLayout"),
-        QStringLiteral("          QHBoxLayout leasLayoutHorizontal"),
-        QStringLiteral("           QLineEdit searchLease"),
-        QStringLiteral("           QToolButton searchPrevLease"),
-        QStringLiteral("           QToolButton searchNextLease"),
-        QStringLiteral("         QTableView dhcpdLeaseTable"),
+    QTest::addColumn<QByteArray>("type");
+    QTest::addColumn<QString>("within");
+    const auto row = [](const char *name, const char *type, const char *within) {
+        QTest::addRow("%s", name) << QByteArray{type} << QString::fromLatin1(within);
     };
-    QCOMPARE(lines, expected);
+    row("centralwidget", "QWidget", "FMain");
+    row("verticalLayout", "QVBoxLayout", "centralwidget");
+    row("swMode", "QStackedWidget", "centralwidget");
+    row("mainPage", "QWidget", "swMode");
+    row("verticalLayout_3", "QVBoxLayout", "mainPage");
+    row("mainTabWidget", "QTabWidget", "mainPage");
+    row("horizontalLayout", "QHBoxLayout", "mainTabWidget");
+    row("topologyTree", "QTreeView", "mainTabWidget");
+    row("tab_2", "QWidget", "mainTabWidget");
+    row("horizontalLayout_2", "QHBoxLayout", "tab_2");
+    row("leasLayoutVertical", "QVBoxLayout", "tab_2");
+    row("leasFormLayout", "QFormLayout", "tab_2");
+    row("leasLayoutHorizontal", "QHBoxLayout", "tab_2");
+    row("searchLease", "QLineEdit", "tab_2");
+    row("searchPrevLease", "QToolButton", "tab_2");
+    row("searchNextLease", "QToolButton", "tab_2");
+    row("dhcpdLeaseTable", "QTableView", "tab_2");
+    row("menubar", "QMenuBar", "FMain");
+    row("menu_File", "QMenu", "menubar");
+    row("menuServer", "QMenu", "menubar");
+    row("statusBar", "QStatusBar", "FMain");
+    row("toolBar", "QToolBar", "FMain");
+}
+
+void MainWindowTest::widgetsHaveTheirNames()
+{
+    QFETCH(QByteArray, type);
+    QFETCH(QString, within);
+    const FMain window;
     QCOMPARE(window.objectName(), QStringLiteral("FMain"));
     QVERIFY(!window.parent());
+    const QString name{QString::fromLatin1(QTest::currentDataTag())};
+    const QObjectList found{window.findChildren<QObject *>(name)};
+    QCOMPARE(found.size(), 1);
+    QVERIFY(found.first()->inherits(type.constData()));
+    const QObject *around{within == window.objectName() ? &window : window.findChild<QObject *>(within)};
+    QVERIFY(around);
+    QVERIFY(around->findChildren<QObject *>(name) == found);
+}
+
+void MainWindowTest::widgetsStandInOrder_data()
+{
+    QTest::addColumn<QString>("first");
+    QTest::addColumn<QString>("second");
+    QTest::addColumn<int>("tab");
+    QTest::addColumn<bool>("below"); // rather than to the right
+    const auto row = [](const char *first, const char *second, int tab, bool below) {
+        QTest::addRow("%s, %s", first, second)
+            << QString::fromLatin1(first) << QString::fromLatin1(second) << tab << below;
+    };
+    row("menubar", "toolBar", 0, true);
+    row("toolBar", "topologyTree", 0, true);
+    row("topologyTree", "statusBar", 0, true);
+    row("toolBar", "searchLease", 1, true);
+    row("searchLease", "searchPrevLease", 1, false);
+    row("searchPrevLease", "searchNextLease", 1, false);
+    row("searchLease", "dhcpdLeaseTable", 1, true);
+    row("searchNextLease", "dhcpdLeaseTable", 1, true);
+    row("dhcpdLeaseTable", "statusBar", 1, true);
+}
+
+void MainWindowTest::widgetsStandInOrder()
+{
+    QFETCH(QString, first);
+    QFETCH(QString, second);
+    QFETCH(int, tab);
+    QFETCH(bool, below);
+    const auto window = m_machine->openWindow();
+    clickTab(*window, tab);
+    const auto placeOf = [&window](const QString &name) {
+        const auto *widget = window->findChild<QWidget *>(name);
+        return widget && widget->isVisible() ? QRect{widget->mapTo(window.get(), QPoint{}), widget->size()} : QRect{};
+    };
+    const QRect before{placeOf(first)};
+    const QRect after{placeOf(second)};
+    QVERIFY(!before.isEmpty() && !after.isEmpty());
+    if (below)
+        QVERIFY(before.bottom() < after.top());
+    else
+        QVERIFY(before.right() < after.left() && before.top() < after.bottom() && after.top() < before.bottom());
 }
 
 void MainWindowTest::propertiesOfWidgets_data()
@@ -354,19 +394,19 @@ void MainWindowTest::propertiesOfWidgets()
 void MainWindowTest::actions_data()
 {
     QTest::addColumn<int>("number");
-    for (std::size_t i = 0; i < std::size(actionTable); ++i)
+    for (std::size_t i{0}; i < std::size(actionTable); ++i)
         QTest::addRow("%s", actionTable[i].name) << static_cast<int>(i);
 }
 
 void MainWindowTest::actions()
 {
     QFETCH(int, number);
-    const ActionRow &row = actionTable[number];
+    const ActionRow &row{actionTable[number]};
     const IconTheme theme;
     m_machine->systemctl().setState(FakeSystemctl::NoSuchUnit); // so that no state changes a text
     const FMain window;
 
-    const QAction *action = actionOf(window, row.name);
+    const QAction *action{actionOf(window, row.name)};
     QVERIFY(action);
     QCOMPARE(action->text(), QString::fromLatin1(row.text));
     QCOMPARE(action->toolTip(), QString::fromLatin1(row.toolTip));
@@ -378,7 +418,7 @@ void MainWindowTest::actions()
 void MainWindowTest::actionsComeInOrder()
 {
     const FMain window;
-    QStringList names = namesOf(window.findChildren<QAction *>(QString{}, Qt::FindDirectChildrenOnly));
+    QStringList names{namesOf(window.findChildren<QAction *>(QString{}, Qt::FindDirectChildrenOnly))};
     names.removeAll({});
     QStringList expected;
     for (const ActionRow &row : actionTable)
@@ -406,7 +446,7 @@ void MainWindowTest::menusAndToolBar()
     QCOMPARE(actionsIn("toolBar"), QStringLiteral("actionStartStopServer actionRestart - aSave aReload - "
                                                   "aAddSharedNetwork aAddSubnet aAddHost"));
 
-    const QList<QAction *> menus = window.menuBar()->actions();
+    const QList<QAction *> menus{window.menuBar()->actions()};
     QCOMPARE(menus.size(), 3);
     QCOMPARE(menus.at(0)->menu()->objectName(), QStringLiteral("menu_File"));
     QCOMPARE(menus.at(1)->menu()->objectName(), QStringLiteral("menuServer"));
@@ -424,63 +464,70 @@ void MainWindowTest::menusAndToolBar()
     QCOMPARE(label->indent(), 5);
 }
 
-void MainWindowTest::slotsComeInOrder()
+void MainWindowTest::slotCanBeInvoked_data()
 {
-    QList<QByteArray> signatures;
-    const QMetaObject &type = FMain::staticMetaObject;
-    for (int i = type.methodOffset(); i < type.methodCount(); ++i)
-        signatures.append(type.method(i).methodSignature());
-    const QList<QByteArray> expected{
-        "reload()",
-        "leaseReload()",
-        "save()",
-        "configChanged()",
-        "getInterfaces()",
-        "startStopServer()",
-        "handleServerStateChanged(DhcpServerManager::ServerStates)",
-        "handleTreeContextMenuRequested(QPoint)",
-        "handleTreeDoubleClicked(QModelIndex)",
-        "handleAddArbitraryDeclaration()",
-        "handleEditArbitraryDeclaration()",
-        "handleAddArbitraryParam()",
-        "handleEditArbitraryParam()",
-        "handleAddSharedNetwork()",
-        "handleEditSharedNetwork()",
-        "handleAddSubnet()",
-        "handleEditSubnet()",
-        "handleAddRange()",
-        "handleEditRange()",
-        "handleAddHost()",
-        "handleEditHost()",
-        "handleAddFixedAddress()",
-        "handleEditFixedAddress()",
-        "handleAddRouters()",
-        "handleEditRouters()",
-        "handleAddDns()",
-        "handleEditDns()",
-        "handleAddNtp()",
-        "handleEditNtp()",
-        "handleAddDomainName()",
-        "handleEditDomainName()",
-        "handleAddMaxLeaseTime()",
-        "handleEditMaxLeaseTime()",
-        "handleAddDefaultLeaseTime()",
-        "handleEditDefaultLeaseTime()",
-        "handleEditMacAddress()",
-        "handleEdit()",
-        "handleAddStaticRoute()",
-        "handleEditStaticRoute()",
-        "handleAddBind9Settings()",
-        "handleTreeItemChanged(QModelIndex)",
-        "handleTableContextMenuRequested(QPoint)",
-        "handleReserveIp()",
-        "handleTableDoubleClicked(QModelIndex)",
-        "currentTabChanged(int)",
-        "searchLease(QString)",
-        "selectNextLease()",
-        "selectPrevLease()",
-    };
-    QCOMPARE(signatures, expected);
+    QTest::addColumn<QByteArray>("signature");
+    for (const char *signature : {
+             "reload()",
+             "leaseReload()",
+             "save()",
+             "configChanged()",
+             "getInterfaces()",
+             "startStopServer()",
+             "handleServerStateChanged(DhcpServerManager::ServerStates)",
+             "handleTreeContextMenuRequested(QPoint)",
+             "handleTreeDoubleClicked(QModelIndex)",
+             "handleAddArbitraryDeclaration()",
+             "handleEditArbitraryDeclaration()",
+             "handleAddArbitraryParam()",
+             "handleEditArbitraryParam()",
+             "handleAddSharedNetwork()",
+             "handleEditSharedNetwork()",
+             "handleAddSubnet()",
+             "handleEditSubnet()",
+             "handleAddRange()",
+             "handleEditRange()",
+             "handleAddHost()",
+             "handleEditHost()",
+             "handleAddFixedAddress()",
+             "handleEditFixedAddress()",
+             "handleAddRouters()",
+             "handleEditRouters()",
+             "handleAddDns()",
+             "handleEditDns()",
+             "handleAddNtp()",
+             "handleEditNtp()",
+             "handleAddDomainName()",
+             "handleEditDomainName()",
+             "handleAddMaxLeaseTime()",
+             "handleEditMaxLeaseTime()",
+             "handleAddDefaultLeaseTime()",
+             "handleEditDefaultLeaseTime()",
+             "handleEditMacAddress()",
+             "handleEdit()",
+             "handleAddStaticRoute()",
+             "handleEditStaticRoute()",
+             "handleAddBind9Settings()",
+             "handleTreeItemChanged(QModelIndex)",
+             "handleTableContextMenuRequested(QPoint)",
+             "handleReserveIp()",
+             "handleTableDoubleClicked(QModelIndex)",
+             "currentTabChanged(int)",
+             "searchLease(QString)",
+             "selectNextLease()",
+             "selectPrevLease()",
+         })
+        QTest::addRow("%s", signature) << QByteArray{signature};
+}
+
+void MainWindowTest::slotCanBeInvoked()
+{
+    QFETCH(QByteArray, signature);
+    const QMetaObject &type{FMain::staticMetaObject};
+    const int index{type.indexOfMethod(signature.constData())};
+    QVERIFY(index >= 0);
+    QCOMPARE(type.method(index).methodType(), QMetaMethod::Slot);
+    QCOMPARE(QByteArray{type.method(index).typeName()}, QByteArray{"void"});
 }
 
 void MainWindowTest::actionOpensItsWindows_data()
@@ -491,8 +538,8 @@ void MainWindowTest::actionOpensItsWindows_data()
     const auto row = [](const char *action, const Place &current, const QStringList &windows) {
         QTest::addRow("%s", action) << current << windows;
     };
-    const QString information = QStringLiteral("Information");
-    const QString warning = QStringLiteral("Warning!");
+    const QString information{QStringLiteral("Information")};
+    const QString warning{QStringLiteral("Warning!")};
     row("aReload", root, {information});
     row("aSave", root, {information});
     row("actionInterfaces", root, {QStringLiteral("Select interfaces")});
@@ -523,13 +570,13 @@ void MainWindowTest::actionOpensItsWindows()
     const auto window = m_machine->openWindow();
     tableOf(*window)->setCurrentIndex(tableOf(*window)->model()->index(0, 0));
     click(treeOf(*window), current);
-    QAction *action = actionOf(*window, QTest::currentDataTag());
-    action->setEnabled(true); // what enables it is another test's matter
+    QAction *action{actionOf(*window, QTest::currentDataTag())};
+    action->setEnabled(true); // when it is enabled is for another test
 
     ModalBoxes boxes;
     QStringList opened;
-    for (int i = 0; i < windows.size(); ++i) {
-        const bool goOn = i + 1 < windows.size();
+    for (int i{0}; i < windows.size(); ++i) {
+        const bool goOn{i + 1 < windows.size()};
         boxes.expectDialog<QDialog>([&opened, goOn](QDialog *dialog) {
             opened.append(dialog->windowTitle());
             QTest::keyClick(dialog, goOn ? Qt::Key_Return : Qt::Key_Escape);
@@ -550,8 +597,8 @@ void MainWindowTest::exitClosesTheWindow()
 void MainWindowTest::removeTakesTheCurrentStatementAway()
 {
     const auto window = m_machine->openWindow();
-    QTreeView *tree = treeOf(*window);
-    const int count = tree->model()->rowCount(indexOf(tree, root));
+    QTreeView *tree{treeOf(*window)};
+    const int count{tree->model()->rowCount(indexOf(tree, root))};
     click(tree, sharedNetwork);
     actionOf(*window, "actionRemove")->trigger();
     QCOMPARE(tree->model()->rowCount(indexOf(tree, root)), count - 1);
@@ -560,10 +607,28 @@ void MainWindowTest::removeTakesTheCurrentStatementAway()
 void MainWindowTest::headersOfTheTree()
 {
     const FMain window;
-    const QAbstractItemModel *model = treeOf(window)->model();
+    const QAbstractItemModel *model{treeOf(window)->model()};
     QCOMPARE(model->columnCount(), 2);
     QCOMPARE(model->headerData(0, Qt::Horizontal).toString(), QStringLiteral("Topology"));
     QCOMPARE(model->headerData(1, Qt::Horizontal).toString(), QStringLiteral("Value"));
+}
+
+void MainWindowTest::rowsOfTheTreeAreEquallyTall()
+{
+    writeTestFile(paths::configuration(), configuration + "option motd \"one\ntwo\nthree\nfour\";\n");
+    const auto window = m_machine->openWindow();
+    const QTreeView *tree{treeOf(*window)};
+    const QRect first{tree->visualRect(indexOf(tree, root))};
+    QVERIFY(first.height() >= tree->fontMetrics().height());
+    QVERIFY(first.height() < 2 * tree->fontMetrics().height());
+    int rows{0};
+    for (QModelIndex index{indexOf(tree, root)}; index.isValid(); index = tree->indexBelow(index)) {
+        const QRect row{tree->visualRect(index)};
+        QCOMPARE(row.height(), first.height());
+        QCOMPARE(row.top(), first.top() + rows * first.height());
+        ++rows;
+    }
+    QVERIFY(rows > 5);
 }
 
 void MainWindowTest::modelsAndTheirParents()
@@ -575,7 +640,7 @@ void MainWindowTest::modelsAndTheirParents()
     QVERIFY(!proxy->parent());
     QVERIFY(qobject_cast<DhcpdLeasesModel *>(proxy->sourceModel()));
     QVERIFY(!proxy->sourceModel()->parent());
-    for (int section = 0; section < proxy->columnCount(); ++section)
+    for (int section{0}; section < proxy->columnCount(); ++section)
         QCOMPARE(tableOf(window)->horizontalHeader()->sectionResizeMode(section), QHeaderView::ResizeToContents);
 }
 
@@ -588,7 +653,7 @@ void MainWindowTest::searchRowHasIcons()
     };
     QCOMPARE(iconOf("searchPrevLease"), QStringLiteral("previous"));
     QCOMPARE(iconOf("searchNextLease"), QStringLiteral("next"));
-    const QList<QAction *> inField = window.findChild<QLineEdit *>(QStringLiteral("searchLease"))->actions();
+    const QList<QAction *> inField{window.findChild<QLineEdit *>(QStringLiteral("searchLease"))->actions()};
     QCOMPARE(inField.size(), 1);
     QCOMPARE(inField.first()->icon().name(), QStringLiteral("edit-find"));
 }
@@ -596,13 +661,13 @@ void MainWindowTest::searchRowHasIcons()
 void MainWindowTest::startsOnTheExpandedTopology()
 {
     const auto window = m_machine->openWindow();
-    const QTreeView *tree = treeOf(*window);
+    const QTreeView *tree{treeOf(*window)};
     QVERIFY(!actionOf(*window, "aSave")->isEnabled());
     QCOMPARE(tree->currentIndex(), indexOf(tree, root));
     for (const Place &place : {root, sharedNetwork, innerSubnet, subnet, host})
         QVERIFY(tree->isExpanded(indexOf(tree, place)));
-    const QAbstractItemView *view = tree;
-    for (int section = 0; section < tree->header()->count(); ++section)
+    const QAbstractItemView *view{tree};
+    for (int section{0}; section < tree->header()->count(); ++section)
         QVERIFY(tree->header()->sectionSize(section) >= view->sizeHintForColumn(section));
     QCOMPARE(enabledAddActions(*window).size(), 3);
 }
@@ -626,7 +691,7 @@ void MainWindowTest::selectionEnablesAddActions()
     QFETCH(Place, place);
     QFETCH(QStringList, enabled);
     const auto window = m_machine->openWindow();
-    // From a place that enables nothing as from one that enables all.
+    // Both from where nothing can be added and from where everything can.
     for (const Place &before : {defaultLeaseTime, root}) {
         click(treeOf(*window), before);
         click(treeOf(*window), place);
@@ -655,7 +720,7 @@ void MainWindowTest::leasesTabReadsTheFileEachTime()
     const auto window = m_machine->openWindow();
     QVERIFY(QDir{}.mkpath(paths::leaseDirectory()));
     QByteArray leases;
-    for (int round = 1; round <= 3; ++round) {
+    for (int round{1}; round <= 3; ++round) {
         leases += lease("10.0.1." + QByteArray::number(round));
         writeTestFile(paths::leases(), leases);
         QCOMPARE(tableOf(*window)->model()->rowCount(), round - 1);
@@ -687,8 +752,8 @@ void MainWindowTest::serverStateIsShown_data()
     QTest::addColumn<QString>("text");
     QTest::addColumn<QString>("toolTip");
     QTest::addColumn<QString>("icon");
-    const QString start = QStringLiteral("Start DHCP-server");
-    const QString stop = QStringLiteral("Stop DHCP-server");
+    const QString start{QStringLiteral("Start DHCP-server")};
+    const QString stop{QStringLiteral("Stop DHCP-server")};
     QTest::addRow("running") << FakeSystemctl::Running << QStringLiteral("DHCP-server is running") << stop << stop
                              << QStringLiteral("media-playback-stop");
     QTest::addRow("stopped") << FakeSystemctl::Stopped << QStringLiteral("DHCP-server is stopped") << start << start
@@ -705,7 +770,7 @@ void MainWindowTest::serverStateIsShown()
     const IconTheme theme;
     m_machine->systemctl().setState(state);
     const FMain window;
-    const QAction *action = actionOf(window, "actionStartStopServer");
+    const QAction *action{actionOf(window, "actionStartStopServer")};
     QTEST(statusLabelOf(window)->text(), "label");
     QTEST(action->text(), "text");
     QTEST(action->toolTip(), "toolTip");
@@ -719,7 +784,7 @@ void MainWindowTest::unknownServerStateLeavesTheAction()
     const IconTheme theme;
     FMain window;
     statusLabelOf(window)->clear();
-    const QAction *action = actionOf(window, "actionStartStopServer");
+    const QAction *action{actionOf(window, "actionStartStopServer")};
     window.handleServerStateChanged(static_cast<DhcpServerManager::ServerStates>(7));
     QVERIFY(action->isEnabled());
     QCOMPARE(action->text(), QStringLiteral("Start DHCP-server"));
@@ -730,8 +795,8 @@ void MainWindowTest::unknownServerStateLeavesTheAction()
 void MainWindowTest::serverIsStartedRestartedAndStopped()
 {
     const auto window = m_machine->openWindow();
-    const QAction *action = actionOf(*window, "actionStartStopServer");
-    const QLabel *label = statusLabelOf(*window);
+    const QAction *action{actionOf(*window, "actionStartStopServer")};
+    const QLabel *label{statusLabelOf(*window)};
 
     QTest::keyClick(window.get(), Qt::Key_R, Qt::ControlModifier);
     QTRY_COMPARE(label->text(), QStringLiteral("DHCP-server is running"));
@@ -744,7 +809,7 @@ void MainWindowTest::serverIsStartedRestartedAndStopped()
     QTRY_COMPARE(label->text(), QStringLiteral("DHCP-server is stopped"));
     QCOMPARE(action->text(), QStringLiteral("Start DHCP-server"));
 
-    QStringList commands = m_machine->systemctl().verbs();
+    QStringList commands{m_machine->systemctl().verbs()};
     commands.removeAll(QStringLiteral("status"));
     QCOMPARE(commands, (QStringList{QStringLiteral("start"), QStringLiteral("restart"), QStringLiteral("stop")}));
     for (const QStringList &call : m_machine->systemctl().calls())
@@ -755,7 +820,7 @@ void MainWindowTest::operationUnderWayIsShown()
 {
     m_machine->systemctl().hold(QStringLiteral("start"));
     const auto window = m_machine->openWindow();
-    const QAction *action = actionOf(*window, "actionStartStopServer");
+    const QAction *action{actionOf(*window, "actionStartStopServer")};
     QTest::keyClick(window.get(), Qt::Key_R, Qt::ControlModifier);
     QVERIFY(!action->isEnabled());
     QCOMPARE(statusLabelOf(*window)->text(), QStringLiteral("Updating DHCP-server status..."));
@@ -823,11 +888,11 @@ void MainWindowTest::dynamicUpdateNeedsBind9()
 {
     QFETCH(QByteArray, answer);
     QFETCH(bool, enabled);
-    const QByteArray record = "printf '%s\\n' \"$*\" >>\"${0%/*}/asked\"\n";
-    const QByteArray opposite = enabled ? "exit 1\n" : "echo installed 1:9.18.33\n";
+    const QByteArray record{"printf '%s\\n' \"$*\" >>\"${0%/*}/asked\"\n"};
+    const QByteArray opposite{enabled ? "exit 1\n" : "echo installed 1:9.18.33\n"};
     m_machine->programs().install(QStringLiteral("dpkg-query"), record + answer);
     const auto window = m_machine->openWindow();
-    const QAction *action = actionOf(*window, "aAddDHCPDynamicUpdate");
+    const QAction *action{actionOf(*window, "aAddDHCPDynamicUpdate")};
     QCOMPARE(action->isEnabled(), enabled);
 
     // Installing or removing the package later changes nothing.
@@ -840,7 +905,7 @@ void MainWindowTest::dynamicUpdateNeedsBind9()
     QTest::keyClick(window.get(), Qt::Key_F5);
     boxes.verify();
     QCOMPARE(action->isEnabled(), enabled);
-    const QByteArray asked = readTestFile(m_machine->programs().file(QStringLiteral("asked")));
+    const QByteArray asked{readTestFile(m_machine->programs().file(QStringLiteral("asked")))};
     QCOMPARE(asked.count('\n'), 1);
     QVERIFY(asked.endsWith(" bind9\n"));
 }
@@ -880,7 +945,7 @@ void MainWindowTest::sizeIsRestored()
 
 void MainWindowTest::sizeIsStoredAtTheEndOnly()
 {
-    const QString key = QStringLiteral("MainWindow/Size");
+    const QString key{QStringLiteral("MainWindow/Size")};
     auto window = m_machine->openWindow();
     window->resize(1010, 710);
     window->close();

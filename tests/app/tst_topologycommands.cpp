@@ -38,6 +38,21 @@ host single {
 }
 )";
 
+constexpr auto everyPlace = R"(option classless-static-routes code 121 = array of unsigned integer 8;
+subnet 10.1.0.0 netmask 255.255.255.0 {
+}
+shared-network office {
+    subnet 10.2.0.0 netmask 255.255.255.0 {
+    }
+}
+group printers {
+    allow booting;
+}
+host plotter {
+    hardware ethernet 00:11:22:33:44:55;
+}
+)";
+
 constexpr auto bind9Configuration = R"(// local zones
 zone "example.org" IN {
     type master;
@@ -62,8 +77,8 @@ struct AddCase
     QStringList entries;
     Input input;
     QStringList changes;
-    bool isAdvanced{}; ///< asks before, and opens the whole tree afterwards
-    QString child{};   ///< what has come into the parent; none when a statement there was changed
+    bool isAdvanced{}; ///< asks first, and expands the whole tree afterwards
+    QString child{};   ///< what was added to the parent; none when a statement there was changed
 };
 
 Input subnetInput(const QStringList &typed)
@@ -118,9 +133,18 @@ Input parameterInput(const QStringList &typed)
     return {text("Add arbitrary parameter"), list("Parameter: | "), type(typed)};
 }
 
-/// The way to an entry of the submenu for parameters.
-QStringList parameter(const char *entry) { return {text("Add parameter"), text(entry)}; }
-QStringList option(const char *entry) { return {text("Add parameter"), text("Add option"), text(entry)}; }
+QStringList sorted(QStringList texts)
+{
+    texts.sort();
+    return texts;
+}
+
+/// Saves, which writes the configuration as the window has it.
+void compareFile(const TopologyWindow &window, ModalBoxes &boxes)
+{
+    QCOMPARE(window.saveToFile(boxes), window.content());
+    QVERIFY(!window.offersSave());
+}
 
 } // namespace
 
@@ -129,13 +153,16 @@ Q_DECLARE_METATYPE(AddCase)
 using Slot = void (FMain::*)();
 Q_DECLARE_METATYPE(Slot)
 
-class TestTopologyCommands final : public QObject
+class TopologyCommandsTest final : public QObject
 {
     Q_OBJECT
 
 private slots:
     void addPutsTheStatementIn_data() { addCases(); }
     void addPutsTheStatementIn();
+    void addWorksInEveryPlace_data();
+    void addWorksInEveryPlace();
+    void routeTakesTheDefinitionThatIsThere();
     void cancelledAddChangesNothing_data() { addCases(); }
     void cancelledAddChangesNothing();
     void addedStatementIsScrolledTo_data();
@@ -161,122 +188,167 @@ private:
     static void addCases();
 };
 
-void TestTopologyCommands::addCases()
+void TopologyCommandsTest::addCases()
 {
     QTest::addColumn<AddCase>("add");
-    const auto row = [](const char *name, const AddCase &add) { QTest::addRow("%s", name) << add; };
+    QTest::addColumn<QStringList>("shown");
+    const auto row = [](const char *name, const AddCase &add, const char *shown) {
+        QTest::addRow("%s", name) << add << list(shown);
+    };
 
-    row("shared network", {{},
-                           list("Add shared network"),
-                           sharedNetworkInput(list("lab")),
-                           list("+shared-network lab"),
-                           false,
-                           text("shared-network lab")});
-    row("subnet", {{},
-                   list("Add subnet"),
-                   subnetInput(list("10.2.0.7/16")),
-                   list("+subnet 10.2.0.0 netmask 255.255.0.0"),
-                   false,
-                   text("subnet 10.2")});
-    row("subnet with a netmask", {{},
-                                  list("Add subnet"),
-                                  subnetInput(list("10.2.0.0 | 255.255.128.0")),
-                                  list("+subnet 10.2.0.0 netmask 255.255.128.0"),
-                                  false,
-                                  text("subnet 10.2")});
+    row("shared network",
+        {{},
+         list("Add shared network"),
+         sharedNetworkInput(list("lab")),
+         list("+shared-network lab"),
+         false,
+         text("shared-network lab")},
+        "+Shared network: lab");
+    row("subnet",
+        {{},
+         list("Add subnet"),
+         subnetInput(list("10.2.0.7/16")),
+         list("+subnet 10.2.0.0 netmask 255.255.0.0"),
+         false,
+         text("subnet 10.2")},
+        "+Subnet: 10.2.0.0 / 255.255.0.0");
+    row("subnet with a netmask",
+        {{},
+         list("Add subnet"),
+         subnetInput(list("10.2.0.0 | 255.255.128.0")),
+         list("+subnet 10.2.0.0 netmask 255.255.128.0"),
+         false,
+         text("subnet 10.2")},
+        "+Subnet: 10.2.0.0 / 255.255.128.0");
     row("subnet as offered",
         {text("shared-network"), list("Add subnet"), subnetInput({}),
-         list("+shared-network office > subnet 192.168.1.0 netmask 255.255.255.0"), false, text("subnet 192")});
+         list("+shared-network office > subnet 192.168.1.0 netmask 255.255.255.0"), false, text("subnet 192")},
+        "+Subnet: 192.168.1.0 / 255.255.255.0");
+    row("subnet typed",
+        {text("shared-network"), list("Add subnet"), subnetInput(list("10.4.0.0 | 255.255.254.0")),
+         list("+shared-network office > subnet 10.4.0.0 netmask 255.255.254.0"), false, text("subnet 10.4")},
+        "+Subnet: 10.4.0.0 / 255.255.254.0");
     row("range",
         {text("subnet 10.0"), list("Add range"),
          rangeInput(list("10.0.0.1 | 10.0.0.254"), list("10.0.0.30 | 10.0.0.40")),
-         list("+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30 10.0.0.40;"), false, text("range 10.0.0.30")});
-    row("host", {{},
-                 list("Add host"),
-                 hostInput(list("pc.lan | 001122334466 | 10.0.0.7")),
-                 list("+host pc.lan | +host pc.lan > hardware ethernet 00:11:22:33:44:66; | "
-                      "+host pc.lan > fixed-address 10.0.0.7;"),
-                 false,
-                 text("host pc.lan")});
-    row("host with a name only", {{},
-                                  list("Add host"),
-                                  hostInput(list("pc.lan")),
-                                  list("+host pc.lan | +host pc.lan > hardware ethernet 00:00:00:00:00:00;"),
-                                  false,
-                                  text("host pc.lan")});
-    row("host with an address of no host", {{},
-                                            list("Add host"),
-                                            hostInput({text("pc.lan"), QString{}, text("127.0.0.1")}),
-                                            list("+host pc.lan | +host pc.lan > hardware ethernet 00:00:00:00:00:00;"),
-                                            false,
-                                            text("host pc.lan")});
-    row("fixed address", {text("host single"), list("Add fixed IP"), fixedAddressInput(list("10.0.0.8")),
-                          list("+host single > fixed-address 10.0.0.8;"), false, text("fixed-address 10.0.0.8")});
-    row("fixed address again", {text("host grouped"), list("Add fixed IP"), fixedAddressInput(list("10.0.0.8")),
-                                list("-group servers > host grouped > fixed-address 10.0.0.6; | "
-                                     "+group servers > host grouped > fixed-address 10.0.0.8;")});
+         list("+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30 10.0.0.40;"), false, text("range 10.0.0.30")},
+        "+Range: 10.0.0.30 - 10.0.0.40");
+    row("host",
+        {{},
+         list("Add host"),
+         hostInput(list("pc.lan | 001122334466 | 10.0.0.7")),
+         list("+host pc.lan | +host pc.lan > hardware ethernet 00:11:22:33:44:66; | "
+              "+host pc.lan > fixed-address 10.0.0.7;"),
+         false,
+         text("host pc.lan")},
+        "+Host: pc.lan | +MAC address: 00:11:22:33:44:66 | +Fixed address: 10.0.0.7");
+    row("host with a name only",
+        {{},
+         list("Add host"),
+         hostInput(list("pc.lan")),
+         list("+host pc.lan | +host pc.lan > hardware ethernet 00:00:00:00:00:00;"),
+         false,
+         text("host pc.lan")},
+        "+Host: pc.lan | +MAC address: 00:00:00:00:00:00");
+    row("host with an address of no host",
+        {{},
+         list("Add host"),
+         hostInput({text("pc.lan"), QString{}, text("127.0.0.1")}),
+         list("+host pc.lan | +host pc.lan > hardware ethernet 00:00:00:00:00:00;"),
+         false,
+         text("host pc.lan")},
+        "+Host: pc.lan | +MAC address: 00:00:00:00:00:00");
+    row("fixed address",
+        {text("host single"), list("Add fixed IP"), fixedAddressInput(list("10.0.0.8")),
+         list("+host single > fixed-address 10.0.0.8;"), false, text("fixed-address 10.0.0.8")},
+        "+Fixed address: 10.0.0.8");
+    row("fixed address again",
+        {text("host grouped"), list("Add fixed IP"), fixedAddressInput(list("10.0.0.8")),
+         list("-group servers > host grouped > fixed-address 10.0.0.6; | "
+              "+group servers > host grouped > fixed-address 10.0.0.8;")},
+        "-Fixed address: 10.0.0.6 | +Fixed address: 10.0.0.8");
     row("gateways",
         {text("subnet 10.1"), option("Add gateways"),
          addressesInput("Add gateways", "Gateways:", list("10.1.0.1 | 10.1.0.2")),
          list("+shared-network office > subnet 10.1.0.0 netmask 255.255.0.0 > option routers 10.1.0.1, 10.1.0.2;"),
-         false, text("option routers 10.1")});
+         false, text("option routers 10.1")},
+        "+Gateways: 10.1.0.1, 10.1.0.2");
     row("gateways again",
         {text("subnet 10.0"), option("Add gateways"), addressesInput("Add gateways", "Gateways:", list("10.0.0.2")),
          list("-subnet 10.0.0.0 netmask 255.255.255.0 > option routers 10.0.0.1; | "
-              "+subnet 10.0.0.0 netmask 255.255.255.0 > option routers 10.0.0.2;")});
-    row("DNS servers", {{},
-                        option("Add DNS servers"),
-                        addressesInput("Add DNS servers", "DNS servers:", list("10.0.0.3")),
-                        list("+option domain-name-servers 10.0.0.3;"),
-                        false,
-                        text("option domain-name-servers")});
+              "+subnet 10.0.0.0 netmask 255.255.255.0 > option routers 10.0.0.2;")},
+        "-Gateways: 10.0.0.1 | +Gateways: 10.0.0.2");
+    row("DNS servers",
+        {{},
+         option("Add DNS servers"),
+         addressesInput("Add DNS servers", "DNS servers:", list("10.0.0.3")),
+         list("+option domain-name-servers 10.0.0.3;"),
+         false,
+         text("option domain-name-servers")},
+        "+DNS servers: 10.0.0.3");
     row("NTP servers",
         {text("group"), option("Add NTP servers"), addressesInput("Add NTP servers", "NTP servers:", list("10.0.0.4")),
-         list("+group servers > option ntp-servers 10.0.0.4;"), false, text("option ntp-servers")});
+         list("+group servers > option ntp-servers 10.0.0.4;"), false, text("option ntp-servers")},
+        "+NTP servers: 10.0.0.4");
     row("domain name as offered",
         {text("host single"), option("Add domain name"), domainInput({}),
-         list("+host single > option domain-name \"example.org\";"), false, text("option domain-name \"example")});
-    row("domain name again", {{},
-                              option("Add domain name"),
-                              domainInput(list("b.net")),
-                              list(R"(-option domain-name "a.org"; | +option domain-name "b.net" ;)")});
+         list("+host single > option domain-name \"example.org\";"), false, text("option domain-name \"example")},
+        "+Domain name: \"example.org\"");
+    row("domain name again",
+        {{},
+         option("Add domain name"),
+         domainInput(list("b.net")),
+         list(R"(-option domain-name "a.org"; | +option domain-name "b.net" ;)")},
+        "-Domain name: \"a.org\" | +Domain name: \"b.net\"");
     row("default lease time",
         {text("shared-network"), parameter("Add default lease time"),
          timeInput("Add default lease time", list("0 | 1 | 2 | 3 | 4")),
-         list("+shared-network office > default-lease-time 93784;"), false, text("default-lease-time 9")});
-    row("default lease time again", {{},
-                                     parameter("Add default lease time"),
-                                     timeInput("Add default lease time", list("1")),
-                                     list("-default-lease-time 600; | +default-lease-time 2592000;")});
-    row("max lease time", {{},
-                           parameter("Add max lease time"),
-                           timeInput("Add max lease time", list("12 | 31 | 24 | 60 | 60")),
-                           list("+max-lease-time 33872460;"),
-                           false,
-                           text("max-lease-time")});
-    row("static route", {{},
-                         list("Add static route"),
-                         routesInput(addRoute(list("255.255.255.0 | 192.168.1.0 | 10.0.0.1"), false)),
-                         list("+option classless-static-routes code 121 = array of unsigned integer 8; | "
-                              "+option classless-static-routes 24, 192,168,1,0, 10,0,0,1;"),
-                         false,
-                         text("option classless-static-routes 24")});
+         list("+shared-network office > default-lease-time 93784;"), false, text("default-lease-time 9")},
+        "+Default lease time: 1 days 2 hours 3 minutes 4 seconds");
+    row("default lease time again",
+        {{},
+         parameter("Add default lease time"),
+         timeInput("Add default lease time", list("1")),
+         list("-default-lease-time 600; | +default-lease-time 2592000;")},
+        "-Default lease time: 10 minutes | +Default lease time: 1 mounth");
+    row("max lease time",
+        {{},
+         parameter("Add max lease time"),
+         timeInput("Add max lease time", list("12 | 31 | 24 | 60 | 60")),
+         list("+max-lease-time 33872460;"),
+         false,
+         text("max-lease-time")},
+        "+Max lease time: 13 mounth 2 days 1 hours 1 minutes");
+    row("static route",
+        {{},
+         list("Add static route"),
+         routesInput(addRoute(list("255.255.255.0 | 192.168.1.0 | 10.0.0.1"), false)),
+         list("+option classless-static-routes code 121 = array of unsigned integer 8; | "
+              "+option classless-static-routes 24, 192,168,1,0, 10,0,0,1;"),
+         false,
+         text("option classless-static-routes 24")},
+        "+Static route: code 121 = array of unsigned integer 8 | +Static route: 24, 192,168,1,0, 10,0,0,1");
     row("static route for MS systems",
         {text("host single"), list("Add static route"),
          routesInput(addRoute(list("255.255.0.0 | 172.16.0.0 | 10.0.0.1"), true)),
          list("+option ms-classless-static-routes code 249 = array of unsigned integer 8; | "
               "+host single > option ms-classless-static-routes 16, 172,16,0,0, 10,0,0,1;"),
-         false, text("option ms-classless-static-routes 16")});
-    row("declaration", {text("subnet 10.0"), list("Add arbitrary declaration"), declarationInput(list("pool")),
-                        list("+subnet 10.0.0.0 netmask 255.255.255.0 > pool "), true, text("pool")});
+         false, text("option ms-classless-static-routes 16")},
+        "+Static route MS: code 249 = array of unsigned integer 8 | +Static route MS: 16, 172,16,0,0, 10,0,0,1");
+    row("declaration",
+        {text("subnet 10.0"), list("Add arbitrary declaration"), declarationInput(list("pool")),
+         list("+subnet 10.0.0.0 netmask 255.255.255.0 > pool "), true, text("pool")},
+        "+pool");
     row("parameter",
         {text("group"), parameter("Add arbitrary parameter"), parameterInput(list("option time-offset 3600")),
-         list("+group servers > option time-offset 3600;"), true, text("option time-offset")});
+         list("+group servers > option time-offset 3600;"), true, text("option time-offset")},
+        "+time-offset: 3600");
 }
 
-void TestTopologyCommands::addPutsTheStatementIn()
+void TopologyCommandsTest::addPutsTheStatementIn()
 {
     QFETCH(AddCase, add);
+    QFETCH(QStringList, shown);
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
     QVERIFY(!window.offersSave());
@@ -285,7 +357,7 @@ void TestTopologyCommands::addPutsTheStatementIn()
     window.tree().collapse(window.find(text("subnet 10.3")));
     if (!add.parent.isEmpty())
         window.tree().collapse(window.find(add.parent));
-    QStringList open = window.openBranches();
+    QStringList open{window.openBranches()};
 
     window.choose(boxes, add.parent, add.entries, [&] {
         if (add.isAdvanced)
@@ -293,6 +365,7 @@ void TestTopologyCommands::addPutsTheStatementIn()
         expectSaved(boxes, add.input);
     });
     QCOMPARE(window.changes(), add.changes);
+    QCOMPARE(window.shownChanges(), shown);
     QVERIFY(window.offersSave());
     QCOMPARE(window.notices(), 1);
     QCOMPARE(window.resets(), add.child.isEmpty() ? 0 : 1);
@@ -300,9 +373,10 @@ void TestTopologyCommands::addPutsTheStatementIn()
     QCOMPARE(window.tree().currentIndex().siblingAtColumn(0), window.find(add.parent));
     if (add.child.isEmpty()) {
         QCOMPARE(window.openBranches(), open);
+        compareFile(window, boxes);
         return;
     }
-    const QModelIndex child = window.find(add.child);
+    const QModelIndex child{window.find(add.child)};
     QCOMPARE(child.parent(), window.find(add.parent));
     QVERIFY(window.isInView(child));
     if (add.isAdvanced) {
@@ -313,15 +387,90 @@ void TestTopologyCommands::addPutsTheStatementIn()
         window.tree().collapse(window.find(add.parent));
     }
     QCOMPARE(window.openBranches(), open);
+    compareFile(window, boxes);
 }
 
-void TestTopologyCommands::cancelledAddChangesNothing()
+void TopologyCommandsTest::addWorksInEveryPlace_data()
+{
+    QTest::addColumn<QString>("place");
+    QTest::addColumn<QString>("blocks"); // in front of the statements that are added
+    const auto row = [](const char *place, const char *block) {
+        QTest::addRow("%s", *block ? block : "All network")
+            << text(place) << (*block ? text(block) + text(" > ") : QString{});
+    };
+    row("", "");
+    row("subnet 10.1", "subnet 10.1.0.0 netmask 255.255.255.0");
+    row("shared-network", "shared-network office");
+    row("group", "group printers");
+    row("host", "host plotter");
+}
+
+void TopologyCommandsTest::addWorksInEveryPlace()
+{
+    QFETCH(QString, place);
+    QFETCH(QString, blocks);
+    struct Command
+    {
+        QStringList entries;
+        Input input;
+        const char *statement;
+        const char *shown;
+        bool isAdvanced{};
+    };
+    const Command commands[]{
+        {list("Add arbitrary declaration"), declarationInput(list("on release")), "on release", "on: release", true},
+        {parameter("Add arbitrary parameter"), parameterInput(list("option time-offset 3600")),
+         "option time-offset 3600;", "time-offset: 3600", true},
+        {parameter("Add default lease time"), timeInput("Add default lease time", list("0 | 1 | 2 | 3 | 4")),
+         "default-lease-time 93784;", "Default lease time: 1 days 2 hours 3 minutes 4 seconds"},
+        {parameter("Add max lease time"), timeInput("Add max lease time", list("2 | 1")), "max-lease-time 5270400;",
+         "Max lease time: 2 mounth 1 days"},
+        {option("Add gateways"), addressesInput("Add gateways", "Gateways:", list("10.1.0.1 | 10.1.0.2")),
+         "option routers 10.1.0.1, 10.1.0.2;", "Gateways: 10.1.0.1, 10.1.0.2"},
+        {option("Add DNS servers"), addressesInput("Add DNS servers", "DNS servers:", list("10.1.0.3")),
+         "option domain-name-servers 10.1.0.3;", "DNS servers: 10.1.0.3"},
+        {option("Add NTP servers"), addressesInput("Add NTP servers", "NTP servers:", list("10.1.0.4")),
+         "option ntp-servers 10.1.0.4;", "NTP servers: 10.1.0.4"},
+        {option("Add domain name"), domainInput(list("lab.example.org")), "option domain-name \"lab.example.org\";",
+         "Domain name: \"lab.example.org\""},
+    };
+    const TopologyWindow window{everyPlace};
+    ModalBoxes boxes;
+    QStringList changes;
+    QStringList shown;
+    for (const Command &command : commands) {
+        window.choose(boxes, place, command.entries, [&] {
+            if (command.isAdvanced)
+                boxes.expectBox(advancedBox(), QMessageBox::Yes);
+            expectSaved(boxes, command.input);
+        });
+        changes.append(QLatin1Char{'+'} + blocks + text(command.statement));
+        shown.append(QLatin1Char{'+'} + text(command.shown));
+        QCOMPARE(sorted(window.changes()), sorted(changes));
+        QCOMPARE(sorted(window.shownChanges()), sorted(shown));
+    }
+    compareFile(window, boxes);
+}
+
+void TopologyCommandsTest::routeTakesTheDefinitionThatIsThere()
+{
+    const TopologyWindow window{everyPlace};
+    ModalBoxes boxes;
+    window.choose(boxes, text("host"), list("Add static route"), [&] {
+        expectSaved(boxes, routesInput(addRoute(list("255.255.128.0 | 192.168.0.0 | 10.1.0.3"), false)));
+    });
+    QCOMPARE(window.changes(), list("+host plotter > option classless-static-routes 17, 192,168,0,0, 10,1,0,3;"));
+    QCOMPARE(window.shownChanges(), list("+Static route: 17, 192,168,0,0, 10,1,0,3"));
+    compareFile(window, boxes);
+}
+
+void TopologyCommandsTest::cancelledAddChangesNothing()
 {
     QFETCH(AddCase, add);
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
     window.tree().collapse(window.find(text("subnet 10.3")));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     window.choose(boxes, add.parent, add.entries, [&] {
         if (add.isAdvanced)
             boxes.expectBox(advancedBox(), Qt::Key_Return);
@@ -334,7 +483,7 @@ void TestTopologyCommands::cancelledAddChangesNothing()
     QCOMPARE(window.tree().currentIndex(), window.find(add.parent));
 }
 
-void TestTopologyCommands::addedStatementIsScrolledTo_data()
+void TopologyCommandsTest::addedStatementIsScrolledTo_data()
 {
     QTest::addColumn<AddCase>("add");
     QTest::addRow("declaration") << AddCase{{},    list("Add host"),    hostInput(list("new.lan")), {},
@@ -349,17 +498,17 @@ void TestTopologyCommands::addedStatementIsScrolledTo_data()
         {}, list("Add arbitrary declaration"), declarationInput(list("group last")), {}, true, text("group last")};
 }
 
-void TestTopologyCommands::addedStatementIsScrolledTo()
+void TopologyCommandsTest::addedStatementIsScrolledTo()
 {
     QFETCH(AddCase, add);
-    QByteArray many = configuration;
+    QByteArray many{configuration};
     many += "group closed {\n";
-    for (int i = 0; i < 300; ++i)
+    for (int i{0}; i < 300; ++i)
         many += "host g" + QByteArray::number(i) + " {\n hardware ethernet 00:11:22:33:44:55;\n}\n";
     many += "}\n";
-    for (int i = 0; i < 300; ++i)
+    for (int i{0}; i < 300; ++i)
         many += "host h" + QByteArray::number(i) + " {\n hardware ethernet 00:11:22:33:44:55;\n}\n";
-    for (int i = 0; i < 100; ++i)
+    for (int i{0}; i < 100; ++i)
         many += "option option-" + QByteArray::number(128 + i) + " 1;\n";
     const TopologyWindow window{many};
     window.tree().collapse(window.find(text("group closed")));
@@ -373,26 +522,26 @@ void TestTopologyCommands::addedStatementIsScrolledTo()
     QCOMPARE(window.tree().currentIndex(), window.find(add.parent));
 }
 
-void TestTopologyCommands::declinedWarningOpensNothing_data()
+void TopologyCommandsTest::declinedWarningOpensNothing_data()
 {
     QTest::addColumn<QStringList>("entries");
     QTest::addColumn<bool>("closes");
     for (const bool closes : {false, true}) {
-        const char *how = closes ? "closed" : "No";
+        const char *how{closes ? "closed" : "No"};
         QTest::addRow("declaration, %s", how) << list("Add arbitrary declaration") << closes;
         QTest::addRow("parameter, %s", how) << parameter("Add arbitrary parameter") << closes;
         QTest::addRow("edit, %s", how) << list("Edit") << closes;
     }
 }
 
-void TestTopologyCommands::declinedWarningOpensNothing()
+void TopologyCommandsTest::declinedWarningOpensNothing()
 {
     QFETCH(QStringList, entries);
     QFETCH(bool, closes);
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
     window.tree().collapse(window.find(text("subnet 10.0")));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     window.choose(boxes, text("group"), entries, [&] {
         if (closes)
             boxes.expectBox(advancedBox(), Qt::Key_Escape);
@@ -404,7 +553,7 @@ void TestTopologyCommands::declinedWarningOpensNothing()
     QCOMPARE(window.openBranches(), open);
 }
 
-void TestTopologyCommands::refusedAddSaysWhy_data()
+void TopologyCommandsTest::refusedAddSaysWhy_data()
 {
     QTest::addColumn<QString>("parent");
     QTest::addColumn<Slot>("command");
@@ -454,7 +603,7 @@ void TestTopologyCommands::refusedAddSaysWhy_data()
         "Error adding parameter. Can not add parameter to 'range'");
 }
 
-void TestTopologyCommands::refusedAddSaysWhy()
+void TopologyCommandsTest::refusedAddSaysWhy()
 {
     QFETCH(QString, parent);
     QFETCH(Slot, command);
@@ -475,7 +624,7 @@ void TestTopologyCommands::refusedAddSaysWhy()
     QCOMPARE(window.tree().currentIndex(), window.find(parent));
 }
 
-void TestTopologyCommands::addNeedsADeclaration_data()
+void TopologyCommandsTest::addNeedsADeclaration_data()
 {
     QTest::addColumn<Slot>("command");
     const auto row = [](const char *name, Slot command) { QTest::addRow("%s", name) << command; };
@@ -496,7 +645,7 @@ void TestTopologyCommands::addNeedsADeclaration_data()
     row("bind9", &FMain::handleAddBind9Settings);
 }
 
-void TestTopologyCommands::addNeedsADeclaration()
+void TopologyCommandsTest::addNeedsADeclaration()
 {
     QFETCH(Slot, command);
     const TopologyWindow window{configuration};
@@ -511,7 +660,7 @@ void TestTopologyCommands::addNeedsADeclaration()
     QCOMPARE(window.notices(), 0);
 }
 
-void TestTopologyCommands::rangeIsOfferedForTheSubnet_data()
+void TopologyCommandsTest::rangeIsOfferedForTheSubnet_data()
 {
     QTest::addColumn<QByteArray>("subnet");
     QTest::addColumn<QStringList>("offered");
@@ -525,7 +674,7 @@ void TestTopologyCommands::rangeIsOfferedForTheSubnet_data()
     QTest::addRow("without words") << QByteArray{} << QStringList{QString{}, QString{}};
 }
 
-void TestTopologyCommands::rangeIsOfferedForTheSubnet()
+void TopologyCommandsTest::rangeIsOfferedForTheSubnet()
 {
     QFETCH(QByteArray, subnet);
     QFETCH(QStringList, offered);
@@ -534,11 +683,11 @@ void TestTopologyCommands::rangeIsOfferedForTheSubnet()
     window.choose(boxes, text("subnet"), list("Add range"), [&] { expectCancelled(boxes, rangeInput(offered, {})); });
 }
 
-void TestTopologyCommands::bind9AddsZonesAndKeys()
+void TopologyCommandsTest::bind9AddsZonesAndKeys()
 {
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
-    const QString file = paths::bind9LocalConfiguration();
+    const QString file{paths::bind9LocalConfiguration()};
     writeTestFile(file, bind9Configuration);
     window.tree().collapse(window.find(text("subnet 10.0")));
     window.tree().collapse(window.find(text("group")));
@@ -553,30 +702,33 @@ void TestTopologyCommands::bind9AddsZonesAndKeys()
                                     "+group servers > zone example.org. | "
                                     "+group servers > zone example.org. > primary 127.0.0.1; | "
                                     "+group servers > zone example.org. > key \"ddns\";"));
+    QCOMPARE(window.shownChanges(), list("+Key information: \"ddns\" | +Key generation algorithm: hmac-sha256 | "
+                                         "+Generated secret: \"Zm9vYmFy\" | +Zone served by DNS server: example.org. | "
+                                         "+Master DNS Server: 127.0.0.1 | +Key: \"ddns\""));
     QVERIFY(window.offersSave());
     QCOMPARE(window.notices(), 1);
     QCOMPARE(window.tree().currentIndex(), window.find(text("group")));
     QVERIFY(window.isInView(window.find(text("zone"))));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     window.tree().expandAll();
     QCOMPARE(open, window.openBranches());
 }
 
-void TestTopologyCommands::bind9IsGivenUp_data()
+void TopologyCommandsTest::bind9IsGivenUp_data()
 {
     QTest::addColumn<bool>("asksForTheFile");
     QTest::addRow("at the question") << false;
     QTest::addRow("at the file") << true;
 }
 
-void TestTopologyCommands::bind9IsGivenUp()
+void TopologyCommandsTest::bind9IsGivenUp()
 {
     QFETCH(bool, asksForTheFile);
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
     writeTestFile(paths::bind9LocalConfiguration(), bind9Configuration);
     window.tree().collapse(window.find(text("group")));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     window.choose(boxes, {}, option("Add DHCP dynamic zone update"), [&] {
         boxes.expectBox(bind9Box, asksForTheFile ? Qt::Key_Return : Qt::Key_Escape);
         if (!asksForTheFile)
@@ -592,12 +744,12 @@ void TestTopologyCommands::bind9IsGivenUp()
     QCOMPARE(window.openBranches(), open);
 }
 
-void TestTopologyCommands::bind9IsRefused_data()
+void TopologyCommandsTest::bind9IsRefused_data()
 {
     QTest::addColumn<QString>("parent");
     QTest::addColumn<QByteArray>("file");
     QTest::addColumn<QString>("error");
-    const QString empty = text("Error adding bind9. bind9 can not be empty.");
+    const QString empty{text("Error adding bind9. bind9 can not be empty.")};
     QTest::addRow("empty file") << QString{} << QByteArray{} << empty;
     QTest::addRow("comments only") << QString{} << QByteArray{"// zone \"a.org\" { };\n# nothing\n/* here */\n"}
                                    << empty;
@@ -605,11 +757,15 @@ void TestTopologyCommands::bind9IsRefused_data()
                                         << empty;
     QTest::addRow("subnet") << text("subnet 10.0") << QByteArray{bind9Configuration}
                             << text("Error adding bind9. Can not add bind9 to 'subnet'");
+    QTest::addRow("shared network") << text("shared-network") << QByteArray{bind9Configuration}
+                                    << text("Error adding bind9. Can not add bind9 to 'shared-network'");
+    QTest::addRow("host") << text("host single") << QByteArray{bind9Configuration}
+                          << text("Error adding bind9. Can not add bind9 to 'host'");
     QTest::addRow("host, empty file") << text("host single") << QByteArray{}
                                       << text("Error adding bind9. Can not add bind9 to 'host'");
 }
 
-void TestTopologyCommands::bind9IsRefused()
+void TopologyCommandsTest::bind9IsRefused()
 {
     QFETCH(QString, parent);
     QFETCH(QByteArray, file);
@@ -627,44 +783,63 @@ void TestTopologyCommands::bind9IsRefused()
     QVERIFY(!window.offersSave());
 }
 
-void TestTopologyCommands::removeTakesTheStatementOut_data()
+void TopologyCommandsTest::removeTakesTheStatementOut_data()
 {
     QTest::addColumn<QString>("statement");
     QTest::addColumn<QString>("parent");
     QTest::addColumn<QStringList>("changes");
-    const auto row = [](const char *statement, const char *parent, const char *changes) {
-        QTest::addRow("%s", statement) << text(statement) << text(parent) << list(changes);
+    QTest::addColumn<QStringList>("shown");
+    const auto row = [](const char *statement, const char *parent, const char *changes, const char *shown) {
+        QTest::addRow("%s", statement) << text(statement) << text(parent) << list(changes) << list(shown);
     };
-    row("default-lease-time", "", "-default-lease-time 600;");
+    row("default-lease-time", "", "-default-lease-time 600;", "-Default lease time: 10 minutes");
+    row("option domain-name", "", "-option domain-name \"a.org\";", "-Domain name: \"a.org\"");
     row("range", "subnet 10.0.0.0 netmask 255.255.255.0",
-        "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.10 10.0.0.20;");
-    row("fixed-address", "host grouped", "-group servers > host grouped > fixed-address 10.0.0.6;");
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.10 10.0.0.20;", "-Range: 10.0.0.10 - 10.0.0.20");
+    row("option routers", "subnet 10.0.0.0 netmask 255.255.255.0",
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > option routers 10.0.0.1;", "-Gateways: 10.0.0.1");
+    row("fixed-address", "host grouped", "-group servers > host grouped > fixed-address 10.0.0.6;",
+        "-Fixed address: 10.0.0.6");
+    row("hardware", "host single", "-host single > hardware ethernet 00:11:22:33:44:55;",
+        "-MAC address: 00:11:22:33:44:55");
+    row("subnet 10.0", "",
+        "-subnet 10.0.0.0 netmask 255.255.255.0 | -subnet 10.0.0.0 netmask 255.255.255.0 > option routers 10.0.0.1; | "
+        "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.10 10.0.0.20;",
+        "-Subnet: 10.0.0.0 / 255.255.255.0 | -Gateways: 10.0.0.1 | -Range: 10.0.0.10 - 10.0.0.20");
     row("shared-network", "",
         "-shared-network office | -shared-network office > subnet 10.1.0.0 netmask 255.255.0.0 | "
-        "-shared-network office > subnet 10.1.0.0 netmask 255.255.0.0 > authoritative ;");
-    row("host single", "", "-host single | -host single > hardware ethernet 00:11:22:33:44:55;");
+        "-shared-network office > subnet 10.1.0.0 netmask 255.255.0.0 > authoritative ;",
+        "-Shared network: office | -Subnet: 10.1.0.0 / 255.255.0.0 | -authoritative");
+    row("group", "",
+        "-group servers | -group servers > host grouped | -group servers > host grouped > fixed-address 10.0.0.6;",
+        "-Group: servers | -Host: grouped | -Fixed address: 10.0.0.6");
+    row("host single", "", "-host single | -host single > hardware ethernet 00:11:22:33:44:55;",
+        "-Host: single | -MAC address: 00:11:22:33:44:55");
 }
 
-void TestTopologyCommands::removeTakesTheStatementOut()
+void TopologyCommandsTest::removeTakesTheStatementOut()
 {
     QFETCH(QString, statement);
     QFETCH(QString, parent);
     QFETCH(QStringList, changes);
+    QFETCH(QStringList, shown);
     const TopologyWindow window{configuration};
     ModalBoxes boxes; // nothing is asked
     window.tree().collapse(window.find(text("subnet 10.3")));
     window.choose(boxes, statement, list("Remove"));
     QCOMPARE(window.changes(), changes);
+    QCOMPARE(window.shownChanges(), shown);
     QVERIFY(window.offersSave());
     QCOMPARE(window.notices(), 1);
     QCOMPARE(window.current(), parent);
     QCOMPARE(window.tree().currentIndex(), window.find(parent));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     window.tree().expandAll();
     QCOMPARE(open, window.openBranches());
+    compareFile(window, boxes);
 }
 
-void TestTopologyCommands::removeTakesNothingAboveTheStatements()
+void TopologyCommandsTest::removeTakesNothingAboveTheStatements()
 {
     const TopologyWindow window{configuration};
     const ModalBoxes boxes;
@@ -679,5 +854,5 @@ void TestTopologyCommands::removeTakesNothingAboveTheStatements()
     QCOMPARE(window.model().rowCount(), 1);
 }
 
-QTEST_MAIN(TestTopologyCommands)
+QTEST_MAIN(TopologyCommandsTest)
 #include "tst_topologycommands.moc"

@@ -2,7 +2,7 @@
 // The commands of the topology tree that edit statements.
 #include "config/dhcpdconfigmodel.h"
 #include "tests/app/topologywindow.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QAction>
 #include <QDialog>
@@ -11,7 +11,7 @@
 
 namespace {
 
-// Much of it as only a hand writes it.
+// Much of it is written as only a person does it.
 constexpr auto configuration = R"(default-lease-time 600;
 max-lease-time 40000000;
 min-lease-time -1;
@@ -21,6 +21,7 @@ option domain-name-servers 10.0.0.1,
 option routers 10.0.0.1,10.0.0.2;
 option routers gate.a.org, 10.0.0.1;
 option ntp-servers;
+option ntp-servers 10.0.0.4;
 option classless-static-routes code 121 = array of unsigned integer 8;
 option classless-static-routes 24, 192,168,1,0, 10,0,0,1;
 option ms-classless-static-routes 24, 192,168,2,0,
@@ -82,9 +83,9 @@ Input time(const char *title, const char *shown)
 {
     QStringList all{text("Mounth:"), QString{}, text("Days:"), QString{}, QString{},
                     text(":"),       QString{}, text(":"),     QString{}};
-    const QStringList fields = list(shown);
-    const int places[] = {1, 3, 4, 6, 8};
-    for (int i = 0; i < fields.size(); ++i)
+    const QStringList fields{list(shown)};
+    const int places[]{1, 3, 4, 6, 8};
+    for (int i{0}; i < fields.size(); ++i)
         all[places[i]] = fields.at(i);
     return {text(title), all};
 }
@@ -115,9 +116,9 @@ Input named(const char *title, const char *label, const char *value)
     return {text(title), {text(label), text(value)}};
 }
 
-Input parameter(const char *words) { return named("Edit arbitrary parameter", "Parameter:", words); }
-Input declaration(const char *words) { return named("Edit arbitrary declaration", "Declaration:", words); }
-Input definition(const char *words) { return named("Edit static route", "Parameter:", words); }
+Input parameterInput(const char *words) { return named("Edit arbitrary parameter", "Parameter:", words); }
+Input declarationInput(const char *words) { return named("Edit arbitrary declaration", "Declaration:", words); }
+Input definitionInput(const char *words) { return named("Edit static route", "Parameter:", words); }
 
 Input with(Input input, const Fill &fill)
 {
@@ -131,7 +132,7 @@ bool isAdvanced(const Input &input)
     return input.shown.first() == text("Parameter:") || input.shown.first() == text("Declaration:");
 }
 
-/// Opens the editor with a double click and saves it.
+/// Opens the editor with a double click and saves.
 void edit(const TopologyWindow &window, const QString &statement, const Input &input, const QString &error = {})
 {
     ModalBoxes boxes;
@@ -149,7 +150,7 @@ Q_DECLARE_METATYPE(Edit)
 using Slot = void (FMain::*)();
 Q_DECLARE_METATYPE(Slot)
 
-class TestTopologyEdits final : public QObject
+class TopologyEditsTest final : public QObject
 {
     Q_OBJECT
 
@@ -173,7 +174,7 @@ private:
     static void changeCases();
 };
 
-void TestTopologyEdits::unchangedEditChangesNothing_data()
+void TopologyEditsTest::unchangedEditChangesNothing_data()
 {
     QTest::addColumn<Edit>("unchanged");
     const auto row = [](const char *statement, const Input &input) {
@@ -188,12 +189,12 @@ void TestTopologyEdits::unchangedEditChangesNothing_data()
     row("option routers 10", addresses("Edit gateways", "Gateways:", "10.0.0.1, 10.0.0.2"));
     row("option routers gate", addresses("Edit gateways", "Gateways:", "10.0.0.1"));
     row("option classless-static-routes code",
-        definition("option classless-static-routes code 121 = array of unsigned integer 8"));
+        definitionInput("option classless-static-routes code 121 = array of unsigned integer 8"));
     row("option classless-static-routes 24",
         routes("255.255.255.0, 192.168.1.0, 10.0.0.1", "[ ]* Route for MS systems"));
     row("option ms-classless", routes("255.255.255.0, 192.168.2.0, 10.0.0.2", "[x]* Route for MS systems"));
-    row("option time-offset", parameter("option time-offset 3600"));
-    row("authoritative", parameter("authoritative "));
+    row("option time-offset", parameterInput("option time-offset 3600"));
+    row("authoritative", parameterInput("authoritative "));
     row("subnet 10.0", subnet("10.0.0.0", "255.255.255.0"));
     row("subnet 10.3", subnet("10.3.0.0", ""));
     row("range 10.0.0.100", range("10.0.0.100", "10.0.0.110"));
@@ -202,8 +203,8 @@ void TestTopologyEdits::unchangedEditChangesNothing_data()
     row("range 10.0.0.30", range("10.0.0.30", ""));
     row("shared-network lab", named("Edit shared network", "Name:", "lab"));
     row("shared-network \"", named("Edit shared network", "Name:", "\"my office\""));
-    row("group", declaration("group servers"));
-    row("subclass", declaration("subclass \"phones\" 1:00:11:22:33:44:55"));
+    row("group", declarationInput("group servers"));
+    row("subclass", declarationInput("subclass \"phones\" 1:00:11:22:33:44:55"));
     row("host full", host("full", "00:11:22:33:44:55", "10.0.0.5"));
     row("host bare", host("bare", "00:00:00:00:00:00", ""));
     row("host hard", host("hard", "00:11:22:33:44:66", ""));
@@ -215,12 +216,12 @@ void TestTopologyEdits::unchangedEditChangesNothing_data()
     row("hardware ethernet 0011", named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"));
 }
 
-void TestTopologyEdits::unchangedEditChangesNothing()
+void TopologyEditsTest::unchangedEditChangesNothing()
 {
     QFETCH(Edit, unchanged);
     const TopologyWindow window{configuration};
     window.tree().collapse(window.find(text("host bare")));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     edit(window, unchanged.statement, unchanged.input);
     QCOMPARE(window.changes(), QStringList{});
     QCOMPARE(window.notices(), 0);
@@ -228,137 +229,176 @@ void TestTopologyEdits::unchangedEditChangesNothing()
     QCOMPARE(window.openBranches(), open);
 }
 
-void TestTopologyEdits::changeCases()
+void TopologyEditsTest::changeCases()
 {
     QTest::addColumn<Edit>("change");
-    const auto row = [](const char *name, const char *statement, const Input &input, const char *changes) {
-        QTest::addRow("%s", name) << Edit{text(statement), input, *changes ? list(changes) : QStringList{}};
+    QTest::addColumn<QStringList>("shown");
+    const auto row = [](const char *name, const char *statement, const Input &input, const char *changes,
+                        const char *shown) {
+        QTest::addRow("%s", name) << Edit{text(statement), input, *changes ? list(changes) : QStringList{}}
+                                  << (*shown ? list(shown) : QStringList{});
     };
     const QString same{};
 
     row("default lease time", "default-lease-time",
         with(time("Edit default lease time", "0 | 0 | 0 h | 10 m | 0 s"), type({same, same, text("1")})),
-        "-default-lease-time 600; | +default-lease-time 4200;");
+        "-default-lease-time 600; | +default-lease-time 4200;",
+        "-Default lease time: 10 minutes | +Default lease time: 1 hours 10 minutes");
     row("max lease time", "max-lease-time",
         with(time("Edit max lease time", "12 | 12 | 23 h | 6 m | 40 s"), type(list("1 | 0 | 0 | 0 | 0"))),
-        "-max-lease-time 40000000; | +max-lease-time 2592000;");
+        "-max-lease-time 40000000; | +max-lease-time 2592000;",
+        "-Max lease time: 15 mounth 12 days 23 hours 6 minutes 40 seconds | +Max lease time: 1 mounth");
     row("other lease time", "min-lease-time",
         with(time("Edit time", "0 | 0 | 0 h | 0 m | 0 s"), type({same, same, same, same, text("60")})),
-        "-min-lease-time -1; | +min-lease-time 60;");
+        "-min-lease-time -1; | +min-lease-time 60;", "-min-lease-time | +min-lease-time: 1 minutes");
     row("domain name", "option domain-name \"",
         with(named("Edit domain name", "Domain name:", "a.org"), type(list("b.example.net"))),
-        R"(-option domain-name "a.org"; | +option domain-name "b.example.net";)");
+        R"(-option domain-name "a.org"; | +option domain-name "b.example.net";)",
+        R"(-Domain name: "a.org" | +Domain name: "b.example.net")");
     row("DNS servers", "option domain-name-servers",
         with(addresses("Edit DNS servers", "DNS servers:", "10.0.0.1, 10.0.0.2, 10.0.0.3"),
              addAddresses(list("10.0.0.4"))),
         "-option domain-name-servers 10.0.0.1, 10.0.0.2 , 10.0.0.3; | "
-        "+option domain-name-servers 10.0.0.1, 10.0.0.2, 10.0.0.3, 10.0.0.4;");
+        "+option domain-name-servers 10.0.0.1, 10.0.0.2, 10.0.0.3, 10.0.0.4;",
+        "-DNS servers: 10.0.0.1, 10.0.0.2 , 10.0.0.3 | +DNS servers: 10.0.0.1, 10.0.0.2, 10.0.0.3, 10.0.0.4");
     row("gateways", "option routers 10",
         with(addresses("Edit gateways", "Gateways:", "10.0.0.1, 10.0.0.2"), addAddresses(list("10.0.0.3"))),
-        "-option routers 10.0.0.1,10.0.0.2; | +option routers 10.0.0.1, 10.0.0.2, 10.0.0.3;");
+        "-option routers 10.0.0.1,10.0.0.2; | +option routers 10.0.0.1, 10.0.0.2, 10.0.0.3;",
+        "-Gateways: 10.0.0.1,10.0.0.2 | +Gateways: 10.0.0.1, 10.0.0.2, 10.0.0.3");
+    row("NTP servers", "option ntp-servers 10",
+        with(addresses("Edit NTP servers", "NTP servers:", "10.0.0.4"), addAddresses(list("10.0.0.11"))),
+        "-option ntp-servers 10.0.0.4; | +option ntp-servers 10.0.0.4, 10.0.0.11;",
+        "-NTP servers: 10.0.0.4 | +NTP servers: 10.0.0.4, 10.0.0.11");
     row("static route", "option classless-static-routes 24",
         with(routes("255.255.255.0, 192.168.1.0, 10.0.0.1", "[ ]* Route for MS systems"),
              typeInCell(0, 2, text("10.0.0.9"))),
         "-option classless-static-routes 24, 192,168,1,0, 10,0,0,1; | "
-        "+option classless-static-routes 24, 192,168,1,0, 10,0,0,9;");
+        "+option classless-static-routes 24, 192,168,1,0, 10,0,0,9;",
+        "-Static route: 24, 192,168,1,0, 10,0,0,1 | +Static route: 24, 192,168,1,0, 10,0,0,9");
     row("static route for MS systems", "option ms-classless",
         with(routes("255.255.255.0, 192.168.2.0, 10.0.0.2", "[x]* Route for MS systems"),
              typeInCell(0, 0, text("255.255.0.0"))),
         "-option ms-classless-static-routes 24, 192,168,2,0, 10,0,0,2; | "
-        "+option ms-classless-static-routes 16, 192,168,2,0, 10,0,0,2;");
+        "+option ms-classless-static-routes 16, 192,168,2,0, 10,0,0,2;",
+        "-Static route MS: 24, 192,168,2,0, 10,0,0,2 | +Static route MS: 16, 192,168,2,0, 10,0,0,2");
     row("definition of the option", "option classless-static-routes code",
-        with(definition("option classless-static-routes code 121 = array of unsigned integer 8"),
+        with(definitionInput("option classless-static-routes code 121 = array of unsigned integer 8"),
              type(list("option classless-static-routes code 121 = array of integer 8"))),
         "-option classless-static-routes code 121 = array of unsigned integer 8; | "
-        "+option classless-static-routes code 121 = array of integer 8;");
-    row("parameter", "option time-offset", with(parameter("option time-offset 3600"), type(list("ping-check true"))),
-        "-option time-offset 3600; | +ping-check true;");
-    row("parameter of one word", "authoritative", with(parameter("authoritative "), type(list("ping-check true"))),
-        "-authoritative ; | +ping-check true;");
-    row("group", "group", with(declaration("group servers"), type(list("group printers"))),
-        "-group servers | +group printers");
-    row("keyword of a group", "group", with(declaration("group servers"), type(list("class \"pc\""))),
-        "-group servers | +class \"pc\"");
+        "+option classless-static-routes code 121 = array of integer 8;",
+        "-Static route: code 121 = array of unsigned integer 8 | +Static route: code 121 = array of integer 8");
+    row("parameter", "option time-offset",
+        with(parameterInput("option time-offset 3600"), type(list("ping-check true"))),
+        "-option time-offset 3600; | +ping-check true;", "-time-offset: 3600 | +ping-check: true");
+    row("parameter of one word", "authoritative", with(parameterInput("authoritative "), type(list("ping-check true"))),
+        "-authoritative ; | +ping-check true;", "-authoritative | +ping-check: true");
+    row("group", "group", with(declarationInput("group servers"), type(list("group printers"))),
+        "-group servers | +group printers", "-Group: servers | +Group: printers");
+    row("keyword of a group", "group", with(declarationInput("group servers"), type(list("class \"pc\""))),
+        "-group servers | +class \"pc\"", R"(-Group: servers | +class: "pc")");
     row("subclass", "subclass",
-        with(declaration("subclass \"phones\" 1:00:11:22:33:44:55"),
+        with(declarationInput("subclass \"phones\" 1:00:11:22:33:44:55"),
              type(list("subclass \"phones\" 1:00:11:22:33:44:66"))),
-        R"(-subclass "phones" 1:00:11:22:33:44:55; | +subclass "phones" 1:00:11:22:33:44:66;)");
+        R"(-subclass "phones" 1:00:11:22:33:44:55; | +subclass "phones" 1:00:11:22:33:44:66;)",
+        R"(-subclass: "phones" 1:00:11:22:33:44:55 | +subclass: "phones" 1:00:11:22:33:44:66)");
     row("address of a subnet", "subnet 10.4", with(subnet("10.4.0.0", "255.255.255.0"), type(list("10.5.0.0/16"))),
-        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.5.0.0 netmask 255.255.0.0");
+        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.5.0.0 netmask 255.255.0.0",
+        "-Subnet: 10.4.0.0 / 255.255.255.0 | +Subnet: 10.5.0.0 / 255.255.0.0");
     row("netmask of a subnet", "subnet 10.4",
         with(subnet("10.4.0.0", "255.255.255.0"), type({same, text("255.255.0.0")})),
-        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.4.0.0 netmask 255.255.0.0");
+        "-subnet 10.4.0.0 netmask 255.255.255.0 | +subnet 10.4.0.0 netmask 255.255.0.0",
+        "-Subnet: 10.4.0.0 / 255.255.255.0 | +Subnet: 10.4.0.0 / 255.255.0.0");
     row("netmask that was missing", "subnet 10.3", with(subnet("10.3.0.0", ""), type({same, text("255.255.0.0")})),
-        "-subnet 10.3.0.0 | +subnet 10.3.0.0 netmask 255.255.0.0");
+        "-subnet 10.3.0.0 | +subnet 10.3.0.0 netmask 255.255.0.0",
+        "-Subnet: 10.3.0.0 / | +Subnet: 10.3.0.0 / 255.255.0.0");
     row("range", "range 10.0.0.100", with(range("10.0.0.100", "10.0.0.110"), type(list("10.0.0.101 | 10.0.0.101"))),
         "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.100 10.0.0.110; | "
-        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.101 10.0.0.101;");
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.101 10.0.0.101;",
+        "-Range: 10.0.0.100 - 10.0.0.110 | +Range: 10.0.0.101 - 10.0.0.101");
     row("range for BOOTP", "range dynamic", with(range("10.0.0.10", "10.0.0.20"), type({same, text("10.0.0.25")})),
         "-subnet 10.0.0.0 netmask 255.255.255.0 > range dynamic-bootp 10.0.0.10 10.0.0.20; | "
-        "+subnet 10.0.0.0 netmask 255.255.255.0 > range dynamic-bootp 10.0.0.10 10.0.0.25;");
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range dynamic-bootp 10.0.0.10 10.0.0.25;",
+        "");
     row("range for BOOTP in capitals", "range DYNAMIC",
         with(range("10.0.0.40", "10.0.0.50"), type({same, text("10.0.0.55")})),
         "-subnet 10.0.0.0 netmask 255.255.255.0 > range DYNAMIC-BOOTP 10.0.0.40 10.0.0.50; | "
-        "+subnet 10.0.0.0 netmask 255.255.255.0 > range DYNAMIC-BOOTP 10.0.0.40 10.0.0.55;");
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range DYNAMIC-BOOTP 10.0.0.40 10.0.0.55;",
+        "");
     row("range of one address", "range 10.0.0.30", with(range("10.0.0.30", ""), type({same, text("10.0.0.35")})),
         "-subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30; | "
-        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30 10.0.0.35;");
+        "+subnet 10.0.0.0 netmask 255.255.255.0 > range 10.0.0.30 10.0.0.35;",
+        "-Range: 10.0.0.30 - | +Range: 10.0.0.30 - 10.0.0.35");
     row("shared network", "shared-network \"",
         with(named("Edit shared network", "Name:", "\"my office\""), type(list("attic"))),
-        "-shared-network \"my office\" | +shared-network attic");
+        "-shared-network \"my office\" | +shared-network attic",
+        R"(-Shared network: "my office" | +Shared network: attic)");
     row("shared network with a space", "shared-network lab",
         with(named("Edit shared network", "Name:", "lab"), type(list("big lab"))),
-        "-shared-network lab | +shared-network \"big lab\"");
+        "-shared-network lab | +shared-network \"big lab\"", R"(-Shared network: lab | +Shared network: "big lab")");
     row("fixed address", "fixed-address 10.0.0.7",
         with(named("Edit fixed address", "IP:", "10.0.0.7, 10.0.0.8"), type(list("10.0.0.9"))),
-        R"(-host "my pc" > fixed-address 10.0.0.7, 10.0.0.8; | +host "my pc" > fixed-address 10.0.0.9;)");
+        R"(-host "my pc" > fixed-address 10.0.0.7, 10.0.0.8; | +host "my pc" > fixed-address 10.0.0.9;)",
+        "-Fixed address: 10.0.0.7, 10.0.0.8 | +Fixed address: 10.0.0.9");
     row("MAC address", "hardware ethernet 0011",
         with(named("Edit MAC address", "MAC address:", "00:11:22:33:44:55"), type(list("aabbccddeeff"))),
-        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet aa:bb:cc:dd:ee:ff;)");
+        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet aa:bb:cc:dd:ee:ff;)",
+        "-MAC address: 0011.2233.4455 | +MAC address: aa:bb:cc:dd:ee:ff");
 
-    const Input full = host("full", "00:11:22:33:44:55", "10.0.0.5");
+    const Input full{host("full", "00:11:22:33:44:55", "10.0.0.5")};
     row("host, all", "host full", with(full, type(list("a.lan | 001122334477 | 10.0.0.9"))),
         "-host full | -host full > hardware ethernet 00:11:22:33:44:55; | -host full > fixed-address 10.0.0.5; | "
-        "+host a.lan | +host a.lan > hardware ethernet 00:11:22:33:44:77; | +host a.lan > fixed-address 10.0.0.9;");
+        "+host a.lan | +host a.lan > hardware ethernet 00:11:22:33:44:77; | +host a.lan > fixed-address 10.0.0.9;",
+        "-Host: full | -MAC address: 00:11:22:33:44:55 | -Fixed address: 10.0.0.5 | +Host: a.lan | +MAC address: "
+        "00:11:22:33:44:77 | +Fixed address: 10.0.0.9");
     row("host, name", "host bare", with(host("bare", "00:00:00:00:00:00", ""), type(list("a.lan"))),
-        "-host bare | +host a.lan");
+        "-host bare | +host a.lan", "-Host: bare | +Host: a.lan");
     row("host, MAC", "host full", with(full, type({same, text("001122334477")})),
-        "-host full > hardware ethernet 00:11:22:33:44:55; | +host full > hardware ethernet 00:11:22:33:44:77;");
+        "-host full > hardware ethernet 00:11:22:33:44:55; | +host full > hardware ethernet 00:11:22:33:44:77;",
+        "-MAC address: 00:11:22:33:44:55 | +MAC address: 00:11:22:33:44:77");
     row("host, address", "host full", with(full, type({same, same, text("10.0.0.9")})),
-        "-host full > fixed-address 10.0.0.5; | +host full > fixed-address 10.0.0.9;");
+        "-host full > fixed-address 10.0.0.5; | +host full > fixed-address 10.0.0.9;",
+        "-Fixed address: 10.0.0.5 | +Fixed address: 10.0.0.9");
     row("host, MAC of one without", "host fixed",
-        with(host("fixed", "00:00:00:00:00:00", "10.0.0.6"), type({same, text("001122334477")})), "");
+        with(host("fixed", "00:00:00:00:00:00", "10.0.0.6"), type({same, text("001122334477")})), "", "");
     row("host, MAC of a bare one", "host bare",
-        with(host("bare", "00:00:00:00:00:00", ""), type({same, text("001122334477")})), "");
+        with(host("bare", "00:00:00:00:00:00", ""), type({same, text("001122334477")})), "", "");
     row("host, address of one without hardware", "host fixed",
         with(host("fixed", "00:00:00:00:00:00", "10.0.0.6"), type({same, same, text("10.0.0.9")})),
-        "-host fixed > fixed-address 10.0.0.6; | +host fixed > fixed-address 10.0.0.9;");
+        "-host fixed > fixed-address 10.0.0.6; | +host fixed > fixed-address 10.0.0.9;",
+        "-Fixed address: 10.0.0.6 | +Fixed address: 10.0.0.9");
     row("host, address of one without", "host hard",
         with(host("hard", "00:11:22:33:44:66", ""), type({same, same, text("10.0.0.9")})),
-        "+host hard > fixed-address 10.0.0.9;");
+        "+host hard > fixed-address 10.0.0.9;", "+Fixed address: 10.0.0.9");
     row("host in quotes, MAC", "host \"",
         with(host("\"my pc\"", "00:11:22:33:44:55", "10.0.0.7, 10.0.0.8"), type({same, text("001122334477")})),
-        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet 00:11:22:33:44:77;)");
+        R"(-host "my pc" > hardware ethernet 0011.2233.4455; | +host "my pc" > hardware ethernet 00:11:22:33:44:77;)",
+        "-MAC address: 0011.2233.4455 | +MAC address: 00:11:22:33:44:77");
 }
 
-void TestTopologyEdits::changedFieldReachesTheStatement()
+void TopologyEditsTest::changedFieldReachesTheStatement()
 {
     QFETCH(Edit, change);
+    QFETCH(QStringList, shown);
     const TopologyWindow window{configuration};
     window.tree().collapse(window.find(text("host hard")));
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     edit(window, change.statement, change.input);
     QCOMPARE(window.changes(), change.changes);
+    QCOMPARE(window.shownChanges(), shown);
     QCOMPARE(window.offersSave(), !change.changes.isEmpty());
     QCOMPARE(window.notices() > 0, !change.changes.isEmpty());
-    const bool isAdded = change.changes.size() == 1;
+    const bool isAdded{change.changes.size() == 1};
     QCOMPARE(window.resets(), isAdded ? 1 : 0);
     if (!isAdded)
-        QCOMPARE(window.openBranches().size(), open.size()); // the words of some are others now
+        QCOMPARE(window.openBranches().size(), open.size()); // some have other words now
     QVERIFY(window.tree().currentIndex().isValid());
+    if (window.offersSave()) {
+        ModalBoxes boxes;
+        QCOMPARE(window.saveToFile(boxes), window.content());
+    }
 }
 
-void TestTopologyEdits::cancelledEditChangesNothing()
+void TopologyEditsTest::cancelledEditChangesNothing()
 {
     QFETCH(Edit, change);
     const TopologyWindow window{configuration};
@@ -373,7 +413,7 @@ void TestTopologyEdits::cancelledEditChangesNothing()
     QVERIFY(!window.offersSave());
 }
 
-void TestTopologyEdits::refusedEditSaysWhy_data()
+void TopologyEditsTest::refusedEditSaysWhy_data()
 {
     QTest::addColumn<Edit>("refused");
     QTest::addColumn<QString>("error");
@@ -412,7 +452,7 @@ void TestTopologyEdits::refusedEditSaysWhy_data()
         "Invalid MAC '00:::::'");
 }
 
-void TestTopologyEdits::refusedEditSaysWhy()
+void TopologyEditsTest::refusedEditSaysWhy()
 {
     QFETCH(Edit, refused);
     QFETCH(QString, error);
@@ -424,7 +464,7 @@ void TestTopologyEdits::refusedEditSaysWhy()
 }
 
 // The dialog holds a little more than a year.
-void TestTopologyEdits::leaseTimesOfAnySizeAreKept_data()
+void TopologyEditsTest::leaseTimesOfAnySizeAreKept_data()
 {
     QTest::addColumn<QByteArray>("seconds");
     QTest::addColumn<QString>("shown");
@@ -434,12 +474,12 @@ void TestTopologyEdits::leaseTimesOfAnySizeAreKept_data()
         QTest::addRow("%s", seconds) << QByteArray{seconds} << text("0 | 0 | 0 h | 0 m | 0 s");
 }
 
-void TestTopologyEdits::leaseTimesOfAnySizeAreKept()
+void TopologyEditsTest::leaseTimesOfAnySizeAreKept()
 {
     QFETCH(QByteArray, seconds);
     QFETCH(QString, shown);
     const TopologyWindow window{"max-lease-time " + seconds + ";\n"};
-    const Input input = time("Edit max lease time", qPrintable(shown));
+    const Input input{time("Edit max lease time", qPrintable(shown))};
     edit(window, text("max-lease-time"), input);
     QCOMPARE(window.changes(), QStringList{});
     edit(window, text("max-lease-time"), with(input, type(list("0 | 0 | 0 | 0 | 7"))));
@@ -447,7 +487,7 @@ void TestTopologyEdits::leaseTimesOfAnySizeAreKept()
              (QStringList{text("-max-lease-time %1;").arg(QString::fromLatin1(seconds)), text("+max-lease-time 7;")}));
 }
 
-void TestTopologyEdits::addressOfABareHostIsAdded()
+void TopologyEditsTest::addressOfABareHostIsAdded()
 {
     const TopologyWindow window{configuration};
     edit(window, text("host bare"),
@@ -457,7 +497,7 @@ void TestTopologyEdits::addressOfABareHostIsAdded()
     QVERIFY(window.isInView(window.find(text("fixed-address 10.0.0.9"))));
 }
 
-void TestTopologyEdits::nameWithASpaceIsQuoted()
+void TopologyEditsTest::nameWithASpaceIsQuoted()
 {
     const TopologyWindow window{configuration};
     const auto takeQuotesOff = [](ModalBoxes & /*boxes*/, QDialog * /*dialog*/) {
@@ -470,7 +510,7 @@ void TestTopologyEdits::nameWithASpaceIsQuoted()
     QCOMPARE(window.changes().mid(3, 1), list("+host \"my p\""));
 }
 
-void TestTopologyEdits::editNeedsItsKindOfStatement_data()
+void TopologyEditsTest::editNeedsItsKindOfStatement_data()
 {
     QTest::addColumn<Slot>("command");
     QTest::addColumn<QStringList>("fitting");
@@ -499,18 +539,18 @@ void TestTopologyEdits::editNeedsItsKindOfStatement_data()
         "option classless-static-routes 24 | option ms-classless | authoritative");
 }
 
-void TestTopologyEdits::editNeedsItsKindOfStatement()
+void TopologyEditsTest::editNeedsItsKindOfStatement()
 {
     QFETCH(Slot, command);
     QFETCH(QStringList, fitting);
     const TopologyWindow window{configuration};
     const ModalBoxes boxes; // fails the test when anything opens
-    const QStringList all = list(" | shared-network lab | subnet 10.0 | range 10.0.0.100 | host full | fixed-address | "
-                                 "option routers | option domain-name-servers | option ntp-servers | "
-                                 "option domain-name  | hardware | default-lease-time | max-lease-time | "
-                                 "min-lease-time | option classless-static-routes code | "
-                                 "option classless-static-routes 24 | option ms-classless | group | subclass | "
-                                 "authoritative");
+    const QStringList all{list(" | shared-network lab | subnet 10.0 | range 10.0.0.100 | host full | fixed-address | "
+                               "option routers | option domain-name-servers | option ntp-servers | "
+                               "option domain-name  | hardware | default-lease-time | max-lease-time | "
+                               "min-lease-time | option classless-static-routes code | "
+                               "option classless-static-routes 24 | option ms-classless | group | subclass | "
+                               "authoritative")};
     int tried{};
     for (const QString &statement : all) {
         if (fitting.contains(statement))
@@ -525,5 +565,5 @@ void TestTopologyEdits::editNeedsItsKindOfStatement()
     QCOMPARE(window.notices(), 0);
 }
 
-QTEST_MAIN(TestTopologyEdits)
+QTEST_MAIN(TopologyEditsTest)
 #include "tst_topologyedits.moc"

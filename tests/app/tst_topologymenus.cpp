@@ -2,8 +2,8 @@
 // Which commands the topology tree offers for which statement: its context menus, and the editors behind "Edit" and the
 // double click.
 #include "tests/app/topologywindow.h"
-#include "tests/dialogs/dialogdriver.h"
 #include "tests/support/contexttranslator.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QAction>
 #include <QApplication>
@@ -99,7 +99,7 @@ void dismiss(QMenu *menu) { QTest::keyClick(menu, Qt::Key_Escape); }
 
 } // namespace
 
-class TestTopologyMenus final : public QObject
+class TopologyMenusTest final : public QObject
 {
     Q_OBJECT
 
@@ -116,18 +116,18 @@ private slots:
     void nothingIsEditedAboveTheStatements();
 };
 
-void TestTopologyMenus::statementHasItsMenu_data()
+void TopologyMenusTest::statementHasItsMenu_data()
 {
     QTest::addColumn<QString>("statement");
     QTest::addColumn<QString>("entries");
 
-    const QString root = text("aAddSharedNetwork aAddSubnet aAddHost aAddStaticRoute - aAddDeclaration >Add parameter");
-    const QString subnet = text("aAddRange - aAddDeclaration - >Add parameter - actionEdit actionRemove");
-    const QString sharedNetwork = text("aAddSubnet - aAddDeclaration - >Add parameter - actionEdit actionRemove");
-    const QString host = text("aAddFixedIp - aAddDeclaration - aAddStaticRoute - >Add parameter - actionEdit "
-                              "actionRemove");
-    const QString other = text("aAddDeclaration - >Add parameter - actionEdit actionRemove");
-    const QString leaf = text("actionEdit actionRemove");
+    const QString root{text("aAddSharedNetwork aAddSubnet aAddHost aAddStaticRoute - aAddDeclaration >Add parameter")};
+    const QString subnet{text("aAddRange - aAddDeclaration - >Add parameter - actionEdit actionRemove")};
+    const QString sharedNetwork{text("aAddSubnet - aAddDeclaration - >Add parameter - actionEdit actionRemove")};
+    const QString host{text("aAddFixedIp - aAddDeclaration - aAddStaticRoute - >Add parameter - actionEdit "
+                            "actionRemove")};
+    const QString other{text("aAddDeclaration - >Add parameter - actionEdit actionRemove")};
+    const QString leaf{text("actionEdit actionRemove")};
     const auto row = [](const char *statement, const QString &entries) {
         QTest::addRow("%s", *statement ? statement : "All network") << text(statement) << entries;
     };
@@ -150,7 +150,7 @@ void TestTopologyMenus::statementHasItsMenu_data()
         row(statement, leaf);
 }
 
-void TestTopologyMenus::statementHasItsMenu()
+void TopologyMenusTest::statementHasItsMenu()
 {
     QFETCH(QString, statement);
     QFETCH(QString, entries);
@@ -165,14 +165,14 @@ void TestTopologyMenus::statementHasItsMenu()
     QCOMPARE(window.changes(), QStringList{});
 }
 
-void TestTopologyMenus::submenusAreShared()
+void TopologyMenusTest::submenusAreShared()
 {
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
     QMenu *shared{};
     for (const char *statement : {"", "subnet", "shared-network", "host", "group"}) {
         window.openMenu(boxes, text(statement), [&](QMenu *menu) {
-            QMenu *parameters = submenuOf(*menu);
+            QMenu *parameters{submenuOf(*menu)};
             QVERIFY(parameters);
             if (!shared)
                 shared = parameters;
@@ -188,7 +188,7 @@ void TestTopologyMenus::submenusAreShared()
              text("aAddRouters aAddDns aAddNtpServers aAddDomainName aAddDHCPDynamicUpdate"));
 }
 
-void TestTopologyMenus::menuOpensAtTheMouse()
+void TopologyMenusTest::menuOpensAtTheMouse()
 {
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
@@ -200,8 +200,8 @@ void TestTopologyMenus::menuOpensAtTheMouse()
     });
 }
 
-// As when a key asks for it.
-void TestTopologyMenus::menuIsOfTheCurrentStatement()
+// As when the menu key asks for it.
+void TopologyMenusTest::menuIsOfTheCurrentStatement()
 {
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
@@ -213,7 +213,7 @@ void TestTopologyMenus::menuIsOfTheCurrentStatement()
     window.window().handleTreeContextMenuRequested({});
 }
 
-void TestTopologyMenus::noMenuWithoutAStatement()
+void TopologyMenusTest::noMenuWithoutAStatement()
 {
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
@@ -223,7 +223,7 @@ void TestTopologyMenus::noMenuWithoutAStatement()
     QVERIFY(!QApplication::activePopupWidget());
 }
 
-void TestTopologyMenus::textsAreTranslatedAsTheWindows()
+void TopologyMenusTest::textsAreTranslatedAsTheWindows()
 {
     ContextTranslator translator;
     QCoreApplication::installTranslator(&translator);
@@ -231,12 +231,12 @@ void TestTopologyMenus::textsAreTranslatedAsTheWindows()
     ModalBoxes boxes;
     window.openMenu(boxes, text("subnet"), [](QMenu *menu) {
         QCOMPARE(menu->title(), text("FMain|Actions"));
-        QMenu *parameters = submenuOf(*menu);
+        QMenu *parameters{submenuOf(*menu)};
         QCOMPARE(parameters->title(), text("FMain|Add parameter"));
         QCOMPARE(submenuOf(*parameters)->title(), text("FMain|Add option"));
         dismiss(menu);
     });
-    ModalBoxes::Box warning = advancedBox();
+    ModalBoxes::Box warning{advancedBox()};
     warning.title = text("FMain|") + warning.title;
     warning.text = text("FMain|") + warning.text;
     boxes.expectBox(warning, QMessageBox::Yes);
@@ -249,14 +249,14 @@ void TestTopologyMenus::textsAreTranslatedAsTheWindows()
     QCoreApplication::removeTranslator(&translator);
 }
 
-void TestTopologyMenus::editorFitsTheStatement_data()
+void TopologyMenusTest::editorFitsTheStatement_data()
 {
     QTest::addColumn<QString>("statement");
     QTest::addColumn<bool>("warns");
     QTest::addColumn<QString>("title");
 
     const auto row = [](const char *statement, const char *title) {
-        const bool warns = text(title).startsWith(text("Edit arbitrary")) || text(statement).contains(text(" code "));
+        const bool warns{text(title).startsWith(text("Edit arbitrary")) || text(statement).contains(text(" code "))};
         QTest::addRow("%s", statement) << text(statement) << warns << text(title);
     };
     row("shared-network", "Edit shared network");
@@ -290,7 +290,7 @@ void TestTopologyMenus::editorFitsTheStatement_data()
         row(statement, "Edit arbitrary parameter");
 }
 
-void TestTopologyMenus::editorFitsTheStatement()
+void TopologyMenusTest::editorFitsTheStatement()
 {
     QFETCH(QString, statement);
     QFETCH(bool, warns);
@@ -308,7 +308,7 @@ void TestTopologyMenus::editorFitsTheStatement()
             driver::click(*dialog, QDialogButtonBox::Cancel);
         });
     };
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     for (const int column : {0, 1}) {
         expectEditor();
         window.doubleClick(statement, column);
@@ -322,11 +322,11 @@ void TestTopologyMenus::editorFitsTheStatement()
     QVERIFY(!window.offersSave());
 }
 
-void TestTopologyMenus::nothingIsEditedAboveTheStatements()
+void TopologyMenusTest::nothingIsEditedAboveTheStatements()
 {
     const TopologyWindow window{configuration};
     const ModalBoxes boxes; // fails the test when anything opens
-    const QStringList open = window.openBranches();
+    const QStringList open{window.openBranches()};
     for (const int column : {0, 1}) {
         window.doubleClick({}, column);
         window.action("actionEdit").trigger();
@@ -338,5 +338,5 @@ void TestTopologyMenus::nothingIsEditedAboveTheStatements()
     QCOMPARE(window.notices(), 0);
 }
 
-QTEST_MAIN(TestTopologyMenus)
+QTEST_MAIN(TopologyMenusTest)
 #include "tst_topologymenus.moc"

@@ -2,7 +2,7 @@
 // What the DHCP server itself says of a file after every command of the topology tree.
 #include "common/paths.h"
 #include "tests/app/topologywindow.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/realdhcpd.h"
 
 #include <QDialog>
@@ -80,7 +80,7 @@ zone example.org. {
 }
 )";
 
-/// A command from a statement's menu, and what is typed in its dialog.
+/// A command of a statement's menu, and what is typed into its dialog.
 struct Step
 {
     const char *statement;
@@ -89,24 +89,18 @@ struct Step
     bool isAdvanced{};
 };
 
-QStringList parameter(const char *entry) { return {text("Add parameter"), text(entry)}; }
-QStringList option(const char *entry) { return {text("Add parameter"), text("Add option"), text(entry)}; }
-
 void saveThroughTheMenu(const TopologyWindow &window, ModalBoxes &boxes)
 {
     auto *bar = driver::find<QMenuBar>(window.window());
     boxes.expectMenu(text("Save"));
-    boxes.expectBox({QMessageBox::Information, text("Information"),
-                     text("Current configuration in file will be rewrited.\nDo you want to save changes?"),
-                     QMessageBox::Save | QMessageBox::Cancel, QMessageBox::Save},
-                    QMessageBox::Save);
+    boxes.expectBox(saveQuestion(), QMessageBox::Save);
     QTest::mouseClick(bar, Qt::LeftButton, {}, bar->actionGeometry(bar->actions().first()).center());
     boxes.verify();
 }
 
 } // namespace
 
-class TestTopologyVerdict final : public QObject
+class TopologyVerdictTest final : public QObject
 {
     Q_OBJECT
 
@@ -114,18 +108,18 @@ private slots:
     void serverAcceptsWhatEveryCommandMade();
 };
 
-void TestTopologyVerdict::serverAcceptsWhatEveryCommandMade()
+void TopologyVerdictTest::serverAcceptsWhatEveryCommandMade()
 {
-    // Before the window brings a machine of its own, with another server.
-    const QString server = realDhcpd();
+    // Looked for before the window puts another server into PATH.
+    const QString server{realDhcpd()};
     if (server.isEmpty())
         QSKIP("no dhcpd in the folder of ORV_TOOLS_DIR, in PATH or in /usr/sbin");
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
 
-    const QStringList edit = list("Edit");
+    const QStringList edit{list("Edit")};
     const QString same{};
-    const Step steps[] = {
+    const Step steps[]{
         {"subnet", option("Add gateways"), addAddresses(list("10.0.0.1"))},
         {"option routers", edit, addAddresses(list("10.0.0.3"))},
         {"subnet", option("Add DNS servers"), addAddresses(list("10.0.0.1"))},
@@ -173,7 +167,7 @@ void TestTopologyVerdict::serverAcceptsWhatEveryCommandMade()
         });
     };
     for (const Step &step : steps) {
-        const int before = window.notices();
+        const int before{window.notices()};
         window.choose(boxes, text(step.statement), step.entries, [&] { answer(step); });
         QVERIFY2(window.notices() > before, step.statement);
     }
@@ -188,11 +182,11 @@ void TestTopologyVerdict::serverAcceptsWhatEveryCommandMade()
     });
 
     saveThroughTheMenu(window, boxes);
-    const QByteArray file = readTestFile(paths::configuration());
+    const QByteArray file{readTestFile(paths::configuration())};
     QCOMPARE(complaintOf(server, file), QString{});
     QCOMPARE(QString::fromUtf8(file), text(saved));
     QVERIFY(!window.offersSave());
 }
 
-QTEST_MAIN(TestTopologyVerdict)
+QTEST_MAIN(TopologyVerdictTest)
 #include "tst_topologyverdict.moc"

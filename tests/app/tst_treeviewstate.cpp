@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/treeviewstate.h"
+#include "tests/support/text.h"
 
 #include <QScrollBar>
 #include <QTest>
@@ -10,8 +11,6 @@
 #include <vector>
 
 namespace {
-
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
 
 /// A tree whose nodes are changed within a reset; an index's internal pointer is its node.
 class NodeModel final : public QAbstractItemModel
@@ -48,10 +47,10 @@ public:
     }
     QModelIndex parent(const QModelIndex &index) const override
     {
-        Node *parent = nodeOf(index).parent;
+        Node *parent{nodeOf(index).parent};
         if (!parent || parent == &m_top)
             return {};
-        int row = 0;
+        int row{0};
         while (parent->parent->children.at(static_cast<std::size_t>(row)).get() != parent)
             ++row;
         return createIndex(row, 0, parent);
@@ -100,7 +99,7 @@ private:
     // Destroyed from the bottom up.
     std::unique_ptr<NodeModel> m_model;
     std::unique_ptr<QTreeView> m_tree;
-    TreeViewState *m_expansion{};
+    TreeViewState *m_viewState{};
 };
 
 // a { b { c d } e { } f }, g { h }, and many leaves
@@ -108,29 +107,29 @@ void TreeViewStateTest::init()
 {
     m_tree.reset();
     m_model = std::make_unique<NodeModel>();
-    NodeModel::Node &a = m_model->top().add(text("a"));
-    NodeModel::Node &b = a.add(text("b"));
+    NodeModel::Node &a{m_model->top().add(text("a"))};
+    NodeModel::Node &b{a.add(text("b"))};
     b.add(text("c"));
     b.add(text("d")).add(text("i"));
     a.add(text("e"));
     m_model->top().add(text("g")).add(text("h"));
-    for (int i = 0; i < 200; ++i)
+    for (int i{0}; i < 200; ++i)
         m_model->top().add(QString::number(i));
 
     m_tree = std::make_unique<QTreeView>();
     m_tree->setModel(m_model.get());
-    m_expansion = new TreeViewState{m_tree.get()};
+    m_viewState = new TreeViewState{m_tree.get()};
     m_tree->show();
     QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
 }
 
 QModelIndex TreeViewStateTest::find(const QString &name, const QModelIndex &parent) const
 {
-    for (int row = 0; row < m_model->rowCount(parent); ++row) {
-        const QModelIndex index = m_model->index(row, 0, parent);
+    for (int row{0}; row < m_model->rowCount(parent); ++row) {
+        const QModelIndex index{m_model->index(row, 0, parent)};
         if (index.data().toString() == name)
             return index;
-        if (const QModelIndex found = find(name, index); found.isValid())
+        if (const QModelIndex found{find(name, index)}; found.isValid())
             return found;
     }
     return {};
@@ -140,7 +139,7 @@ QStringList TreeViewStateTest::open() const
 {
     QStringList names;
     for (const char *name : {"a", "b", "c", "d", "e", "g", "h", "i", "new", "7"}) {
-        if (const QModelIndex index = find(text(name)); index.isValid() && m_tree->isExpanded(index))
+        if (const QModelIndex index{find(text(name))}; index.isValid() && m_tree->isExpanded(index))
             names.append(text(name));
     }
     return names;
@@ -148,7 +147,7 @@ QStringList TreeViewStateTest::open() const
 
 void TreeViewStateTest::everyBranchOpens()
 {
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
     QVERIFY(!m_tree->visualRect(find(text("h"))).isEmpty());
     QCOMPARE(m_tree->indexBelow(find(text("i"))), find(text("e")));
@@ -156,16 +155,16 @@ void TreeViewStateTest::everyBranchOpens()
 
 void TreeViewStateTest::noLeafIsMarkedAsOpen()
 {
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     QCOMPARE(open(), text("a b d g").split(QLatin1Char{' '}));
 }
 
 void TreeViewStateTest::everyBranchOpensAgain()
 {
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     m_tree->collapse(find(text("b")));
     m_tree->collapse(find(text("g")));
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     QCOMPARE(open(), text("a b d g").split(QLatin1Char{' '}));
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
 }
@@ -191,7 +190,7 @@ void TreeViewStateTest::openBranchesStayOverAReset()
 
 void TreeViewStateTest::openBranchWithinAClosedOneStays()
 {
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     m_tree->collapse(find(text("a")));
     m_model->reset([] {});
     QCOMPARE(open(), text("b d g").split(QLatin1Char{' '}));
@@ -201,18 +200,18 @@ void TreeViewStateTest::openBranchWithinAClosedOneStays()
 
 void TreeViewStateTest::scrollPositionStaysOverAReset()
 {
-    m_expansion->expandAll();
-    QScrollBar *bar = m_tree->verticalScrollBar();
+    m_viewState->expandAll();
+    QScrollBar *bar{m_tree->verticalScrollBar()};
     QVERIFY(bar->maximum() > 60);
     bar->setValue(50);
-    const QModelIndex first = m_tree->indexAt({1, 1});
-    const void *node = first.internalPointer();
+    const QModelIndex first{m_tree->indexAt({1, 1})};
+    const void *node{first.internalPointer()};
     m_model->reset([this] { m_model->top().add(text("new")); });
     QCOMPARE(bar->value(), 50);
     QCOMPARE(m_tree->indexAt({1, 1}).internalPointer(), node);
 }
 
-// Which row is current after a reset is for the command to say.
+// Which row is current after a reset is up to the command.
 void TreeViewStateTest::currentRowIsNotKept()
 {
     m_tree->setCurrentIndex(find(text("g")));
@@ -222,9 +221,9 @@ void TreeViewStateTest::currentRowIsNotKept()
 
 void TreeViewStateTest::emptyModelIsNothing()
 {
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     m_model->reset([this] { m_model->top().children.clear(); });
-    m_expansion->expandAll();
+    m_viewState->expandAll();
     QCOMPARE(open(), QStringList{});
     m_model->reset([this] { m_model->top().add(text("a")).add(text("h")); });
     QCOMPARE(open(), QStringList{});

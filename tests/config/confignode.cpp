@@ -54,8 +54,8 @@ void addChildren(DhcpdConfigDeclaration &declaration, const ConfigNode &node)
     for (const ConfigNode &param : node.parameters)
         declaration.addParam(std::make_unique<DhcpdConfigParam>(param.words, &declaration));
     for (const ConfigNode &child : node.declarations) {
-        auto *const added =
-            declaration.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(child.words, &declaration));
+        DhcpdConfigDeclaration *added{
+            declaration.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(child.words, &declaration))};
         addChildren(*added, child);
     }
 }

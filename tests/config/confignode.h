@@ -9,7 +9,7 @@
 
 #include <vector>
 
-/// A statement and everything under it as plain values, to compare trees with.
+/// A statement and everything below it as plain values, for comparing trees.
 struct ConfigNode
 {
     QStringList words;
@@ -19,13 +19,13 @@ struct ConfigNode
     bool operator==(const ConfigNode &other) const;
 };
 
-/// Also used by QCOMPARE: one line a statement, each word between angle brackets.
+/// Also used by QCOMPARE: one line for each statement, each word between angle brackets.
 QString toText(const ConfigNode &node);
 char *toString(const ConfigNode &node);
 
 ConfigNode nodeOf(const DhcpdConfigStatement &statement);
 
-/// Makes `node`'s children statements under `declaration`.
+/// Adds the children of `node` as statements to `declaration`.
 void addChildren(DhcpdConfigDeclaration &declaration, const ConfigNode &node);
 
 /// A declaration that stands for the invisible top node.

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "tests/config/editedmodel.h"
 
+#include "tests/support/text.h"
+
 #include <QTest>
 
 namespace {
@@ -121,3 +123,26 @@ void verifyRefusal(const Refusal &refusal)
 }
 
 void verifyLinks(const DhcpdConfigModel &model) { verifyLinksUnder(model, {}); }
+
+EditCase::Edit addSubnet(const char *address, const char *mask)
+{
+    return
+        [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addSubnet(text(address), text(mask), parent); };
+}
+
+EditCase::Edit addRange(const char *start, const char *end)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addRange(text(start), text(end), parent); };
+}
+
+EditCase::Edit addHost(const char *name, const char *mac, const char *address)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) {
+        model.addHost(text(name), text(mac), text(address), parent);
+    };
+}
+
+EditCase::Edit addValue(ValueOperation add, const char *value)
+{
+    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { (model.*add)(text(value), parent); };
+}

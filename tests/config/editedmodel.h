@@ -7,7 +7,7 @@
 
 #include <functional>
 
-/// An edit of a configuration and what comes of it.
+/// An edit of a configuration and its result.
 struct EditCase
 {
     using Edit = std::function<void(DhcpdConfigModel &model, const QModelIndex &index)>;
@@ -15,7 +15,7 @@ struct EditCase
     QString before; ///< a configuration
     QString target; ///< the statement whose index `edit` gets, see EditedModel::find()
     Edit edit;
-    QString after; ///< the outline that comes of it, see EditedModel::outline()
+    QString after; ///< the outline afterwards, see EditedModel::outline()
     int resets{1};
 };
 Q_DECLARE_METATYPE(EditCase)
@@ -31,7 +31,7 @@ struct Refusal
 };
 Q_DECLARE_METATYPE(Refusal)
 
-/// A model of a configuration, with an account of its signals.
+/// A model of a configuration that records the signals it emits.
 class EditedModel final
 {
 public:
@@ -45,13 +45,13 @@ public:
     /// an invalid index for "top".
     QModelIndex find(const QString &text) const;
 
-    /// One line a statement but the "All network" node: its words with bars between them, indented by how deep it
-    /// stands, and a brace behind a declaration.
+    /// One line for each statement but the "All network" node: its words with bars between them, indented by its depth,
+    /// and a brace behind a declaration.
     QString outline() const;
 
-    /// Fails the test unless the model told of one change of everything, with that many resets, and of no error.
+    /// Fails the test unless the model reported one change of everything, with that many resets, and no error.
     void verifyChange(int resets) const;
-    /// Fails the test unless the model told of that error only.
+    /// Fails the test unless the model reported that error and nothing else.
     void verifyRefusal(const QString &error) const;
 
 private:
@@ -66,5 +66,13 @@ private:
 void verifyEdit(const EditCase &edit);
 void verifyRefusal(const Refusal &refusal);
 
-/// Compares the links of every statement with the place at which it stands; fails the test when one is wrong.
+/// Fails the test unless the parent and the row that every statement knows are those of its place in the tree.
 void verifyLinks(const DhcpdConfigModel &model);
+
+/// Edits as the rows of a table name them.
+EditCase::Edit addSubnet(const char *address, const char *mask);
+EditCase::Edit addRange(const char *start, const char *end);
+EditCase::Edit addHost(const char *name, const char *mac, const char *address);
+/// An operation that adds a parameter of one value.
+using ValueOperation = void (DhcpdConfigModel::*)(const QString &value, const QModelIndex &parent);
+EditCase::Edit addValue(ValueOperation add, const char *value);

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-// libFuzzer target: the reader agrees with the reference on any text and takes any bytes, and what the writer wrote
-// stays as it is when it is read and written again.
+// libFuzzer target: the reader agrees with the reference on any text and copes with any bytes, and what the writer
+// wrote stays the same when it is read and written again.
 #include "config/configreader.h"
 #include "config/configwriter.h"
 #include "tests/config/referencereader.h"
@@ -40,7 +40,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
         return 0;
     require(nodeOf(*tree) == expected);
 
-    // Where a quote is never closed, putting the statements in order can turn a comment sign in a word into a comment.
+    // After a quote that is never closed, reordering the statements can turn a comment sign in a word into a comment.
     const QByteArray written{serialize(*tree)};
     if (written.contains('#'))
         return 0;

@@ -12,7 +12,7 @@ bool holdsAnyCase(const QStringList &words, const char *word)
     return words.contains(QString::fromLatin1(word), Qt::CaseInsensitive);
 }
 
-// Ends the statement of `words` in the innermost of the open blocks.
+// Adds the statement of `words` to the innermost open block.
 void endStatement(std::vector<ConfigNode *> &open, QStringList words, QChar delimiter)
 {
     while (words.size() == 1)

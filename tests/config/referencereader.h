@@ -3,9 +3,9 @@
 
 #include "tests/config/confignode.h"
 
-/// What a configuration's text holds, found character by character without regard to speed: the judge of the program's
-/// reader. It knows no limit of nesting.
+/// Reads a configuration character by character, without regard to speed, for comparison with the program's reader. It
+/// has no limit of nesting.
 ConfigNode readByReference(const QString &text);
 
-/// The deepest nesting of blocks in `node`, not counting itself.
+/// The deepest nesting of blocks in `node`, not counting `node` itself.
 int blockDepth(const ConfigNode &node);

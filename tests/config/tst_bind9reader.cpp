@@ -10,10 +10,10 @@
 
 namespace {
 
-// Words from a text that has a bar between them.
+// The words between the bars of a text; none for an empty text.
 QStringList words(const char *text)
 {
-    const auto joined = QString::fromUtf8(text);
+    const QString joined{QString::fromUtf8(text)};
     return joined.isEmpty() ? QStringList{} : joined.split(QLatin1Char{'|'});
 }
 
@@ -45,7 +45,7 @@ QStringList preparedFrom(const QTemporaryDir &folder, const char *file, const QS
 
 } // namespace
 
-class TestBind9Reader final : public QObject
+class Bind9ReaderTest final : public QObject
 {
     Q_OBJECT
 
@@ -68,7 +68,7 @@ private slots:
     void survivesAnyText();
 };
 
-void TestBind9Reader::scansStatements_data()
+void Bind9ReaderTest::scansStatements_data()
 {
     QTest::addColumn<QString>("text");
     QTest::addColumn<QStringList>("expected");
@@ -112,14 +112,14 @@ void TestBind9Reader::scansStatements_data()
     row("carriage return", "a b;\r\nc d;", "a|b|\r|c|d");
 }
 
-void TestBind9Reader::scansStatements()
+void Bind9ReaderTest::scansStatements()
 {
     QFETCH(QString, text);
     QFETCH(QStringList, expected);
     QCOMPARE(bind9::statements(text), expected);
 }
 
-void TestBind9Reader::removesComments_data()
+void Bind9ReaderTest::removesComments_data()
 {
     QTest::addColumn<QString>("text");
     QTest::addColumn<QString>("expected");
@@ -145,14 +145,14 @@ void TestBind9Reader::removesComments_data()
     row("empty", "", "");
 }
 
-void TestBind9Reader::removesComments()
+void Bind9ReaderTest::removesComments()
 {
     QFETCH(QString, text);
     QFETCH(QString, expected);
     QCOMPARE(bind9::withoutComments(text), expected);
 }
 
-void TestBind9Reader::keepsZonesAndKeys_data()
+void Bind9ReaderTest::keepsZonesAndKeys_data()
 {
     QTest::addColumn<QString>("text");
     QTest::addColumn<QStringList>("expected"); // as statements
@@ -203,14 +203,14 @@ void TestBind9Reader::keepsZonesAndKeys_data()
     row("unbalanced quote", "zone \"a { allow-update { key k; }; };", "");
 }
 
-void TestBind9Reader::keepsZonesAndKeys()
+void Bind9ReaderTest::keepsZonesAndKeys()
 {
     QFETCH(QString, text);
     QFETCH(QStringList, expected);
     QCOMPARE(bind9::statements(bind9::zonesAndKeys(text)), expected);
 }
 
-void TestBind9Reader::choosesUsable_data()
+void Bind9ReaderTest::choosesUsable_data()
 {
     QTest::addColumn<QStringList>("statements");
     QTest::addColumn<QStringList>("knownKeys");
@@ -256,7 +256,7 @@ void TestBind9Reader::choosesUsable_data()
         "key|k|algorithm|a|secret|s|zone|a.|primary|127.0.0.1|key|k");
 }
 
-void TestBind9Reader::choosesUsable()
+void Bind9ReaderTest::choosesUsable()
 {
     QFETCH(QStringList, statements);
     QFETCH(QStringList, knownKeys);
@@ -264,7 +264,7 @@ void TestBind9Reader::choosesUsable()
     QCOMPARE(bind9::usable(statements, knownKeys), expected);
 }
 
-void TestBind9Reader::preparesFile_data()
+void Bind9ReaderTest::preparesFile_data()
 {
     QTest::addColumn<QByteArray>("content");
     QTest::addColumn<QStringList>("expected");
@@ -290,7 +290,7 @@ void TestBind9Reader::preparesFile_data()
     row("Latin-1", "// \xFC\nkey k { algorithm a; secret \"s\"; };", "key|k|algorithm|a|secret|\"s\"");
 }
 
-void TestBind9Reader::preparesFile()
+void Bind9ReaderTest::preparesFile()
 {
     QFETCH(QByteArray, content);
     QFETCH(QStringList, expected);
@@ -299,7 +299,7 @@ void TestBind9Reader::preparesFile()
     QCOMPARE(preparedFrom(folder, "named.conf.local"), expected);
 }
 
-void TestBind9Reader::followsIncludes_data()
+void Bind9ReaderTest::followsIncludes_data()
 {
     QTest::addColumn<QByteArray>("local"); // named.conf.local; @ stands for the folder
     QTest::addColumn<QByteArray>("key");   // keys/ddns.key
@@ -324,7 +324,7 @@ void TestBind9Reader::followsIncludes_data()
     QTest::newRow("same file twice") << QByteArray{"include \"keys/ddns.key\";\n"}.repeated(2) << key << keyWords;
 }
 
-void TestBind9Reader::followsIncludes()
+void Bind9ReaderTest::followsIncludes()
 {
     QFETCH(QByteArray, local);
     QFETCH(QByteArray, key);
@@ -336,7 +336,7 @@ void TestBind9Reader::followsIncludes()
     QCOMPARE(preparedFrom(folder, "named.conf.local"), expected);
 }
 
-void TestBind9Reader::limitsDepthOfIncludes()
+void Bind9ReaderTest::limitsDepthOfIncludes()
 {
     const QTemporaryDir folder;
     for (int i{1}; i <= 40; ++i) {
@@ -350,7 +350,7 @@ void TestBind9Reader::limitsDepthOfIncludes()
     QVERIFY(!statements.contains(QStringLiteral("k17")));
 }
 
-void TestBind9Reader::limitsSizeOfIncludes()
+void Bind9ReaderTest::limitsSizeOfIncludes()
 {
     const QTemporaryDir folder;
     const QByteArray filler(3'000'000, ' ');
@@ -359,7 +359,7 @@ void TestBind9Reader::limitsSizeOfIncludes()
     QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("main"))).count(QStringLiteral("k")), 5);
 }
 
-void TestBind9Reader::givesNothingForUnreadableFile()
+void Bind9ReaderTest::givesNothingForUnreadableFile()
 {
     const QTemporaryDir folder;
     QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("missing"))), QStringList{});
@@ -367,8 +367,8 @@ void TestBind9Reader::givesNothingForUnreadableFile()
     QCOMPARE(preparedFrom(folder, "missing", {QStringLiteral("k")}), QStringList{});
 }
 
-// Whatever a text holds, the result is whole groups in an order that the server takes.
-void TestBind9Reader::survivesAnyText()
+// Whatever a text holds, the result is complete statements in an order that the server accepts.
+void Bind9ReaderTest::survivesAnyText()
 {
     static const QStringList pieces{
         words("\"|;|{|}|/|//|/*|*/|#| |\n|\r\n|zone |key |algorithm |secret |allow-update {|"
@@ -402,5 +402,5 @@ void TestBind9Reader::survivesAnyText()
     QVERIFY(groups > 1'000);
 }
 
-QTEST_GUILESS_MAIN(TestBind9Reader)
+QTEST_GUILESS_MAIN(Bind9ReaderTest)
 #include "tst_bind9reader.moc"

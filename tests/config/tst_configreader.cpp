@@ -32,7 +32,7 @@ QString nestedBlocks(int depth)
     return QStringLiteral("a {").repeated(depth) + QStringLiteral("b c;") + QStringLiteral("}").repeated(depth);
 }
 
-// Text made of what the reader looks at, with what it must not trip over.
+// A text of everything that means something to the reader, with what it must not trip over.
 QString randomText(QRandomGenerator &random)
 {
     static const QStringList pieces{
@@ -53,7 +53,7 @@ QString randomText(QRandomGenerator &random)
 
 } // namespace
 
-class ConfigReaderTest : public QObject
+class ConfigReaderTest final : public QObject
 {
     Q_OBJECT
 
@@ -148,7 +148,7 @@ void ConfigReaderTest::reads()
     QFETCH(QString, text);
     QFETCH(ConfigNode, tree);
     const auto top = makeTop();
-    const auto *const read = readUnder(*top, text);
+    const DhcpdConfigDeclaration *read{readUnder(*top, text)};
     QVERIFY(read);
     QCOMPARE(nodeOf(*read), tree);
     QCOMPARE(read->parent(), top.get());
@@ -171,7 +171,7 @@ void ConfigReaderTest::refusesDeepNesting()
     QFETCH(int, depth);
     QFETCH(bool, isRead);
     const auto top = makeTop();
-    const auto *const tree = readUnder(*top, nestedBlocks(depth));
+    const DhcpdConfigDeclaration *tree{readUnder(*top, nestedBlocks(depth))};
     QCOMPARE(tree != nullptr, isRead);
     QCOMPARE(top->childCount(), isRead ? 1 : 0);
     if (tree)
@@ -181,12 +181,12 @@ void ConfigReaderTest::refusesDeepNesting()
 void ConfigReaderTest::countsOpenBlocksOnly()
 {
     const auto top = makeTop();
-    const auto *const tree =
-        readUnder(*top, (nestedBlocks(maximumBlockDepth) + QStringLiteral(" range 1 2;")).repeated(3));
+    const DhcpdConfigDeclaration *tree{
+        readUnder(*top, (nestedBlocks(maximumBlockDepth) + QStringLiteral(" range 1 2;")).repeated(3))};
     QVERIFY(tree);
     QCOMPARE(tree->childCount(), 6);
-    const auto *const deepRanges =
-        readUnder(*top, QStringLiteral("a {").repeated(maximumBlockDepth) + QStringLiteral("range 1 2;"));
+    const DhcpdConfigDeclaration *deepRanges{
+        readUnder(*top, QStringLiteral("a {").repeated(maximumBlockDepth) + QStringLiteral("range 1 2;"))};
     QVERIFY(deepRanges);
 }
 
@@ -196,7 +196,7 @@ void ConfigReaderTest::agreesWithReference()
     for (int i{}; i < 20'000; ++i) {
         const QString text{randomText(random)};
         const auto top = makeTop();
-        const auto *const tree = readUnder(*top, text);
+        const DhcpdConfigDeclaration *tree{readUnder(*top, text)};
         QVERIFY2(tree && nodeOf(*tree) == readByReference(text), qPrintable(text.toHtmlEscaped()));
     }
 }
@@ -205,7 +205,7 @@ void ConfigReaderTest::agreesWithReferenceOnFiles_data()
 {
     QTest::addColumn<QString>("path");
     const QDir corpus{QFINDTESTDATA("corpus")};
-    const auto files = corpus.entryInfoList(QDir::Files);
+    const QFileInfoList files{corpus.entryInfoList(QDir::Files)};
     QVERIFY(!files.isEmpty());
     for (const QFileInfo &file : files)
         QTest::addRow("%s", qPrintable(file.fileName())) << file.filePath();
@@ -219,7 +219,7 @@ void ConfigReaderTest::agreesWithReferenceOnFiles()
     const QString text{QString::fromUtf8(file.readAll())};
     const ConfigNode expected{readByReference(text)};
     const auto top = makeTop();
-    const auto *const tree = readUnder(*top, text);
+    const DhcpdConfigDeclaration *tree{readUnder(*top, text)};
     QCOMPARE(tree != nullptr, blockDepth(expected) <= maximumBlockDepth);
     if (tree)
         QCOMPARE(nodeOf(*tree), expected);

@@ -2,6 +2,7 @@
 #include "config/configreader.h"
 #include "config/configwriter.h"
 #include "tests/config/confignode.h"
+#include "tests/support/text.h"
 
 #include <QRandomGenerator>
 #include <QTest>
@@ -21,11 +22,9 @@ const QStringList plainWords{
 const QStringList declarationKeywords{QStringLiteral("range"), QStringLiteral("SUBCLASS"),
                                       QStringLiteral("Fixed-Address")};
 
-QStringList split(const char *words) { return QString::fromUtf8(words).split(QLatin1Char{'|'}); }
-
 QString pick(QRandomGenerator &random, const QStringList &words) { return words[random.bounded(words.size())]; }
 
-// Words as the reader makes them: two at least, only the filler empty, quotes closed again.
+// Words as the reader makes them: at least two, none empty but the filler, every quote closed.
 QStringList randomWords(QRandomGenerator &random)
 {
     QStringList words;
@@ -60,7 +59,7 @@ ConfigNode randomBlock(QRandomGenerator &random, int depth)
 
 } // namespace
 
-class ConfigWriterTest : public QObject
+class ConfigWriterTest final : public QObject
 {
     Q_OBJECT
 
@@ -139,7 +138,7 @@ void ConfigWriterTest::writesEditedTrees()
 {
     QFETCH(ConfigNode, tree);
     const auto top = makeTop();
-    auto *const allNetwork = readUnder(*top, {});
+    DhcpdConfigDeclaration *allNetwork{readUnder(*top, {})};
     addChildren(*allNetwork, tree);
     QTEST(serialize(*top), "written");
 }
@@ -170,7 +169,7 @@ void ConfigWriterTest::readsBackWhatItWrote()
         addChildren(*readUnder(*top, {}), tree);
         const QByteArray written{serialize(*top)};
         const auto topAgain = makeTop();
-        const auto *const again = topAgain->addDeclaration(
+        const auto *again = topAgain->addDeclaration(
             readConfiguration({written.constData(), static_cast<std::size_t>(written.size())}, *topAgain));
         QCOMPARE(nodeOf(*again), tree);
         QCOMPARE(serialize(*topAgain), written);
@@ -181,7 +180,7 @@ void ConfigWriterTest::refusesATextThatIsTooLong()
 {
     // Some two kilobytes of indentation for each of the innermost statements.
     QByteArray text;
-    for (int depth = 0; depth < 499; ++depth)
+    for (int depth{0}; depth < 499; ++depth)
         text += "a {";
     const auto top = makeTop();
     QVERIFY(readUnder(*top, QString::fromLatin1(text + QByteArray{"b;"}.repeated(600'000))));
@@ -189,8 +188,7 @@ void ConfigWriterTest::refusesATextThatIsTooLong()
     QVERIFY(!serialize(*makeTop()).isNull());
 }
 
-// Words behind the keyword make a declaration of a line that is not nested deeper than its block, but written as one
-// that is.
+// With words behind the keyword it is a declaration, which stands no deeper than its block but is written as if it did.
 void ConfigWriterTest::refusesBlocksNestedTooDeep()
 {
     const QString blocks{QStringLiteral("a {").repeated(maximumBlockDepth)};

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "tests/config/editedmodel.h"
+#include "tests/support/text.h"
 
 #include <QTest>
 
@@ -7,32 +8,9 @@ namespace {
 
 using Edit = EditCase::Edit;
 
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
-
-// The words from a text that has bars between them.
-QStringList words(const char *joined) { return text(joined).split(QLatin1Char{'|'}); }
-
 Edit addSharedNetwork(const char *name)
 {
     return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addSharedNetwork(text(name), parent); };
-}
-
-Edit addSubnet(const char *address, const char *mask)
-{
-    return
-        [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addSubnet(text(address), text(mask), parent); };
-}
-
-Edit addRange(const char *start, const char *end)
-{
-    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addRange(text(start), text(end), parent); };
-}
-
-Edit addHost(const char *name, const char *mac, const char *address)
-{
-    return [=](DhcpdConfigModel &model, const QModelIndex &parent) {
-        model.addHost(text(name), text(mac), text(address), parent);
-    };
 }
 
 Edit addFixedAddress(const char *address)
@@ -40,7 +18,7 @@ Edit addFixedAddress(const char *address)
     return [=](DhcpdConfigModel &model, const QModelIndex &parent) { model.addFixedAddress(text(address), parent); };
 }
 
-// Those that return whether they added anything.
+// The operations that return whether they added anything.
 using WordsOperation = bool (DhcpdConfigModel::*)(const QStringList &words, const QModelIndex &parent);
 
 Edit addWords(WordsOperation add, const QStringList &words, bool isAdded = true)
@@ -48,7 +26,7 @@ Edit addWords(WordsOperation add, const QStringList &words, bool isAdded = true)
     return [=](DhcpdConfigModel &model, const QModelIndex &parent) { QCOMPARE((model.*add)(words, parent), isAdded); };
 }
 
-// A configuration of `depth` blocks, each in the one before; the innermost is a `kind`.
+// A configuration of `depth` blocks, each within the one before; the innermost is a `kind`.
 QString nestedBlocks(int depth, const char *kind)
 {
     return text("group { ").repeated(depth - 1) + text(kind) + text(" { ") + text("} ").repeated(depth);
@@ -76,7 +54,7 @@ constexpr auto subnet = "subnet 10.0.0.0 netmask 255.255.255.0 { range 10.0.0.10
 
 } // namespace
 
-class TestDeclarationEdits final : public QObject
+class DeclarationEditsTest final : public QObject
 {
     Q_OBJECT
 
@@ -100,7 +78,7 @@ private slots:
     void namesKeys();
 };
 
-void TestDeclarationEdits::adds_data()
+void DeclarationEditsTest::adds_data()
 {
     QTest::addColumn<EditCase>("edit");
 
@@ -171,49 +149,49 @@ void TestDeclarationEdits::adds_data()
     row("fixed address: replaces the first", "host a { x { } fixed-address b, c d; fixed-address e; }", "host",
         addFixedAddress("10.5"), "host|a {\n x| {\n fixed-address|10.0.0.5 {\n fixed-address|e {\n", 0);
 
-    row("declaration", "", "", addWords(&DhcpdConfigModel::addDeclaration, words("pool|a b||\"c")),
+    row("declaration", "", "", addWords(&DhcpdConfigModel::addDeclaration, split("pool|a b||\"c")),
         "pool|a b||\"c {\n");
-    row("declaration: top", "", "top", addWords(&DhcpdConfigModel::addDeclaration, words("pool")), "pool {\n");
-    row("declaration: subnet", "subnet a { }", "subnet", addWords(&DhcpdConfigModel::addDeclaration, words("pool|")),
+    row("declaration: top", "", "top", addWords(&DhcpdConfigModel::addDeclaration, split("pool")), "pool {\n");
+    row("declaration: subnet", "subnet a { }", "subnet", addWords(&DhcpdConfigModel::addDeclaration, split("pool|")),
         "subnet|a {\n pool| {\n");
     row("declaration: fixed address", "fixed-address a;", "fixed",
-        addWords(&DhcpdConfigModel::addDeclaration, words("b")), "fixed-address|a {\n b {\n");
-    row("parameter", "", "", addWords(&DhcpdConfigModel::addParameter, words("option|a b||\"c")), "option|a b||\"c\n");
+        addWords(&DhcpdConfigModel::addDeclaration, split("b")), "fixed-address|a {\n b {\n");
+    row("parameter", "", "", addWords(&DhcpdConfigModel::addParameter, split("option|a b||\"c")), "option|a b||\"c\n");
     row("parameter: before declarations", "a { } b c;", "",
-        addWords(&DhcpdConfigModel::addParameter, words("authoritative")), "b|c\nauthoritative\na| {\n");
-    row("parameter: named as a declaration", "", "", addWords(&DhcpdConfigModel::addParameter, words("range|a|b")),
+        addWords(&DhcpdConfigModel::addParameter, split("authoritative")), "b|c\nauthoritative\na| {\n");
+    row("parameter: named as a declaration", "", "", addWords(&DhcpdConfigModel::addParameter, split("range|a|b")),
         "range|a|b\n");
 
     row("bind9", "", "",
         addWords(&DhcpdConfigModel::addBind9,
-                 words(R"(key|"k"|algorithm|hmac-md5|secret|"YQ=="|zone|a.|primary|127.0.0.1|key|"k")")),
+                 split(R"(key|"k"|algorithm|hmac-md5|secret|"YQ=="|zone|a.|primary|127.0.0.1|key|"k")")),
         "key|\"k\" {\n algorithm|hmac-md5\n secret|\"YQ==\"\nzone|a. {\n primary|127.0.0.1\n key|\"k\"\n");
     row("bind9: group", "group { }", "group",
-        addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary|127.0.0.1|key|k")),
+        addWords(&DhcpdConfigModel::addBind9, split("zone|a.|primary|127.0.0.1|key|k")),
         "group| {\n zone|a. {\n  primary|127.0.0.1\n  key|k\n");
     row("bind9: group of four words shifts the next", "", "",
-        addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|key|k")),
+        addWords(&DhcpdConfigModel::addBind9, split("zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|key|k")),
         "zone|a. {\n primary|127.0.0.1\n zone|b.\nprimary|127.0.0.1 {\n key|k\n");
-    row("bind9: cut short", "", "top", addWords(&DhcpdConfigModel::addBind9, words("zone|a.|primary")),
+    row("bind9: cut short", "", "top", addWords(&DhcpdConfigModel::addBind9, split("zone|a.|primary")),
         "zone|a. {\n primary|\n");
-    row("bind9: words with blanks", "", "", addWords(&DhcpdConfigModel::addBind9, words("zone|a b  c|x y|")),
+    row("bind9: words with blanks", "", "", addWords(&DhcpdConfigModel::addBind9, split("zone|a b  c|x y|")),
         "zone|a|b||c {\n x|y|\n");
 }
 
-void TestDeclarationEdits::adds()
+void DeclarationEditsTest::adds()
 {
     QFETCH(EditCase, edit);
     verifyEdit(edit);
 }
 
-void TestDeclarationEdits::refuses_data()
+void DeclarationEditsTest::refuses_data()
 {
     QTest::addColumn<Refusal>("refusal");
 
     const auto row = [](const char *before, const char *target, const Edit &edit, const char *error) {
         QTest::addRow("%s: %s: %s", error, before, target) << Refusal{text(before), text(target), edit, text(error)};
     };
-    // What is no place for `operation`, and the message that names it.
+    // Every parent that `operation` refuses, and the message that names it.
     const auto holderRows = [&row](const std::vector<std::pair<const char *, const char *>> &holders, const Edit &edit,
                                    const char *error) {
         for (const auto &[holder, keyword] : holders)
@@ -235,7 +213,7 @@ void TestDeclarationEdits::refuses_data()
          }) {
         const QString error{QStringLiteral("Error adding subnet. Invalid subnet '%1'").arg(text(shown))};
         row("", "", addSubnet(address, mask), qPrintable(error));
-        row("host a { }", "host", addSubnet(address, mask), qPrintable(error)); // before what is wrong with the parent
+        row("host a { }", "host", addSubnet(address, mask), qPrintable(error)); // checked before the parent
     }
     holderRows({{"host a { }", "host"},
                 {"subnet a { }", "subnet"},
@@ -286,13 +264,13 @@ void TestDeclarationEdits::refuses_data()
 
     for (const auto &[before, target] : {std::pair{"range a b;", "range"}, std::pair{"SubClass a b { }", "SubClass"},
                                          std::pair{"option a b;", "option"}}) {
-        row(before, target, addWords(&DhcpdConfigModel::addDeclaration, words("a"), false),
+        row(before, target, addWords(&DhcpdConfigModel::addDeclaration, split("a"), false),
             qPrintable(QStringLiteral("Error adding declaration. Can not add declaration to '%1'").arg(text(target))));
-        row(before, target, addWords(&DhcpdConfigModel::addParameter, words("a"), false),
+        row(before, target, addWords(&DhcpdConfigModel::addParameter, split("a"), false),
             qPrintable(QStringLiteral("Error adding parameter. Can not add parameter to '%1'").arg(text(target))));
     }
 
-    for (const QStringList &statements : {QStringList{}, words("zone|a")})
+    for (const QStringList &statements : {QStringList{}, split("zone|a")})
         holderRows({{"subnet a { }", "subnet"}, {"shared-network a { }", "shared-network"}, {"group;", "group"}},
                    addWords(&DhcpdConfigModel::addBind9, statements, false),
                    "Error adding bind9. Can not add bind9 to '%1'");
@@ -301,13 +279,13 @@ void TestDeclarationEdits::refuses_data()
             "Error adding bind9. bind9 can not be empty.");
 }
 
-void TestDeclarationEdits::refuses()
+void DeclarationEditsTest::refuses()
 {
     QFETCH(Refusal, refusal);
     verifyRefusal(refusal);
 }
 
-void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead_data()
+void DeclarationEditsTest::addsNoBlocksThatCouldNotBeRead_data()
 {
     QTest::addColumn<QString>("holder");
     QTest::addColumn<EditCase::Edit>("edit");
@@ -323,15 +301,15 @@ void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead_data()
     row(
         "group",
         [](DhcpdConfigModel &model, const QModelIndex &parent) {
-            model.addBind9(words("zone|a.|primary|127.0.0.1|key|k"), parent);
+            model.addBind9(split("zone|a.|primary|127.0.0.1|key|k"), parent);
         },
         "Error adding bind9. Can not add bind9 to 'group'");
     row(
-        "pool", [](DhcpdConfigModel &model, const QModelIndex &parent) { model.addDeclaration(words("a|b"), parent); },
+        "pool", [](DhcpdConfigModel &model, const QModelIndex &parent) { model.addDeclaration(split("a|b"), parent); },
         "Error adding declaration. Can not add declaration to 'pool'");
 }
 
-void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead()
+void DeclarationEditsTest::addsNoBlocksThatCouldNotBeRead()
 {
     QFETCH(QString, holder);
     QFETCH(EditCase::Edit, edit);
@@ -342,24 +320,24 @@ void TestDeclarationEdits::addsNoBlocksThatCouldNotBeRead()
     deep.verifyChange(1);
     verifyIsReadAgain(deep);
 
-    const auto deepest = nestedBlocks(maximumBlockDepth, qPrintable(holder));
+    const QString deepest{nestedBlocks(maximumBlockDepth, qPrintable(holder))};
     EditedModel refused{deepest};
     edit(refused.model(), innermost(refused.model()));
     refused.verifyRefusal(error);
     QCOMPARE(refused.outline(), EditedModel{deepest}.outline());
 }
 
-void TestDeclarationEdits::addsLinesToTheDeepestBlock_data()
+void DeclarationEditsTest::addsLinesToTheDeepestBlock_data()
 {
     QTest::addColumn<QString>("holder");
     QTest::addColumn<EditCase::Edit>("edit");
 
     QTest::addRow("range") << text("subnet 10.0.0.0 netmask 255.0.0.0") << addRange("10.0.0.1", "10.0.0.2");
     QTest::addRow("fixed address") << text("host a") << addFixedAddress("10.0.0.1");
-    QTest::addRow("parameter") << text("pool") << addWords(&DhcpdConfigModel::addParameter, words("a|b"));
+    QTest::addRow("parameter") << text("pool") << addWords(&DhcpdConfigModel::addParameter, split("a|b"));
 }
 
-void TestDeclarationEdits::addsLinesToTheDeepestBlock()
+void DeclarationEditsTest::addsLinesToTheDeepestBlock()
 {
     QFETCH(QString, holder);
     QFETCH(EditCase::Edit, edit);
@@ -369,7 +347,7 @@ void TestDeclarationEdits::addsLinesToTheDeepestBlock()
     verifyIsReadAgain(edited);
 }
 
-void TestDeclarationEdits::computesDefaultRange_data()
+void DeclarationEditsTest::computesDefaultRange_data()
 {
     QTest::addColumn<QString>("subnet");
     QTest::addColumn<QString>("expected");
@@ -395,17 +373,17 @@ void TestDeclarationEdits::computesDefaultRange_data()
         QTest::addRow("%s", subnet) << text(subnet) << text(expected);
 }
 
-void TestDeclarationEdits::computesDefaultRange()
+void DeclarationEditsTest::computesDefaultRange()
 {
     QFETCH(QString, subnet);
     QFETCH(QString, expected);
     QCOMPARE(DhcpdConfigModel::defaultRange(subnet).join(QLatin1Char{'|'}), expected);
 }
 
-void TestDeclarationEdits::removesStatement()
+void DeclarationEditsTest::removesStatement()
 {
     const auto remove = [](DhcpdConfigModel &model, const QModelIndex &index) { model.removeStatement(index); };
-    const auto before = text("a b; c { d e; f { } } g { }");
+    const QString before{text("a b; c { d e; f { } } g { }")};
     verifyEdit({before, text("a"), remove, text("c| {\n d|e\n f| {\ng| {\n")});
     verifyEdit({before, text("c"), remove, text("a|b\ng| {\n")});
     verifyEdit({before, text("d"), remove, text("a|b\nc| {\n f| {\ng| {\n")});
@@ -413,7 +391,7 @@ void TestDeclarationEdits::removesStatement()
     verifyEdit({before, QString{}, remove, QString{}});
 }
 
-void TestDeclarationEdits::removesNothingWithoutParent()
+void DeclarationEditsTest::removesNothingWithoutParent()
 {
     EditedModel edited{text("a b;")};
     edited.model().removeStatement({});
@@ -421,14 +399,14 @@ void TestDeclarationEdits::removesNothingWithoutParent()
     QVERIFY(!edited.model().isModified());
 }
 
-void TestDeclarationEdits::replacesWords_data()
+void DeclarationEditsTest::replacesWords_data()
 {
     QTest::addColumn<EditCase>("edit");
 
     const auto row = [](const char *name, const char *before, const char *target, const char *newWords,
                         const char *after) {
         const auto replace = [=](DhcpdConfigModel &model, const QModelIndex &index) {
-            QVERIFY(model.replaceWords(index, words(newWords)));
+            QVERIFY(model.replaceWords(index, split(newWords)));
         };
         QTest::addRow("%s", name) << EditCase{text(before), text(target), replace, text(after), 0};
     };
@@ -441,44 +419,44 @@ void TestDeclarationEdits::replacesWords_data()
     row("letter case", "a b;", "a", "A|b", "A|b\n");
 }
 
-void TestDeclarationEdits::replacesWords()
+void DeclarationEditsTest::replacesWords()
 {
     QFETCH(EditCase, edit);
     verifyEdit(edit);
 }
 
-void TestDeclarationEdits::doesNotReplaceWordsOfRoots()
+void DeclarationEditsTest::doesNotReplaceWordsOfRoots()
 {
     EditedModel edited{text("a b;")};
-    QVERIFY(!edited.model().replaceWords(edited.find(text("top")), words("x|y")));
-    QVERIFY(!edited.model().replaceWords(edited.find({}), words("x|y")));
+    QVERIFY(!edited.model().replaceWords(edited.find(text("top")), split("x|y")));
+    QVERIFY(!edited.model().replaceWords(edited.find({}), split("x|y")));
     QCOMPARE(edited.model().data(edited.find({})).toString(), text("All network"));
     QCOMPARE(edited.model().headerData(0, Qt::Horizontal).toString(), text("Topology"));
     QVERIFY(!edited.model().isModified());
 }
 
-void TestDeclarationEdits::doesNotModifyWhenWordsAreTheSame()
+void DeclarationEditsTest::doesNotModifyWhenWordsAreTheSame()
 {
     EditedModel edited{text("a b; authoritative;")};
     QSignalSpy changes{&edited.model(), &QAbstractItemModel::dataChanged};
-    QVERIFY(edited.model().replaceWords(edited.find(text("a b")), words("a|b")));
-    QVERIFY(edited.model().replaceWords(edited.find(text("auth")), words("authoritative|")));
+    QVERIFY(edited.model().replaceWords(edited.find(text("a b")), split("a|b")));
+    QVERIFY(edited.model().replaceWords(edited.find(text("auth")), split("authoritative|")));
     QCOMPARE(changes.size(), 0);
     QVERIFY(!edited.model().isModified());
 }
 
-void TestDeclarationEdits::namesKeys()
+void DeclarationEditsTest::namesKeys()
 {
     EditedModel edited{
         text("key \"a\" { } zone z { key x; } group g { KEY b. { } shared-network n { key { } } key c { } }"
              "key d { } key y;")};
     const auto namesAt = [&](const char *target) { return edited.model().keyNames(edited.find(text(target))); };
-    QCOMPARE(namesAt("top"), words("a|b.||c|d"));
-    QCOMPARE(namesAt(""), words("a|b.||c|d"));
-    QCOMPARE(namesAt("group"), words("a|b.||c"));
-    QCOMPARE(namesAt("zone"), words("a"));
+    QCOMPARE(namesAt("top"), split("a|b.||c|d"));
+    QCOMPARE(namesAt(""), split("a|b.||c|d"));
+    QCOMPARE(namesAt("group"), split("a|b.||c"));
+    QCOMPARE(namesAt("zone"), split("a"));
     QCOMPARE(EditedModel{text("a { }")}.model().keyNames(), QStringList{});
 }
 
-QTEST_GUILESS_MAIN(TestDeclarationEdits)
+QTEST_GUILESS_MAIN(DeclarationEditsTest)
 #include "tst_declarationedits.moc"

@@ -19,7 +19,7 @@ QString joinedByBars(const DhcpdConfigStatement &statement) { return nodeOf(stat
 
 } // namespace
 
-class DhcpdConfigChecksTest : public QObject
+class DhcpdConfigChecksTest final : public QObject
 {
     Q_OBJECT
 
@@ -52,7 +52,7 @@ void DhcpdConfigChecksTest::addRows(const std::vector<Row> &rows)
             << QString::fromUtf8(row.error);
 }
 
-// Sets the value of the row being tested, and compares what became of the statement and what was told.
+// Sets the value of the current row of the table, and compares the statement and the error that come of it.
 void DhcpdConfigChecksTest::change(DhcpdConfigModel &model, const QModelIndex &statement)
 {
     QFETCH(QString, value);
@@ -195,7 +195,7 @@ void DhcpdConfigChecksTest::changesDeclaration()
 
 void DhcpdConfigChecksTest::changesRange_data()
 {
-    const char *const range{"range 1 2 x"};
+    const char *range{"range 1 2 x"};
     addRows({
         {range, "10.0.0.20 10.0.0.50", "range|10.0.0.20|10.0.0.50", nullptr},
         {range, "10.0.0.20 10.0.0.20", "range|10.0.0.20|10.0.0.20", nullptr},
@@ -219,7 +219,7 @@ void DhcpdConfigChecksTest::changesRange_data()
 void DhcpdConfigChecksTest::changesRange()
 {
     QFETCH(QString, statement);
-    for (const char *const place :
+    for (const char *place :
          {"subnet 10.0.0.0 netmask 255.255.255.0 { %1; }", "SUBNET 10.0.0.0 netmask 255.255.255.0 { pool { %1; } }"}) {
         DhcpdConfigModel model{{QStringLiteral("a"), QStringLiteral("b")}};
         QVERIFY(model.parse(QString::fromLatin1(place).arg(statement)));
@@ -234,7 +234,7 @@ void DhcpdConfigChecksTest::changesRange()
 
 void DhcpdConfigChecksTest::rangeNeedsItsSubnet_data()
 {
-    const char *const value{"10.0.0.20 10.0.0.50"};
+    const char *value{"10.0.0.20 10.0.0.50"};
     addRows({
         {"shared-network a { %1 }", value, nullptr, "Error editing range. Can not edit range in 'All network'"},
         {"%1", value, nullptr, "Error editing range. Can not edit range in 'Topology'"},
@@ -251,7 +251,7 @@ void DhcpdConfigChecksTest::rangeNeedsItsSubnet_data()
          "Error editing range. Invalid start IP '127.0.0.1'"},
         {"subnet 255.255.255.0 netmask 255.255.255.0 { %1 }", "255.255.255.1 255.255.255.255", nullptr,
          "Error editing range. Invalid end IP '255.255.255.255'"},
-        // The nearest subnet decides, and the keyword of the range's own parent does not matter otherwise.
+        // The nearest subnet decides; otherwise the keyword of the range's own parent does not matter.
         {"subnet 10.0.0.0 netmask 255.0.0.0 { host a { %1 } }", value, "range|10.0.0.20|10.0.0.50", nullptr},
         {"subnet 10.9.0.0 netmask 255.255.0.0 { subnet 10.0.0.0 netmask 255.255.0.0 { %1 } }", value,
          "range|10.0.0.20|10.0.0.50", nullptr},

@@ -1,11 +1,10 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "tests/config/confignode.h"
+#include "tests/support/text.h"
 
 #include <QTest>
 
 namespace {
-
-QStringList split(const char *words) { return QString::fromUtf8(words).split(QLatin1Char{'|'}); }
 
 using Kind = bool (DhcpdConfigStatement::*)() const;
 
@@ -45,7 +44,7 @@ constexpr KindRow kindRows[]{
 
 } // namespace
 
-class DhcpdConfigStatementTest : public QObject
+class DhcpdConfigStatementTest final : public QObject
 {
     Q_OBJECT
 
@@ -351,10 +350,12 @@ void DhcpdConfigStatementTest::childrenAreParametersFirst()
     DhcpdConfigDeclaration parent{split("group|"), nullptr};
     QCOMPARE(parent.childCount(), 0);
     QCOMPARE(parent.child(0), nullptr);
-    auto *const host = parent.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(split("host|a"), &parent));
-    auto *const first = parent.addParam(std::make_unique<DhcpdConfigParam>(split("p|1"), &parent));
-    auto *const zone = parent.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(split("zone|b"), &parent));
-    auto *const second = parent.addParam(std::make_unique<DhcpdConfigParam>(split("p|2"), &parent));
+    DhcpdConfigDeclaration *host{
+        parent.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(split("host|a"), &parent))};
+    DhcpdConfigParam *first{parent.addParam(std::make_unique<DhcpdConfigParam>(split("p|1"), &parent))};
+    DhcpdConfigDeclaration *zone{
+        parent.addDeclaration(std::make_unique<DhcpdConfigDeclaration>(split("zone|b"), &parent))};
+    DhcpdConfigParam *second{parent.addParam(std::make_unique<DhcpdConfigParam>(split("p|2"), &parent))};
     const std::vector<DhcpdConfigStatement *> rows{first, second, host, zone};
     QCOMPARE(parent.childCount(), 4);
     for (int row{}; row < 4; ++row) {
@@ -385,8 +386,8 @@ void DhcpdConfigStatementTest::removesChild()
     const ConfigNode node{split("group|"), {{split("p|1")}, {split("p|2")}}, {{split("d|1")}, {split("d|2")}}};
     DhcpdConfigDeclaration parent{node.words, nullptr};
     addChildren(parent, node);
-    DhcpdConfigStatement *const lastParam{parent.child(1)};
-    DhcpdConfigStatement *const lastDeclaration{parent.child(3)};
+    DhcpdConfigStatement *lastParam{parent.child(1)};
+    DhcpdConfigStatement *lastDeclaration{parent.child(3)};
     parent.removeChild(parent.child(0));
     QCOMPARE(lastParam->row(), 0);
     QCOMPARE(lastDeclaration->row(), 2);
@@ -399,7 +400,7 @@ void DhcpdConfigStatementTest::removesChild()
 
 void DhcpdConfigStatementTest::removesStrangerToo()
 {
-    // That it is destroyed is for the leak checker to see.
+    // The leak checker sees whether it is destroyed.
     DhcpdConfigDeclaration parent{split("group|"), nullptr};
     parent.addParam(std::make_unique<DhcpdConfigParam>(split("p|1"), &parent));
     parent.removeChild(std::make_unique<DhcpdConfigParam>(split("p|1"), &parent).release());

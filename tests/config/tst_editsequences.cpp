@@ -98,7 +98,7 @@ const std::function<void(DhcpdConfigModel &, const QModelIndex &, Random &)> edi
     },
 };
 
-// The tree as far as a file can hold it: words are what stands between blanks.
+// The tree as far as a file can hold it, where words are what blanks separate.
 void appendWritable(QString &text, const DhcpdConfigStatement &statement, int depth)
 {
     text += QString{depth, QLatin1Char{' '}} + statement.joinedWords().simplified();
@@ -124,7 +124,7 @@ void verifyRoundTrip(const DhcpdConfigModel &model)
 
 } // namespace
 
-class TestEditSequences final : public QObject
+class EditSequencesTest final : public QObject
 {
     Q_OBJECT
 
@@ -132,7 +132,7 @@ private slots:
     void keepsTheTreeWhole();
 };
 
-void TestEditSequences::keepsTheTreeWhole()
+void EditSequencesTest::keepsTheTreeWhole()
 {
     Random random{20240607};
     std::vector<int> changesOfEdit(std::size(edits));
@@ -148,8 +148,8 @@ void TestEditSequences::keepsTheTreeWhole()
         connect(&model, &DhcpdConfigModel::error, this, [&errors] { ++errors; });
 
         for (int i{}; i < editsOfSequence; ++i) {
-            const auto indexes = indexesUnder(model, {});
-            const auto edit = random.bounded(static_cast<quint32>(std::size(edits)));
+            const QVector<QModelIndex> indexes{indexesUnder(model, {})};
+            const quint32 edit{random.bounded(static_cast<quint32>(std::size(edits)))};
             const QString before{edited.outline()};
             const bool wasModified{model.isModified()};
             changes = resets = errors = 0;
@@ -171,7 +171,7 @@ void TestEditSequences::keepsTheTreeWhole()
             }
         }
     }
-    // What never came about proves nothing. Replacing words and removing have nothing to refuse.
+    // An edit that was never made, or never refused, proves nothing. Replacing words and removing are never refused.
     for (std::size_t edit{}; edit < std::size(edits); ++edit) {
         const bool canRefuse{edit < 15 || edit == 16};
         QVERIFY2(changesOfEdit[edit] > 20 && (refusalsOfEdit[edit] > 100 || !canRefuse),
@@ -179,5 +179,5 @@ void TestEditSequences::keepsTheTreeWhole()
     }
 }
 
-QTEST_GUILESS_MAIN(TestEditSequences)
+QTEST_GUILESS_MAIN(EditSequencesTest)
 #include "tst_editsequences.moc"

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "tests/config/editedmodel.h"
+#include "tests/support/text.h"
 
 #include <QTest>
 
 namespace {
 
 using Edit = EditCase::Edit;
-using ValueOperation = void (DhcpdConfigModel::*)(const QString &value, const QModelIndex &parent);
-
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
 
 Edit addLeaseTime(const char *keyword, const char *seconds, bool isAdded = true)
 {
@@ -29,11 +27,6 @@ Edit addMaxLeaseTime(const char *seconds, bool isAdded = true)
     return [=](DhcpdConfigModel &model, const QModelIndex &parent) {
         QCOMPARE(model.addMaxLeaseTime(text(seconds), parent), isAdded);
     };
-}
-
-Edit addValue(ValueOperation add, const char *value)
-{
-    return [=](DhcpdConfigModel &model, const QModelIndex &parent) { (model.*add)(text(value), parent); };
 }
 
 Edit addStaticRoutes(const QStringList &routes, bool ms)
@@ -70,13 +63,13 @@ const RouteOption routeOptions[]{
     {true, "ms-classless-static-routes", "classless-static-routes", "code 249 = array of unsigned integer 8"},
 };
 
-// What a declaration can be: a value fits any.
+// Every kind of declaration: a value fits into any.
 constexpr const char *holders[]{"", "top", "subnet", "host", "range", "group", "shared-network"};
 constexpr auto everyHolder = "subnet { } host { } range; group { } shared-network { }";
 
 } // namespace
 
-class TestParameterEdits final : public QObject
+class ParameterEditsTest final : public QObject
 {
     Q_OBJECT
 
@@ -89,7 +82,7 @@ private slots:
     void refuses();
 };
 
-void TestParameterEdits::changes_data()
+void ParameterEditsTest::changes_data()
 {
     QTest::addColumn<EditCase>("edit");
 
@@ -181,13 +174,13 @@ void TestParameterEdits::changes_data()
     }
 }
 
-void TestParameterEdits::changes()
+void ParameterEditsTest::changes()
 {
     QFETCH(EditCase, edit);
     verifyEdit(edit);
 }
 
-void TestParameterEdits::addsToEveryDeclaration_data()
+void ParameterEditsTest::addsToEveryDeclaration_data()
 {
     QTest::addColumn<QString>("target");
     QTest::addColumn<EditCase::Edit>("edit");
@@ -206,7 +199,7 @@ void TestParameterEdits::addsToEveryDeclaration_data()
     }
 }
 
-void TestParameterEdits::addsToEveryDeclaration()
+void ParameterEditsTest::addsToEveryDeclaration()
 {
     QFETCH(QString, target);
     QFETCH(EditCase::Edit, edit);
@@ -219,17 +212,17 @@ void TestParameterEdits::addsToEveryDeclaration()
     verifyLinks(edited.model());
 }
 
-void TestParameterEdits::refuses_data()
+void ParameterEditsTest::refuses_data()
 {
     QTest::addColumn<Refusal>("refusal");
 
     const auto row = [](const QString &name, const char *target, const Edit &edit, const QString &error) {
-        const auto before =
-            text("a b; default-lease-time 5; option routers 10.0.0.1; option domain-name \"a.org\"; c { }");
+        const QString before{
+            text("a b; default-lease-time 5; option routers 10.0.0.1; option domain-name \"a.org\"; c { }")};
         QTest::addRow("%s", qPrintable(name)) << Refusal{before, text(target), edit, error};
     };
 
-    // The kind of the parent comes before the value.
+    // The kind of the parent is checked before the value.
     for (const char *seconds : {"5", "0"})
         row(text("lease time in a parameter: ") + text(seconds), "a", addDefaultLeaseTime(seconds, false),
             text("Error adding lease time. Can not add to 'a'"));
@@ -265,11 +258,11 @@ void TestParameterEdits::refuses_data()
     }
 }
 
-void TestParameterEdits::refuses()
+void ParameterEditsTest::refuses()
 {
     QFETCH(Refusal, refusal);
     verifyRefusal(refusal);
 }
 
-QTEST_GUILESS_MAIN(TestParameterEdits)
+QTEST_GUILESS_MAIN(ParameterEditsTest)
 #include "tst_parameteredits.moc"

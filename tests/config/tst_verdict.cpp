@@ -4,6 +4,7 @@
 #include "tests/config/editedmodel.h"
 #include "tests/support/realdhcpd.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QTemporaryDir>
 #include <QTest>
@@ -12,8 +13,6 @@ namespace {
 
 using Edit = EditCase::Edit;
 using Model = DhcpdConfigModel;
-
-QString text(const char *utf8) { return QString::fromUtf8(utf8); }
 
 constexpr auto base = R"(authoritative;
 default-lease-time 600;
@@ -93,34 +92,11 @@ Edit setText(const char *value)
         [=](Model &model, const QModelIndex &index) { QVERIFY(model.setData(index.siblingAtColumn(1), text(value))); };
 }
 
-Edit addHost(const char *name, const char *mac, const char *address)
-{
-    return
-        [=](Model &model, const QModelIndex &parent) { model.addHost(text(name), text(mac), text(address), parent); };
-}
-
 Edit addRoutes(bool ms)
 {
     return [=](Model &model, const QModelIndex &parent) {
         model.addStaticRoutes({text("24"), text("192,168,1,0"), text("10,0,0,1")}, ms, parent);
     };
-}
-
-Edit addRange(const char *start, const char *end)
-{
-    return [=](Model &model, const QModelIndex &parent) { model.addRange(text(start), text(end), parent); };
-}
-
-Edit addSubnet(const char *address, const char *mask)
-{
-    return [=](Model &model, const QModelIndex &parent) { model.addSubnet(text(address), text(mask), parent); };
-}
-
-using ValueOperation = void (Model::*)(const QString &value, const QModelIndex &parent);
-
-Edit addValue(ValueOperation add, const char *value)
-{
-    return [=](Model &model, const QModelIndex &parent) { (model.*add)(text(value), parent); };
 }
 
 using TimeOperation = bool (Model::*)(const QString &seconds, const QModelIndex &parent);
@@ -132,22 +108,22 @@ Edit addTime(TimeOperation add, const char *seconds)
 
 } // namespace
 
-class TestVerdict final : public QObject
+class VerdictTest final : public QObject
 {
     Q_OBJECT
 
 private slots:
     void initTestCase();
     void addsFromBind9();
-    void judges_data();
-    void judges();
-    void judgesKeyNames();
+    void verdictOnEdit_data();
+    void verdictOnEdit();
+    void verdictOnKeyNames();
 
 private:
     QString m_dhcpd;
 };
 
-void TestVerdict::initTestCase()
+void VerdictTest::initTestCase()
 {
     m_dhcpd = realDhcpd();
     if (m_dhcpd.isEmpty())
@@ -156,8 +132,8 @@ void TestVerdict::initTestCase()
     QCOMPARE(complaintOf(m_dhcpd, "authoritative;\nhost;\n"), text("line 2: expecting a name for host declaration."));
 }
 
-// What the rows below that add from bind9 have judged.
-void TestVerdict::addsFromBind9()
+// The file that the rows below add from bind9.
+void VerdictTest::addsFromBind9()
 {
     EditedModel edited{text("key known { }")};
     addBind9(bind9File)(edited.model(), edited.find({}));
@@ -183,7 +159,7 @@ key|"transfer" {
 )"));
 }
 
-void TestVerdict::judges_data()
+void VerdictTest::verdictOnEdit_data()
 {
     QTest::addColumn<QString>("target");
     QTest::addColumn<EditCase::Edit>("edit");
@@ -258,8 +234,8 @@ void TestVerdict::judges_data()
                       "zone type { allow-update { key \"file\"; }; }; zone zone { allow-update { key zone; }; };"));
     accepted("bind9 zone of a known key", "", addBind9(R"(zone "a.org" { allow-update { key "KNOWN"; }; };)"));
 
-    // What the model takes, deliberately, although the server does not. The names and addresses are as the user typed
-    // them; a saving user is told of the server's complaint.
+    // What the model deliberately accepts although the server does not: names and addresses stay as the user typed
+    // them. Whoever saves them is told of the server's complaint.
     row("shared network without a subnet", "", addValue(&Model::addSharedNetwork, "empty"),
         "empty shared-network decl");
     row("shared network with a space in its name", "", addValue(&Model::addSharedNetwork, "my office"),
@@ -280,7 +256,7 @@ void TestVerdict::judges_data()
         "expecting hostname.");
 }
 
-void TestVerdict::judges()
+void VerdictTest::verdictOnEdit()
 {
     QFETCH(QString, target);
     QFETCH(EditCase::Edit, edit);
@@ -293,8 +269,8 @@ void TestVerdict::judges()
     QCOMPARE(verdict.section(text(": "), 1), complaint);
 }
 
-// The server compares the names of keys as the model's preparation takes for granted.
-void TestVerdict::judgesKeyNames()
+// The model relies on the way in which the server compares the names of keys.
+void VerdictTest::verdictOnKeyNames()
 {
     const QByteArray configuration{"key %1 { algorithm hmac-sha256; secret \"Zm9v\"; }\n"
                                    "zone a.org. { primary 127.0.0.1; key %2; }\n"};
@@ -311,5 +287,5 @@ void TestVerdict::judgesKeyNames()
     QVERIFY(!isAccepted("k", "l"));
 }
 
-QTEST_GUILESS_MAIN(TestVerdict)
+QTEST_GUILESS_MAIN(VerdictTest)
 #include "tst_verdict.moc"

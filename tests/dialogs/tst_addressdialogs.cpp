@@ -3,9 +3,10 @@
 #include "dialogs/multipleipinputdialog.h"
 #include "dialogs/rangeinputdialog.h"
 #include "dialogs/subnetinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
 #include "tests/support/contexttranslator.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/modalboxes.h"
+#include "tests/support/text.h"
 
 #include <QApplication>
 #include <QGroupBox>
@@ -15,9 +16,7 @@
 
 namespace {
 
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
-
-/// Clicks an entry of the list as a user does.
+/// Clicks an entry of the list where a user would.
 void clickEntry(QListWidget *list, int row, Qt::KeyboardModifiers modifiers = {})
 {
     QTest::mouseClick(list->viewport(), Qt::LeftButton, modifiers, list->visualItemRect(list->item(row)).center());

@@ -11,8 +11,8 @@
 #include "dialogs/staticrouteinputdialog.h"
 #include "dialogs/subnetinputdialog.h"
 #include "dialogs/timeinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
 #include "tests/support/contexttranslator.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QtWidgets>
 
@@ -29,7 +29,7 @@ std::unique_ptr<QDialog> make()
     return std::make_unique<Dialog>();
 }
 
-/// Installs a translator, and a font, for as long as it lives.
+/// Installs a translator and a font while it lives.
 class Surroundings final
 {
 public:
@@ -471,7 +471,7 @@ void DialogFormsTest::screenReaderSaysEveryField()
     QSet<QString> said;
     for (const QString &field : qAsConst(fields)) {
         const auto *interface = QAccessible::queryAccessibleInterface(driver::find<QWidget>(*dialog, field));
-        const QString name = interface->text(QAccessible::Name);
+        const QString name{interface->text(QAccessible::Name)};
         QVERIFY2(std::any_of(name.begin(), name.end(), [](QChar sign) { return sign.isLetter(); }), qPrintable(field));
         said.insert(name);
     }

@@ -4,7 +4,7 @@
 #include "dialogs/ipinputdialog.h"
 #include "dialogs/macinputdialog.h"
 #include "dialogs/multipleipinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QApplication>
 #include <QFileDialog>

@@ -3,17 +3,12 @@
 #include "dialogs/hostinputdialog.h"
 #include "dialogs/macinputdialog.h"
 #include "dialogs/sharednetworkinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/modalboxes.h"
+#include "tests/support/text.h"
 
 #include <QApplication>
 #include <QLineEdit>
-
-namespace {
-
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
-
-} // namespace
 
 class NameDialogsTest final : public QObject
 {

@@ -14,8 +14,8 @@ class PatternsTest final : public QObject
 
 private slots:
     void everyPatternIsValid();
-    void judgesTexts_data();
-    void judgesTexts();
+    void validatesTexts_data();
+    void validatesTexts();
     void octetIsFoundAnywhere_data();
     void octetIsFoundAnywhere();
 };
@@ -29,7 +29,7 @@ void PatternsTest::everyPatternIsValid()
     }
 }
 
-void PatternsTest::judgesTexts_data()
+void PatternsTest::validatesTexts_data()
 {
     QTest::addColumn<Pattern>("pattern");
     QTest::addColumn<QString>("text");
@@ -164,7 +164,7 @@ void PatternsTest::judgesTexts_data()
             {label63 + s("x.org"), wrong}});
 }
 
-void PatternsTest::judgesTexts()
+void PatternsTest::validatesTexts()
 {
     QFETCH(Pattern, pattern);
     QFETCH(QString, text);

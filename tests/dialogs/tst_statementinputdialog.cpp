@@ -1,17 +1,12 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/statementinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/modalboxes.h"
+#include "tests/support/text.h"
 
 #include <QApplication>
 #include <QLabel>
 #include <QTextEdit>
-
-namespace {
-
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
-
-} // namespace
 
 class StatementInputDialogTest final : public QObject
 {
@@ -77,6 +72,8 @@ void StatementInputDialogTest::controlReturnSaves_data()
     QTest::addColumn<Qt::KeyboardModifiers>("modifiers");
     QTest::addRow("Return") << Qt::Key_Return << Qt::KeyboardModifiers{Qt::ControlModifier};
     QTest::addRow("Enter") << Qt::Key_Enter << (Qt::ControlModifier | Qt::KeypadModifier);
+    // QDialog itself takes the key for Save only when it is told that the key is the keypad's.
+    QTest::addRow("Enter of an unknown place") << Qt::Key_Enter << Qt::KeyboardModifiers{Qt::ControlModifier};
 }
 
 void StatementInputDialogTest::controlReturnSaves()

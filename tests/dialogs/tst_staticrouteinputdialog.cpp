@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/routemodel.h"
 #include "dialogs/staticrouteinputdialog.h"
-#include "tests/dialogs/dialogdriver.h"
 #include "tests/support/contexttranslator.h"
+#include "tests/support/dialogdriver.h"
 #include "tests/support/modalboxes.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QAccessible>
 #include <QApplication>
@@ -18,8 +19,6 @@
 #include <QTemporaryDir>
 
 namespace {
-
-QString text(const char *latin1) { return QString::fromLatin1(latin1); }
 
 const ModalBoxes::Box emptyCell{QMessageBox::Information, QStringLiteral("Information"),
                                 QStringLiteral("There is an empty cell.\nTo add, fill in the cell.")};

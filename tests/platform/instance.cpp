@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-// A program that starts as the product does and tells on its standard output what happens to it.
+// Starts like the program itself, and reports on standard output what happens to it.
 #include "platform/qtsingleapplication.h"
 
 #include <QEvent>
@@ -17,7 +17,7 @@ void tell(const QByteArray &line)
     std::fflush(stdout);
 }
 
-/// Tells when it comes to the front, once it is watched.
+/// A window that reports, from the moment it is watched, when it comes to the front.
 class MainWindow final : public QWidget
 {
 public:
@@ -38,8 +38,8 @@ private:
 
 } // namespace
 
-// Arguments: the milliseconds that a later instance waits for the receipt, and those that a first one is busy after it
-// has started.
+// Arguments: for how many milliseconds a later instance waits for the receipt, and for how many the first one is busy
+// after it has started.
 int main(int argc, char *argv[])
 {
     QtSingleApplication application{argc, argv};

@@ -50,7 +50,7 @@ void install(const QDir &root, const QString &file, const QString &content = {})
 
 Q_DECLARE_METATYPE(std::vector<Theme>)
 
-class TestIconTheme final : public QObject
+class IconThemeTest final : public QObject
 {
     Q_OBJECT
 
@@ -59,15 +59,15 @@ private slots:
     void theFirstGoodOneIsChosen();
 };
 
-void TestIconTheme::theFirstGoodOneIsChosen_data()
+void IconThemeTest::theFirstGoodOneIsChosen_data()
 {
     QTest::addColumn<std::vector<Theme>>("themes");
     QTest::addColumn<QString>("onLight");
     QTest::addColumn<QString>("onDark");
 
     const QString plain{listing(QStringLiteral("22/actions"))};
-    const auto a = QStringLiteral("a");
-    const auto b = QStringLiteral("b");
+    const QString a{QStringLiteral("a")};
+    const QString b{QStringLiteral("b")};
     const QString none;
     const auto row = [](const char *name, const std::vector<Theme> &themes, const QString &onLight,
                         const QString &onDark) { QTest::addRow("%s", name) << themes << onLight << onDark; };
@@ -117,7 +117,7 @@ void TestIconTheme::theFirstGoodOneIsChosen_data()
         {{a, plain, icons(1)}, {QStringLiteral("../second/a"), plain, icons(4)}, {b, plain, icons(3)}}, b, b);
 }
 
-void TestIconTheme::theFirstGoodOneIsChosen()
+void IconThemeTest::theFirstGoodOneIsChosen()
 {
     QFETCH(const std::vector<Theme>, themes);
     QFETCH(const QString, onLight);
@@ -129,7 +129,7 @@ void TestIconTheme::theFirstGoodOneIsChosen()
         if (!theme.index.isEmpty())
             install(first, theme.path + QStringLiteral("/index.theme"), theme.index);
         for (const QString &icon : theme.icons)
-            install(first, theme.path + QLatin1Char('/') + icon);
+            install(first, theme.path + QLatin1Char{'/'} + icon);
     }
     const QStringList searchPaths{folder.filePath(QStringLiteral("missing")), first.path(),
                                   folder.filePath(QStringLiteral("second"))};
@@ -137,5 +137,5 @@ void TestIconTheme::theFirstGoodOneIsChosen()
     QCOMPARE(suitableIconTheme(searchPaths, names, true), onDark);
 }
 
-QTEST_GUILESS_MAIN(TestIconTheme)
+QTEST_GUILESS_MAIN(IconThemeTest)
 #include "tst_icontheme.moc"

@@ -14,7 +14,7 @@
 
 #include <memory>
 
-class TestOrvHelpMenu final : public QObject
+class OrvHelpMenuTest final : public QObject
 {
     Q_OBJECT
 
@@ -37,7 +37,7 @@ private:
     OrvHelpMenu *m_menu{nullptr};
 };
 
-void TestOrvHelpMenu::init()
+void OrvHelpMenuTest::init()
 {
     m_window = std::make_unique<QMainWindow>();
     m_menu = new OrvHelpMenu{m_window.get()};
@@ -45,7 +45,7 @@ void TestOrvHelpMenu::init()
     m_window->show();
 }
 
-QAction *TestOrvHelpMenu::entry(const QString &text) const
+QAction *OrvHelpMenuTest::entry(const QString &text) const
 {
     for (QAction *action : m_menu->actions()) {
         if (action->text() == text)
@@ -54,7 +54,7 @@ QAction *TestOrvHelpMenu::entry(const QString &text) const
     qFatal("no entry %s", qPrintable(text));
 }
 
-void TestOrvHelpMenu::entries()
+void OrvHelpMenuTest::entries()
 {
     QCOMPARE(m_menu->title(), QStringLiteral("&Help"));
     QCOMPARE(m_menu->parentWidget(), m_window.get());
@@ -65,7 +65,7 @@ void TestOrvHelpMenu::entries()
                                  QStringLiteral("About Qt")}));
 }
 
-void TestOrvHelpMenu::aboutTellsNameVersionDescriptionAndLicence()
+void OrvHelpMenuTest::aboutTellsNameVersionDescriptionAndLicence()
 {
     ModalBoxes boxes;
     boxes.expectDialog<QMessageBox>([this](QMessageBox *box) {
@@ -80,7 +80,7 @@ void TestOrvHelpMenu::aboutTellsNameVersionDescriptionAndLicence()
     boxes.verify();
 }
 
-void TestOrvHelpMenu::aboutQtIsShown()
+void OrvHelpMenuTest::aboutQtIsShown()
 {
     ModalBoxes boxes;
     boxes.expectDialog<QMessageBox>([this](QMessageBox *box) {
@@ -92,14 +92,14 @@ void TestOrvHelpMenu::aboutQtIsShown()
     boxes.verify();
 }
 
-void TestOrvHelpMenu::manualIsThePage()
+void OrvHelpMenuTest::manualIsThePage()
 {
     entry(QStringLiteral("Manual"))->trigger();
     QCOMPARE(dialogs().size(), 1);
     QDialog *manual{dialogs().constFirst()};
     QVERIFY(manual->isVisible());
     QCOMPARE(manual->windowTitle(), QStringLiteral("Manual"));
-    const auto *browser{manual->findChild<QTextBrowser *>()};
+    const auto *browser = manual->findChild<QTextBrowser *>();
     QVERIFY(browser->isReadOnly());
     const QString text{browser->toPlainText().simplified()};
     for (const char *part :
@@ -107,14 +107,14 @@ void TestOrvHelpMenu::manualIsThePage()
           "FILES /etc/dhcp/dhcpd.conf The server's configuration, read and written.",
           "1 Another instance was running already", "SEE ALSO dhcpd (8), dhcpd.conf (5),"})
         QVERIFY2(text.contains(QLatin1String{part}), part);
-    QVERIFY2(!text.contains(QLatin1Char('\\')), "an escape was left");
+    QVERIFY2(!text.contains(QLatin1Char{'\\'}), "an escape was left");
     QVERIFY2(!text.contains(QLatin1String{" ."}), "a macro was left");
 
     QTest::mouseClick(manual->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close), Qt::LeftButton);
     QTRY_VERIFY(dialogs().isEmpty());
 }
 
-void TestOrvHelpMenu::manualIsOpenedOnce()
+void OrvHelpMenuTest::manualIsOpenedOnce()
 {
     entry(QStringLiteral("Manual"))->trigger();
     entry(QStringLiteral("Manual"))->trigger();
@@ -125,5 +125,5 @@ void TestOrvHelpMenu::manualIsOpenedOnce()
     QCOMPARE(dialogs().size(), 1);
 }
 
-QTEST_MAIN(TestOrvHelpMenu)
+QTEST_MAIN(OrvHelpMenuTest)
 #include "tst_orvhelpmenu.moc"

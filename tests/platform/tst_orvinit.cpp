@@ -35,7 +35,7 @@ constexpr std::array iconNames{
 
 const QString bundledIcons{QStringLiteral(":/icons")};
 
-// Whether anything can be seen of the icon.
+// Whether the icon shows anything at all.
 bool isVisible(const QIcon &icon, int size)
 {
     const QImage image{icon.pixmap(size).toImage().convertToFormat(QImage::Format_ARGB32)};
@@ -58,7 +58,7 @@ void writeFile(const QString &path, const QByteArray &content)
 
 } // namespace
 
-class TestOrvInit final : public QObject
+class OrvInitTest final : public QObject
 {
     Q_OBJECT
 
@@ -78,21 +78,21 @@ private:
     QString m_applicationName{QCoreApplication::applicationName()};
 };
 
-void TestOrvInit::init()
+void OrvInitTest::init()
 {
     QIcon::setThemeSearchPaths({bundledIcons});
     QIcon::setThemeName({});
 }
 
-void TestOrvInit::versionAndDescriptionAreKept()
+void OrvInitTest::versionAndDescriptionAreKept()
 {
     orvInit("2.1.6+ci1", "Configure DHCP server");
     QCOMPARE(QCoreApplication::applicationVersion(), QStringLiteral("2.1.6+ci1"));
     QCOMPARE(orvDescription(), QStringLiteral("Configure DHCP server"));
 }
 
-// The settings' place and the windows' titles follow from them.
-void TestOrvInit::noNameIsSet()
+// Where the settings are and what the windows are called follows from them.
+void OrvInitTest::noNameIsSet()
 {
     orvInit("1", "text");
     QCOMPARE(QCoreApplication::applicationName(), m_applicationName);
@@ -101,14 +101,14 @@ void TestOrvInit::noNameIsSet()
     QCOMPARE(QCoreApplication::organizationDomain(), QString{});
 }
 
-void TestOrvInit::noIconIsBlank_data()
+void OrvInitTest::noIconIsBlank_data()
 {
     QTest::addColumn<QStringList>("searchPaths");
     QTest::addColumn<QString>("theme");
     QTest::addColumn<QString>("icon");
     const QStringList system{QStandardPaths::locateAll(QStandardPaths::GenericDataLocation, QStringLiteral("icons"),
                                                        QStandardPaths::LocateDirectory)};
-    for (const char *const name : iconNames) {
+    for (const char *name : iconNames) {
         const QString icon{QLatin1String{name}};
         QTest::addRow("nothing installed, %s", name) << QStringList{bundledIcons} << QString{} << icon;
         QTest::addRow("nothing installed, hicolor named, %s", name)
@@ -119,7 +119,7 @@ void TestOrvInit::noIconIsBlank_data()
     }
 }
 
-void TestOrvInit::noIconIsBlank()
+void OrvInitTest::noIconIsBlank()
 {
     QFETCH(const QStringList, searchPaths);
     QFETCH(const QString, theme);
@@ -131,19 +131,19 @@ void TestOrvInit::noIconIsBlank()
         QVERIFY2(isVisible(QIcon::fromTheme(icon), size), qPrintable(QString::number(size)));
 }
 
-void TestOrvInit::installedThemeIsTaken()
+void OrvInitTest::installedThemeIsTaken()
 {
     QTemporaryDir folder;
     const QString theme{folder.filePath(QStringLiteral("complete"))};
     writeFile(theme + QStringLiteral("/index.theme"), "[Icon Theme]\nDirectories=22\n\n[22]\nSize=22\n");
-    for (const char *const name : iconNames)
+    for (const char *name : iconNames)
         writeFile(theme + QStringLiteral("/22/") + QLatin1String{name} + QStringLiteral(".svg"), {});
     QIcon::setThemeSearchPaths({folder.path(), bundledIcons});
     orvInit("1", "text");
     QCOMPARE(QIcon::themeName(), QStringLiteral("complete"));
 }
 
-void TestOrvInit::bundledIconsFillTheGapsOfATheme()
+void OrvInitTest::bundledIconsFillTheGapsOfATheme()
 {
     QTemporaryDir folder;
     const QString theme{folder.filePath(QStringLiteral("partial"))};
@@ -159,24 +159,24 @@ void TestOrvInit::bundledIconsFillTheGapsOfATheme()
     QVERIFY(isVisible(QIcon::fromTheme(QStringLiteral("computer")), 22));
 }
 
-// Qt reads one index for a theme, the first that it finds.
-void TestOrvInit::systemsIndexOfTheFallbackThemeDoesNotHideTheBundledIcons()
+// Qt reads one index for each theme, the first that it finds.
+void OrvInitTest::systemsIndexOfTheFallbackThemeDoesNotHideTheBundledIcons()
 {
     QTemporaryDir folder;
     writeFile(folder.filePath(QStringLiteral("hicolor/index.theme")),
               "[Icon Theme]\nHidden=true\nDirectories=48x48/apps\n\n[48x48/apps]\nSize=48\nType=Threshold\n");
     QIcon::setThemeSearchPaths({folder.path(), bundledIcons});
     orvInit("1", "text");
-    for (const char *const name : iconNames)
+    for (const char *name : iconNames)
         QVERIFY2(isVisible(QIcon::fromTheme(QLatin1String{name}), 22), name);
 }
 
-void TestOrvInit::themeOfTheDesktopIsKept()
+void OrvInitTest::themeOfTheDesktopIsKept()
 {
     QIcon::setThemeName(QStringLiteral("desktops"));
     orvInit("1", "text");
     QCOMPARE(QIcon::themeName(), QStringLiteral("desktops"));
 }
 
-QTEST_MAIN(TestOrvInit)
+QTEST_MAIN(OrvInitTest)
 #include "tst_orvinit.moc"

@@ -11,7 +11,7 @@
 
 using OrvAdmin::PackageManager;
 
-class TestPackageManager final : public QObject
+class PackageManagerTest final : public QObject
 {
     Q_OBJECT
 
@@ -32,20 +32,20 @@ private:
     QByteArray m_path{qgetenv("PATH")};
 };
 
-void TestPackageManager::init()
+void PackageManagerTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     QVERIFY(m_folder->isValid());
 }
 
-void TestPackageManager::cleanup()
+void PackageManagerTest::cleanup()
 {
     qputenv("PATH", m_path);
     qunsetenv("DPKG_ADMINDIR");
     m_folder.reset();
 }
 
-void TestPackageManager::write(const QString &name, const QByteArray &content, bool executable) const
+void PackageManagerTest::write(const QString &name, const QByteArray &content, bool executable) const
 {
     QFile file{m_folder->filePath(name)};
     QVERIFY(file.open(QIODevice::WriteOnly));
@@ -54,7 +54,7 @@ void TestPackageManager::write(const QString &name, const QByteArray &content, b
         QVERIFY(file.setPermissions(QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
 }
 
-void TestPackageManager::versionsOfInstalledPackages_data()
+void PackageManagerTest::versionsOfInstalledPackages_data()
 {
     QTest::addColumn<QString>("package");
     QTest::addColumn<QStringList>("versions");
@@ -76,7 +76,7 @@ void TestPackageManager::versionsOfInstalledPackages_data()
     QTest::addRow("line break") << QStringLiteral("bind9\n") << QStringList{};
 }
 
-void TestPackageManager::versionsOfInstalledPackages()
+void PackageManagerTest::versionsOfInstalledPackages()
 {
     if (QStandardPaths::findExecutable(QStringLiteral("dpkg-query")).isEmpty())
         QSKIP("no dpkg-query on this machine");
@@ -110,7 +110,7 @@ void TestPackageManager::versionsOfInstalledPackages()
     QCOMPARE(found, versions);
 }
 
-void TestPackageManager::packageIsPassedAsOneWord()
+void PackageManagerTest::packageIsPassedAsOneWord()
 {
     write(QStringLiteral("dpkg-query"),
           "#!/bin/sh\nfor word; do :; done\n[ \"$word\" = lib.x-y+1 ] && echo installed 4.2\n", true);
@@ -119,7 +119,7 @@ void TestPackageManager::packageIsPassedAsOneWord()
              QStringList{QStringLiteral("4.2")});
 }
 
-void TestPackageManager::noDatabaseIsEmpty_data()
+void PackageManagerTest::noDatabaseIsEmpty_data()
 {
     QTest::addColumn<QByteArray>("program");
     QTest::addRow("missing") << QByteArray{};
@@ -129,7 +129,7 @@ void TestPackageManager::noDatabaseIsEmpty_data()
     QTest::addRow("hanging") << QByteArrayLiteral("#!/bin/sh\necho installed 1.0\nexec /bin/sleep 3600\n");
 }
 
-void TestPackageManager::noDatabaseIsEmpty()
+void PackageManagerTest::noDatabaseIsEmpty()
 {
     QFETCH(const QByteArray, program);
     if (!program.isEmpty())
@@ -138,5 +138,5 @@ void TestPackageManager::noDatabaseIsEmpty()
     QCOMPARE(PackageManager::getInstalledPackagesVersions(QStringLiteral("bind9")), QStringList{});
 }
 
-QTEST_GUILESS_MAIN(TestPackageManager)
+QTEST_GUILESS_MAIN(PackageManagerTest)
 #include "tst_packagemanager.moc"

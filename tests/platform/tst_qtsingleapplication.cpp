@@ -73,7 +73,7 @@ QByteArray framed(const QByteArray &text) { return framed(text, static_cast<quin
 
 } // namespace
 
-class TestQtSingleApplication final : public QObject
+class QtSingleApplicationTest final : public QObject
 {
     Q_OBJECT
 
@@ -106,22 +106,22 @@ private:
     std::unique_ptr<QTemporaryDir> m_folder;
 };
 
-// Waits for a whole line.
+// Returns the next line, once all of it is there.
 #define EXPECT_LINE(PROCESS, LINE)                                                                                     \
     do {                                                                                                               \
         QTRY_VERIFY_WITH_TIMEOUT((PROCESS)->canReadLine() || (PROCESS)->state() == QProcess::NotRunning, 30000);       \
         QCOMPARE((PROCESS)->readLine().trimmed(), QByteArray{LINE});                                                   \
     } while (false)
 
-void TestQtSingleApplication::init()
+void QtSingleApplicationTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     QVERIFY(m_folder->isValid());
 }
 
-void TestQtSingleApplication::cleanup() { m_folder.reset(); }
+void QtSingleApplicationTest::cleanup() { m_folder.reset(); }
 
-Instance TestQtSingleApplication::start(int timeout, int busy) const
+Instance QtSingleApplicationTest::start(int timeout, int busy) const
 {
     Instance process{new QProcess};
     QProcessEnvironment environment{QProcessEnvironment::systemEnvironment()};
@@ -132,62 +132,62 @@ Instance TestQtSingleApplication::start(int timeout, int busy) const
     return process;
 }
 
-Instance TestQtSingleApplication::startFirst(int busy) const
+Instance QtSingleApplicationTest::startFirst(int busy) const
 {
-    auto process{start(0, busy)};
+    auto process = start(0, busy);
     [&process] { EXPECT_LINE(process, "first"); }();
     return process;
 }
 
-QStringList TestQtSingleApplication::outputAtEnd(QProcess &process)
+QStringList QtSingleApplicationTest::outputAtEnd(QProcess &process)
 {
     process.waitForFinished();
-    return QString::fromUtf8(process.readAll()).split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+    return QString::fromUtf8(process.readAll()).split(QLatin1Char{'\n'}, Qt::SkipEmptyParts);
 }
 
-void TestQtSingleApplication::laterInstanceRaisesTheFirstAndEnds()
+void QtSingleApplicationTest::laterInstanceRaisesTheFirstAndEnds()
 {
-    const auto first{startFirst()};
-    const auto later{start()};
+    const auto first = startFirst();
+    const auto later = start();
     QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("sent"), QStringLiteral("windows: 0")}));
     QCOMPARE(later->exitCode(), 1);
     EXPECT_LINE(first, "message: raise");
     EXPECT_LINE(first, "in front");
 }
 
-void TestQtSingleApplication::lockAndSocketOfAKilledInstanceDoNotBlock()
+void QtSingleApplicationTest::lockAndSocketOfAKilledInstanceDoNotBlock()
 {
-    const auto killed{startFirst()};
+    const auto killed = startFirst();
     killed->kill();
     QVERIFY(killed->waitForFinished());
     QVERIFY(QFile::exists(path(".lock")));
     QVERIFY(QFile::exists(path(".socket")));
 
-    const auto first{startFirst()};
-    const auto later{start()};
+    const auto first = startFirst();
+    const auto later = start();
     QCOMPARE(outputAtEnd(*later).value(0), QStringLiteral("sent"));
     EXPECT_LINE(first, "message: raise");
 }
 
-// Such as a lock file with the number of a living process, or one of another machine.
-void TestQtSingleApplication::leftOverFilesOfAnyContentDoNotBlock()
+// For example a lock file with the process id of something else that runs, or of a process on another machine.
+void QtSingleApplicationTest::leftOverFilesOfAnyContentDoNotBlock()
 {
     for (const char *suffix : {".lock", ".socket"}) {
         QFile file{path(suffix)};
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write(QByteArray::number(getpid()) + "\ninit\nanother-host\n");
     }
-    const auto first{startFirst()};
-    const auto later{start()};
+    const auto first = startFirst();
+    const auto later = start();
     QCOMPARE(outputAtEnd(*later).value(0), QStringLiteral("sent"));
     EXPECT_LINE(first, "message: raise");
 }
 
-void TestQtSingleApplication::oneOfTwoStartedTogetherWins()
+void QtSingleApplicationTest::oneOfTwoStartedTogetherWins()
 {
     for (int round{0}; round < 5; ++round) {
-        const auto one{start()};
-        const auto two{start()};
+        const auto one = start();
+        const auto two = start();
         QTRY_VERIFY_WITH_TIMEOUT(one->canReadLine() && two->canReadLine(), 30000);
         QStringList lines{QString::fromUtf8(one->readLine()).trimmed(), QString::fromUtf8(two->readLine()).trimmed()};
         const bool oneIsFirst{lines.constFirst() == QStringLiteral("first")};
@@ -201,13 +201,13 @@ void TestQtSingleApplication::oneOfTwoStartedTogetherWins()
     }
 }
 
-void TestQtSingleApplication::instanceThatIsJustStartingIsWaitedFor()
+void QtSingleApplicationTest::instanceThatIsJustStartingIsWaitedFor()
 {
     QFile lock{path(".lock")};
     QVERIFY(lock.open(QIODevice::ReadWrite));
     QCOMPARE(flock(lock.handle(), LOCK_EX), 0);
-    const auto later{start()};
-    // Long enough for it to have found nobody listening; it must not have given up.
+    const auto later = start();
+    // By now it has found nobody listening, and must not have given up.
     QVERIFY(!later->waitForFinished(1000));
 
     QLocalServer server;
@@ -222,27 +222,27 @@ void TestQtSingleApplication::instanceThatIsJustStartingIsWaitedFor()
     QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("sent"), QStringLiteral("windows: 0")}));
 }
 
-void TestQtSingleApplication::laterInstanceGivesUpSilently()
+void QtSingleApplicationTest::laterInstanceGivesUpSilently()
 {
     QFile lock{path(".lock")};
     QVERIFY(lock.open(QIODevice::ReadWrite));
     QCOMPARE(flock(lock.handle(), LOCK_EX), 0);
-    const auto later{start(200)};
+    const auto later = start(200);
     QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("not sent"), QStringLiteral("windows: 0")}));
     QCOMPARE(later->exitCode(), 1);
 }
 
-void TestQtSingleApplication::busyInstanceIsGivenUpSilently()
+void QtSingleApplicationTest::busyInstanceIsGivenUpSilently()
 {
-    const auto first{startFirst(1000000)};
-    const auto later{start(200)};
+    const auto first = startFirst(1000000);
+    const auto later = start(200);
     QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("not sent"), QStringLiteral("windows: 0")}));
     QCOMPARE(later->exitCode(), 1);
 }
 
-void TestQtSingleApplication::longestMessageArrivesAndALongerOneIsRefused()
+void QtSingleApplicationTest::longestMessageArrivesAndALongerOneIsRefused()
 {
-    const auto first{startFirst()};
+    const auto first = startFirst();
     SingleInstance later{m_folder->path(), instanceName};
     QVERIFY(later.isOtherRunning());
     QVERIFY(later.send(QString{64 * 1024, QLatin1Char{'x'}}, 30000));
@@ -253,7 +253,7 @@ void TestQtSingleApplication::longestMessageArrivesAndALongerOneIsRefused()
     EXPECT_LINE(first, "message: grüße");
 }
 
-void TestQtSingleApplication::nonsenseIsDropped_data()
+void QtSingleApplicationTest::nonsenseIsDropped_data()
 {
     QTest::addColumn<QByteArray>("bytes");
     QTest::addRow("garbage") << QByteArray::fromHex("fffe00010203deadbeef");
@@ -263,10 +263,10 @@ void TestQtSingleApplication::nonsenseIsDropped_data()
     QTest::addRow("the longest length") << framed({}, 0xffffffff);
 }
 
-void TestQtSingleApplication::nonsenseIsDropped()
+void QtSingleApplicationTest::nonsenseIsDropped()
 {
     QFETCH(const QByteArray, bytes);
-    const auto first{startFirst()};
+    const auto first = startFirst();
     QLocalSocket client;
     QSignalSpy disconnected{&client, &QLocalSocket::disconnected};
     client.connectToServer(path(".socket"));
@@ -280,9 +280,9 @@ void TestQtSingleApplication::nonsenseIsDropped()
     EXPECT_LINE(first, "message: raise");
 }
 
-void TestQtSingleApplication::silentClientIsDroppedAndKeepsNobodyWaiting()
+void QtSingleApplicationTest::silentClientIsDroppedAndKeepsNobodyWaiting()
 {
-    const auto first{startFirst()};
+    const auto first = startFirst();
     QLocalSocket silent;
     QLocalSocket halfway;
     QSignalSpy silentDropped{&silent, &QLocalSocket::disconnected};
@@ -302,9 +302,9 @@ void TestQtSingleApplication::silentClientIsDroppedAndKeepsNobodyWaiting()
     QVERIFY(!first->canReadLine());
 }
 
-void TestQtSingleApplication::clientThatLeavesEarlyDoesNoHarm()
+void QtSingleApplicationTest::clientThatLeavesEarlyDoesNoHarm()
 {
-    const auto first{startFirst()};
+    const auto first = startFirst();
     for (const QByteArray &bytes : {QByteArray{}, framed("ra", 5), framed("left")}) {
         QLocalSocket client;
         client.connectToServer(path(".socket"));
@@ -320,14 +320,14 @@ void TestQtSingleApplication::clientThatLeavesEarlyDoesNoHarm()
     EXPECT_LINE(first, "message: raise");
 }
 
-void TestQtSingleApplication::otherUsersAreKeptOut()
+void QtSingleApplicationTest::otherUsersAreKeptOut()
 {
     if (geteuid() != 0)
         QSKIP("only the superuser can act as another user");
-    const auto first{startFirst()};
+    const auto first = startFirst();
     QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Refused);
 
-    // With the folder and the socket open to everybody the server itself must tell users apart.
+    // With the folder and the socket open to everybody, the server itself has to tell users apart.
     QCOMPARE(chmod(QFile::encodeName(m_folder->path()).constData(), 0755), 0);
     QCOMPARE(chmod(QFile::encodeName(path(".socket")).constData(), 0777), 0);
     QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Dropped);
@@ -337,14 +337,14 @@ void TestQtSingleApplication::otherUsersAreKeptOut()
     EXPECT_LINE(first, "message: raise");
 }
 
-void TestQtSingleApplication::withoutAFolderEveryInstanceIsTheFirst_data()
+void QtSingleApplicationTest::withoutAFolderEveryInstanceIsTheFirst_data()
 {
     QTest::addColumn<QString>("folder");
     QTest::addRow("none") << QString{};
     QTest::addRow("missing") << QStringLiteral("/nonexistent");
 }
 
-void TestQtSingleApplication::withoutAFolderEveryInstanceIsTheFirst()
+void QtSingleApplicationTest::withoutAFolderEveryInstanceIsTheFirst()
 {
     QFETCH(const QString, folder);
     SingleInstance one{folder, instanceName};
@@ -354,5 +354,5 @@ void TestQtSingleApplication::withoutAFolderEveryInstanceIsTheFirst()
     QVERIFY(!two.send(QStringLiteral("raise"), 1000));
 }
 
-QTEST_GUILESS_MAIN(TestQtSingleApplication)
+QTEST_GUILESS_MAIN(QtSingleApplicationTest)
 #include "tst_qtsingleapplication.moc"

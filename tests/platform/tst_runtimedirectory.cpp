@@ -17,7 +17,7 @@ constexpr uid_t otherUser{65534};
 
 } // namespace
 
-class TestRuntimeDirectory final : public QObject
+class RuntimeDirectoryTest final : public QObject
 {
     Q_OBJECT
 
@@ -36,7 +36,7 @@ private slots:
 
 private:
     QString folder(const QString &name, mode_t mode) const;
-    // A machine may have one for this user, which then stands before the program's own.
+    // The machine may have one for this user, which then comes before the program's own.
     QString expectedFallback() const { return isPrivateDirectory(m_ofUser) ? m_ofUser : own(); }
     QString own() const { return m_folder->filePath(QStringLiteral("made/own")); }
 
@@ -44,19 +44,19 @@ private:
     std::unique_ptr<QTemporaryDir> m_folder;
 };
 
-void TestRuntimeDirectory::init()
+void RuntimeDirectoryTest::init()
 {
     m_folder = std::make_unique<QTemporaryDir>();
     QVERIFY(m_folder->isValid());
 }
 
-void TestRuntimeDirectory::cleanup()
+void RuntimeDirectoryTest::cleanup()
 {
     qunsetenv("XDG_RUNTIME_DIR");
     m_folder.reset();
 }
 
-QString TestRuntimeDirectory::folder(const QString &name, mode_t mode) const
+QString RuntimeDirectoryTest::folder(const QString &name, mode_t mode) const
 {
     QString path{m_folder->filePath(name)};
     QDir{}.mkpath(path);
@@ -64,7 +64,7 @@ QString TestRuntimeDirectory::folder(const QString &name, mode_t mode) const
     return path;
 }
 
-void TestRuntimeDirectory::sessionsDirectoryIsUsedWhenPrivate()
+void RuntimeDirectoryTest::sessionsDirectoryIsUsedWhenPrivate()
 {
     const QString session{folder(QStringLiteral("session"), 0700)};
     qputenv("XDG_RUNTIME_DIR", QFile::encodeName(session));
@@ -72,7 +72,7 @@ void TestRuntimeDirectory::sessionsDirectoryIsUsedWhenPrivate()
     QVERIFY(!QFile::exists(own()));
 }
 
-void TestRuntimeDirectory::othersAreNot_data()
+void RuntimeDirectoryTest::othersAreNot_data()
 {
     QTest::addColumn<QString>("session"); // {} stands for the test's folder
     QTest::addRow("unset") << QString{};
@@ -86,7 +86,7 @@ void TestRuntimeDirectory::othersAreNot_data()
     QTest::addRow("symbolic link and slash") << QStringLiteral("{}/link/");
 }
 
-void TestRuntimeDirectory::othersAreNot()
+void RuntimeDirectoryTest::othersAreNot()
 {
     QFETCH(QString, session);
     const QString here{QDir::currentPath()};
@@ -106,7 +106,7 @@ void TestRuntimeDirectory::othersAreNot()
     QVERIFY(QDir::setCurrent(here));
 }
 
-void TestRuntimeDirectory::folderOfAnotherUserIsNotPrivate()
+void RuntimeDirectoryTest::folderOfAnotherUserIsNotPrivate()
 {
     if (geteuid() != 0)
         QSKIP("only the superuser can give a folder away");
@@ -118,7 +118,7 @@ void TestRuntimeDirectory::folderOfAnotherUserIsNotPrivate()
     QCOMPARE(runtimeDirectory(own()), expectedFallback());
 }
 
-void TestRuntimeDirectory::ownFolderIsMadePrivate()
+void RuntimeDirectoryTest::ownFolderIsMadePrivate()
 {
     QVERIFY(makePrivateDirectory(own()));
     struct stat status
@@ -129,7 +129,7 @@ void TestRuntimeDirectory::ownFolderIsMadePrivate()
     QVERIFY(makePrivateDirectory(own()));
 }
 
-void TestRuntimeDirectory::ownFolderMustBePrivate_data()
+void RuntimeDirectoryTest::ownFolderMustBePrivate_data()
 {
     QTest::addColumn<QString>("name");
     QTest::addRow("open to everybody") << QStringLiteral("open");
@@ -139,7 +139,7 @@ void TestRuntimeDirectory::ownFolderMustBePrivate_data()
     QTest::addRow("below a file") << QStringLiteral("file/below");
 }
 
-void TestRuntimeDirectory::ownFolderMustBePrivate()
+void RuntimeDirectoryTest::ownFolderMustBePrivate()
 {
     QFETCH(const QString, name);
     folder(QStringLiteral("open"), 0777);
@@ -154,7 +154,7 @@ void TestRuntimeDirectory::ownFolderMustBePrivate()
         QCOMPARE(runtimeDirectory(m_folder->filePath(name)), QString{});
 }
 
-void TestRuntimeDirectory::ownFolderIsNeverBelowTmp()
+void RuntimeDirectoryTest::ownFolderIsNeverBelowTmp()
 {
     const QString own{ownRuntimeDirectory()};
     QVERIFY(own.endsWith(QStringLiteral("/orv-admin-dhcp")));
@@ -163,5 +163,5 @@ void TestRuntimeDirectory::ownFolderIsNeverBelowTmp()
     QVERIFY(!own.startsWith(QStringLiteral("/tmp/")));
 }
 
-QTEST_GUILESS_MAIN(TestRuntimeDirectory)
+QTEST_GUILESS_MAIN(RuntimeDirectoryTest)
 #include "tst_runtimedirectory.moc"

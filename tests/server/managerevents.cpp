@@ -14,7 +14,7 @@ void record(const DhcpServerManager &manager, QStringList &events)
 {
     QObject::connect(&manager, &DhcpServerManager::serverStateChanged, &manager,
                      [&events](DhcpServerManager::ServerStates state) {
-                         const auto states = QMetaEnum::fromType<DhcpServerManager::ServerStates>();
+                         const QMetaEnum states{QMetaEnum::fromType<DhcpServerManager::ServerStates>()};
                          events.append(QString::fromLatin1(states.valueToKey(state)));
                      });
     QObject::connect(&manager, &DhcpServerManager::error, &manager,

@@ -32,7 +32,7 @@ QString failedQuery(const char *detail)
     return QStringLiteral("error: Checking DHCP-server status failed\n") + QString::fromUtf8(detail);
 }
 
-// A manager on a machine of its own, and everything that it has said in order.
+// A manager on a machine of its own, and everything that it has said so far, in order.
 struct Machine
 {
     explicit Machine(FakeSystemctl::State state)
@@ -42,7 +42,7 @@ struct Machine
         said::record(*manager, events);
     }
 
-    // As Machine, but the manager knows the state of the service and nothing is recorded yet.
+    // A machine whose manager knows the state of the service already, with nothing recorded yet.
     static std::unique_ptr<Machine> known(FakeSystemctl::State state)
     {
         auto machine = std::make_unique<Machine>(state);
@@ -107,7 +107,7 @@ Q_DECLARE_METATYPE(FakeSystemctl::State)
 Q_DECLARE_METATYPE(FakeSystemctl::Reply)
 Q_DECLARE_METATYPE(QMetaMethod::MethodType)
 
-class TestDhcpServerManager : public QObject
+class DhcpServerManagerTest final : public QObject
 {
     Q_OBJECT
 
@@ -127,6 +127,7 @@ private slots:
     void reportsCrashedQuery();
     void saysNothingWhenQueryCannotStart();
     void readsMuchOutputOfQuery();
+    void waitsForSlowQuery();
     void callsSystemctlWithVerbAndUnit();
     void performsOperation_data();
     void performsOperation();
@@ -156,7 +157,7 @@ private slots:
     void endsQuietlyDuringOperation();
 };
 
-void TestDhcpServerManager::hasTheInterfaceThatQueuedSignalsNeed_data()
+void DhcpServerManagerTest::hasTheInterfaceThatQueuedSignalsNeed_data()
 {
     QTest::addColumn<QByteArray>("signature");
     QTest::addColumn<QMetaMethod::MethodType>("type");
@@ -169,19 +170,19 @@ void TestDhcpServerManager::hasTheInterfaceThatQueuedSignalsNeed_data()
         QTest::addRow("%s", signature) << QByteArray{signature} << QMetaMethod::Slot;
 }
 
-void TestDhcpServerManager::hasTheInterfaceThatQueuedSignalsNeed()
+void DhcpServerManagerTest::hasTheInterfaceThatQueuedSignalsNeed()
 {
     QFETCH(const QByteArray, signature);
     const TemporaryRoot root;
     const DhcpServerManager manager;
-    const QMetaObject *metaObject = manager.metaObject();
-    const int index = metaObject->indexOfMethod(signature);
+    const QMetaObject *metaObject{manager.metaObject()};
+    const int index{metaObject->indexOfMethod(signature)};
     QVERIFY(index >= 0);
     QTEST(metaObject->method(index).methodType(), "type");
     QVERIFY(QMetaType::type("DhcpServerManager::ServerStates") != QMetaType::UnknownType);
 }
 
-void TestDhcpServerManager::textOfState_data()
+void DhcpServerManagerTest::textOfState_data()
 {
     QTest::addColumn<int>("state");
     QTest::addColumn<QString>("text");
@@ -193,13 +194,13 @@ void TestDhcpServerManager::textOfState_data()
     QTest::addRow("largest") << std::numeric_limits<int>::max() << QString{};
 }
 
-void TestDhcpServerManager::textOfState()
+void DhcpServerManagerTest::textOfState()
 {
     QFETCH(const int, state);
     QTEST(DhcpServerManager::stateText(static_cast<DhcpServerManager::ServerStates>(state)), "text");
 }
 
-void TestDhcpServerManager::textsAreTranslatedInTheObjectContext()
+void DhcpServerManagerTest::textsAreTranslatedInTheObjectContext()
 {
     ContextTranslator translator;
     QVERIFY(QCoreApplication::installTranslator(&translator));
@@ -231,7 +232,7 @@ void TestDhcpServerManager::textsAreTranslatedInTheObjectContext()
     QCOMPARE(machine.events, expected);
 }
 
-void TestDhcpServerManager::asksNothingUntilTold()
+void DhcpServerManagerTest::asksNothingUntilTold()
 {
     const Machine machine{FakeSystemctl::Running};
     QVERIFY(!machine.manager->isServerRunning());
@@ -239,7 +240,7 @@ void TestDhcpServerManager::asksNothingUntilTold()
     QCOMPARE(machine.systemctl.calls(), QList<QStringList>{});
 }
 
-void TestDhcpServerManager::readsStateFromStatus_data()
+void DhcpServerManagerTest::readsStateFromStatus_data()
 {
     QTest::addColumn<FakeSystemctl::Reply>("reply");
     QTest::addColumn<QStringList>("events");
@@ -270,7 +271,7 @@ void TestDhcpServerManager::readsStateFromStatus_data()
         << FakeSystemctl::Reply{{}, "Active: active (running)", 0, {}, 0} << QStringList{};
 }
 
-void TestDhcpServerManager::readsStateFromStatus()
+void DhcpServerManagerTest::readsStateFromStatus()
 {
     QFETCH(const FakeSystemctl::Reply, reply);
     QFETCH(const QStringList, events);
@@ -282,7 +283,7 @@ void TestDhcpServerManager::readsStateFromStatus()
     QCOMPARE(machine.systemctl.verbs(), QStringList{QStringLiteral("status")});
 }
 
-void TestDhcpServerManager::keepsKnownState_data()
+void DhcpServerManagerTest::keepsKnownState_data()
 {
     QTest::addColumn<FakeSystemctl::State>("unclear");
     QTest::addRow("activating") << FakeSystemctl::Activating;
@@ -290,7 +291,7 @@ void TestDhcpServerManager::keepsKnownState_data()
     QTest::addRow("no such unit") << FakeSystemctl::NoSuchUnit;
 }
 
-void TestDhcpServerManager::keepsKnownState()
+void DhcpServerManagerTest::keepsKnownState()
 {
     QFETCH(const FakeSystemctl::State, unclear);
     const auto machine = Machine::known(FakeSystemctl::Running);
@@ -300,7 +301,7 @@ void TestDhcpServerManager::keepsKnownState()
     QVERIFY(machine->manager->isServerRunning());
 }
 
-void TestDhcpServerManager::repeatsAnUnchangedState()
+void DhcpServerManagerTest::repeatsAnUnchangedState()
 {
     const auto machine = Machine::known(FakeSystemctl::Running);
     machine->manager->checkRunning();
@@ -308,7 +309,7 @@ void TestDhcpServerManager::repeatsAnUnchangedState()
     QCOMPARE(machine->events, (QStringList{running, running}));
 }
 
-void TestDhcpServerManager::reportsCrashedQuery_data()
+void DhcpServerManagerTest::reportsCrashedQuery_data()
 {
     QTest::addColumn<QByteArray>("errors");
     QTest::addColumn<QString>("event");
@@ -320,19 +321,19 @@ void TestDhcpServerManager::reportsCrashedQuery_data()
     QTest::addRow("a placeholder") << QByteArray{"100%1"} << failedQuery("100%1");
 }
 
-void TestDhcpServerManager::reportsCrashedQuery()
+void DhcpServerManagerTest::reportsCrashedQuery()
 {
     QFETCH(const QByteArray, errors);
     QFETCH(const QString, event);
     const auto machine = Machine::known(FakeSystemctl::Running);
-    // What it printed before is not looked at.
+    // What it printed before it crashed is ignored.
     machine->systemctl.setReply(QStringLiteral("status"), {"Active: failed\n", errors, 0, {}, SIGKILL});
     machine->manager->checkRunning();
     QCOMPARE(machine->events, QStringList{event});
     QVERIFY(machine->manager->isServerRunning());
 }
 
-void TestDhcpServerManager::saysNothingWhenQueryCannotStart()
+void DhcpServerManagerTest::saysNothingWhenQueryCannotStart()
 {
     const auto machine = Machine::known(FakeSystemctl::Running);
     machine->systemctl.setReply(QStringLiteral("status"), {"Active: failed\n", "lost\n", 0, {}, SIGKILL});
@@ -351,7 +352,7 @@ void TestDhcpServerManager::saysNothingWhenQueryCannotStart()
     QCOMPARE(machine->events, QStringList{stopped});
 }
 
-void TestDhcpServerManager::readsMuchOutputOfQuery()
+void DhcpServerManagerTest::readsMuchOutputOfQuery()
 {
     Machine machine{FakeSystemctl::Stopped};
     const QByteArray much(300 * 1024, '.');
@@ -360,7 +361,18 @@ void TestDhcpServerManager::readsMuchOutputOfQuery()
     QCOMPARE(machine.events, QStringList{running});
 }
 
-void TestDhcpServerManager::callsSystemctlWithVerbAndUnit()
+// QProcess by itself gives up after 30 seconds.
+void DhcpServerManagerTest::waitsForSlowQuery()
+{
+    Machine machine{FakeSystemctl::Stopped};
+    FakeSystemctl::Reply late{FakeSystemctl::statusReply(FakeSystemctl::Running)};
+    late.seconds = 31;
+    machine.systemctl.setReply(QStringLiteral("status"), late);
+    machine.manager->checkRunning();
+    QCOMPARE(machine.events, QStringList{running});
+}
+
+void DhcpServerManagerTest::callsSystemctlWithVerbAndUnit()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->manager->runServer();
@@ -377,7 +389,7 @@ void TestDhcpServerManager::callsSystemctlWithVerbAndUnit()
     QCOMPARE(machine->systemctl.calls(), calls);
 }
 
-void TestDhcpServerManager::performsOperation_data()
+void DhcpServerManagerTest::performsOperation_data()
 {
     QTest::addColumn<Slot>("operation");
     QTest::addColumn<FakeSystemctl::State>("before");
@@ -394,7 +406,7 @@ void TestDhcpServerManager::performsOperation_data()
                              << QStringList{running, updating, running};
 }
 
-void TestDhcpServerManager::performsOperation()
+void DhcpServerManagerTest::performsOperation()
 {
     QFETCH(const Slot, operation);
     QFETCH(const FakeSystemctl::State, before);
@@ -402,7 +414,7 @@ void TestDhcpServerManager::performsOperation()
     QFETCH(const QStringList, events);
     const auto machine = Machine::known(before);
     machine->call(operation);
-    // The command itself is not waited for.
+    // The call does not wait for the command.
     QCOMPARE(machine->events, events.mid(0, 2));
     QCOMPARE(machine->manager->serverStateText(), QStringLiteral("Updating DHCP-server status..."));
     QTRY_COMPARE(machine->events, events);
@@ -410,7 +422,7 @@ void TestDhcpServerManager::performsOperation()
     QCOMPARE(machine->manager->isServerRunning(), events.constLast() == running);
 }
 
-void TestDhcpServerManager::informsThatOperationIsNotNeeded_data()
+void DhcpServerManagerTest::informsThatOperationIsNotNeeded_data()
 {
     QTest::addColumn<Slot>("operation");
     QTest::addColumn<FakeSystemctl::State>("believed");
@@ -426,7 +438,7 @@ void TestDhcpServerManager::informsThatOperationIsNotNeeded_data()
         << stop << FakeSystemctl::Running << FakeSystemctl::Failed << alreadyStopped;
 }
 
-void TestDhcpServerManager::informsThatOperationIsNotNeeded()
+void DhcpServerManagerTest::informsThatOperationIsNotNeeded()
 {
     QFETCH(const Slot, operation);
     QFETCH(const FakeSystemctl::State, believed);
@@ -439,7 +451,7 @@ void TestDhcpServerManager::informsThatOperationIsNotNeeded()
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::startsStoppedServiceOnRestart()
+void DhcpServerManagerTest::startsStoppedServiceOnRestart()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->manager->restartServer();
@@ -448,7 +460,7 @@ void TestDhcpServerManager::startsStoppedServiceOnRestart()
                                                           QStringLiteral("start"), QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::refusesOperationBeforeFirstQuery()
+void DhcpServerManagerTest::refusesOperationBeforeFirstQuery()
 {
     QFETCH(const Slot, operation);
     Machine machine{FakeSystemctl::Stopped};
@@ -457,7 +469,7 @@ void TestDhcpServerManager::refusesOperationBeforeFirstQuery()
     QCOMPARE(machine.systemctl.verbs(), QStringList{});
 }
 
-void TestDhcpServerManager::refusesOperationDuringAnother()
+void DhcpServerManagerTest::refusesOperationDuringAnother()
 {
     QFETCH(const Slot, operation);
     QFETCH(const FakeSystemctl::State, before);
@@ -480,7 +492,7 @@ void TestDhcpServerManager::refusesOperationDuringAnother()
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status"), verb, QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::staysUpdatingWhenOutcomeIsUnclear()
+void DhcpServerManagerTest::staysUpdatingWhenOutcomeIsUnclear()
 {
     QFETCH(const Slot, operation);
     QFETCH(const QString, verb);
@@ -504,7 +516,7 @@ void TestDhcpServerManager::staysUpdatingWhenOutcomeIsUnclear()
     QCOMPARE(machine->events.mid(3), (QStringList{running, running, alreadyRunning}));
 }
 
-void TestDhcpServerManager::sendsCommandWhenQueryIsUnclear()
+void DhcpServerManagerTest::sendsCommandWhenQueryIsUnclear()
 {
     QFETCH(const Slot, operation);
     QFETCH(const QString, verb);
@@ -513,11 +525,11 @@ void TestDhcpServerManager::sendsCommandWhenQueryIsUnclear()
     machine->systemctl.setState(FakeSystemctl::Activating);
     machine->call(operation);
     QTRY_COMPARE(machine->events.size(), 2);
-    QCOMPARE(machine->events, (QStringList{updating, verb == QLatin1String("stop") ? stopped : running}));
+    QCOMPARE(machine->events, (QStringList{updating, verb == QLatin1String{"stop"} ? stopped : running}));
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status"), verb, QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::sendsCommandWhenQueryCrashes()
+void DhcpServerManagerTest::sendsCommandWhenQueryCrashes()
 {
     QFETCH(const Slot, operation);
     QFETCH(const QString, verb);
@@ -526,10 +538,10 @@ void TestDhcpServerManager::sendsCommandWhenQueryCrashes()
     machine->systemctl.setReply(QStringLiteral("status"), {{}, "lost\n", 0, {}, SIGKILL});
     machine->call(operation);
     QTRY_COMPARE(machine->events,
-                 (QStringList{failedQuery("lost\n"), updating, verb == QLatin1String("stop") ? stopped : running}));
+                 (QStringList{failedQuery("lost\n"), updating, verb == QLatin1String{"stop"} ? stopped : running}));
 }
 
-void TestDhcpServerManager::reportsFailedOperation_data()
+void DhcpServerManagerTest::reportsFailedOperation_data()
 {
     QTest::addColumn<Slot>("operation");
     QTest::addColumn<QString>("verb");
@@ -539,10 +551,10 @@ void TestDhcpServerManager::reportsFailedOperation_data()
     const Slot start{&DhcpServerManager::runServer};
     const Slot stop{&DhcpServerManager::stopServer};
     const Slot restart{&DhcpServerManager::restartServer};
-    constexpr const char *jobFailed =
+    constexpr const char *jobFailed{
         "Job for isc-dhcp-server.service failed because the control process exited with error code.\n"
         "See \"systemctl status isc-dhcp-server.service\" and \"journalctl -xeu isc-dhcp-server.service\" for "
-        "details.\n";
+        "details.\n"};
     const auto failing = [](const char *errors, int exitCode, std::optional<FakeSystemctl::State> state = {}) {
         return FakeSystemctl::Reply{{}, errors, exitCode, state, 0};
     };
@@ -572,7 +584,7 @@ void TestDhcpServerManager::reportsFailedOperation_data()
         << QStringList{running};
 }
 
-void TestDhcpServerManager::reportsFailedOperation()
+void DhcpServerManagerTest::reportsFailedOperation()
 {
     QFETCH(const Slot, operation);
     QFETCH(const QString, verb);
@@ -586,12 +598,12 @@ void TestDhcpServerManager::reportsFailedOperation()
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status"), verb, QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::reportsOperationThatCannotStart()
+void DhcpServerManagerTest::reportsOperationThatCannotStart()
 {
     QFETCH(const Slot, operation);
     QFETCH(const FakeSystemctl::State, before);
     const auto machine = Machine::known(before);
-    // Away between the query before the command and the one after it.
+    // The program is missing between the query before the command and the one after it.
     QObject::connect(machine->manager.get(), &DhcpServerManager::serverStateChanged, &machine->context,
                      [&machine](DhcpServerManager::ServerStates state) {
                          if (state == DhcpServerManager::Updating)
@@ -602,14 +614,14 @@ void TestDhcpServerManager::reportsOperationThatCannotStart()
     machine->call(operation);
     QTRY_COMPARE(machine->events.size(), 4);
     QCOMPARE(machine->events.mid(0, 2), (QStringList{stateName(before), updating}));
-    const QString report = machine->events.at(2);
+    const QString report{machine->events.at(2)};
     QVERIFY2(report.startsWith(failedOperation("")), qPrintable(report));
     QVERIFY2(report.size() > failedOperation("").size(), "the reason is missing");
     QCOMPARE(machine->events.at(3), stateName(before));
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status"), QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::staysUpdatingWithoutSystemctl()
+void DhcpServerManagerTest::staysUpdatingWithoutSystemctl()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->systemctl.setInstalled(false);
@@ -624,11 +636,11 @@ void TestDhcpServerManager::staysUpdatingWithoutSystemctl()
     QCOMPARE(machine->events.mid(2), (QStringList{busy, stopped}));
 }
 
-void TestDhcpServerManager::leavesNothingBehindAfterFailures()
+void DhcpServerManagerTest::leavesNothingBehindAfterFailures()
 {
     const QDir openFiles{QStringLiteral("/proc/self/fd")};
     const auto machine = Machine::known(FakeSystemctl::Stopped);
-    // Back for the query after the failure, which is what could meet the remains of the command.
+    // It is back for the query after the failure, which could trip over the remains of the command.
     connect(machine->manager.get(), &DhcpServerManager::serverStateChanged, &machine->context,
             [&machine](DhcpServerManager::ServerStates state) {
                 if (state == DhcpServerManager::Updating)
@@ -638,17 +650,17 @@ void TestDhcpServerManager::leavesNothingBehindAfterFailures()
             [&machine] { machine->systemctl.setInstalled(true); });
     QVector<int> openAfterRound;
     const WarningRecorder warnings;
-    for (int round = 0; round < 3; ++round) {
+    for (int round{0}; round < 3; ++round) {
         machine->events.clear();
         machine->manager->runServer();
         QTRY_COMPARE(machine->events.size(), 4);
         openAfterRound.append(openFiles.entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System).size());
     }
     QCOMPARE(openAfterRound, QVector<int>(3, openAfterRound.constFirst()));
-    QCOMPARE(warnings.recorded(), QStringList{}); // about descriptors that are gone
+    QCOMPARE(warnings.recorded(), QStringList{}); // such as one about a closed descriptor
 }
 
-void TestDhcpServerManager::readsMuchOutputOfOperation()
+void DhcpServerManagerTest::readsMuchOutputOfOperation()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     const QByteArray much(300 * 1024, 'x');
@@ -657,26 +669,26 @@ void TestDhcpServerManager::readsMuchOutputOfOperation()
     QTRY_COMPARE(machine->events, (QStringList{stopped, updating, failedOperation(much.constData()), stopped}));
 }
 
-void TestDhcpServerManager::doesNotTakeOutputOfOperationForStatus()
+void DhcpServerManagerTest::doesNotTakeOutputOfOperationForStatus()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->systemctl.setReply(QStringLiteral("start"), {"Active: active (running)\n", "old\n", 0, {}, 0});
     machine->manager->runServer();
     QTRY_COMPARE(machine->events, (QStringList{stopped, updating, stopped}));
 
-    // Nor what an earlier command complained about for the complaint of the next.
+    // Nor is the complaint of one command taken for that of the next.
     machine->systemctl.setReply(QStringLiteral("start"), {{}, "new\n", 1, {}, 0});
     machine->events.clear();
     machine->manager->runServer();
     QTRY_COMPARE(machine->events, (QStringList{stopped, updating, failedOperation("new\n"), stopped}));
 }
 
-void TestDhcpServerManager::reportsEachOfManyOperationsOnce()
+void DhcpServerManagerTest::reportsEachOfManyOperationsOnce()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->systemctl.setReply(QStringLiteral("start"), {{}, "no\n", 1, {}, 0});
     QStringList events;
-    for (int round = 0; round < 3; ++round) {
+    for (int round{0}; round < 3; ++round) {
         machine->manager->runServer();
         events += {stopped, updating, failedOperation("no\n"), stopped};
         QTRY_COMPARE(machine->events, events);
@@ -684,7 +696,7 @@ void TestDhcpServerManager::reportsEachOfManyOperationsOnce()
     QCOMPARE(machine->systemctl.verbs().size(), 1 + 3 * 3);
 }
 
-void TestDhcpServerManager::doesNotQueryDuringOperation()
+void DhcpServerManagerTest::doesNotQueryDuringOperation()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->systemctl.hold(QStringLiteral("start"));
@@ -698,12 +710,12 @@ void TestDhcpServerManager::doesNotQueryDuringOperation()
              afterFirstQuery({QStringLiteral("status"), QStringLiteral("start"), QStringLiteral("status")}));
 }
 
-void TestDhcpServerManager::endsQuietlyDuringOperation()
+void DhcpServerManagerTest::endsQuietlyDuringOperation()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
     machine->systemctl.hold(QStringLiteral("start"));
     machine->manager->runServer();
-    const QStringList begun = afterFirstQuery({QStringLiteral("status"), QStringLiteral("start")});
+    const QStringList begun{afterFirstQuery({QStringLiteral("status"), QStringLiteral("start")})};
     QTRY_COMPARE(machine->systemctl.verbs(), begun);
 
     QTest::ignoreMessage(QtWarningMsg, QRegularExpression{QStringLiteral("QProcess: Destroyed while process")});
@@ -713,5 +725,5 @@ void TestDhcpServerManager::endsQuietlyDuringOperation()
     QCOMPARE(machine->systemctl.verbs(), begun);
 }
 
-QTEST_GUILESS_MAIN(TestDhcpServerManager)
+QTEST_GUILESS_MAIN(DhcpServerManagerTest)
 #include "tst_dhcpservermanager.moc"

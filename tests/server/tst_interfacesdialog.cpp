@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/interfacesdialog.h"
 #include "tests/support/contexttranslator.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QCheckBox>
 #include <QDialogButtonBox>
@@ -9,18 +10,21 @@
 #include <QPushButton>
 #include <QScreen>
 #include <QScrollArea>
+#include <QScrollBar>
 #include <QTest>
 #include <QVBoxLayout>
+
+#include <algorithm>
 
 namespace {
 
 using Choice = QMap<QString, bool>;
 
-Choice manyInterfaces()
+Choice interfacesOf(int count)
 {
     Choice interfaces;
-    for (int number = 0; number < 200; ++number)
-        interfaces.insert(QStringLiteral("vlan%1").arg(number, 4, 10, QLatin1Char('0')), number % 2 == 0);
+    for (int number{0}; number < count; ++number)
+        interfaces.insert(QStringLiteral("vlan%1").arg(number, 4, 10, QLatin1Char{'0'}), number % 2 == 0);
     return interfaces;
 }
 
@@ -32,7 +36,7 @@ QStringList textsOf(const QList<QCheckBox *> &checkBoxes)
     return texts;
 }
 
-// The check box with the text `name`, which must be there.
+// The check box with the text `name`; ends the test without one.
 QCheckBox *checkBoxOf(const InterfacesDialog &dialog, const QString &name)
 {
     for (QCheckBox *checkBox : dialog.findChildren<QCheckBox *>()) {
@@ -42,11 +46,6 @@ QCheckBox *checkBoxOf(const InterfacesDialog &dialog, const QString &name)
     qFatal("no check box %s", qPrintable(name));
 }
 
-void press(const InterfacesDialog &dialog, QDialogButtonBox::StandardButton button)
-{
-    QTest::mouseClick(dialog.findChild<QDialogButtonBox *>()->button(button), Qt::LeftButton);
-}
-
 // Clicks the box of `checkBox`, where a mouse would.
 void click(QCheckBox *checkBox) { QTest::mouseClick(checkBox, Qt::LeftButton, {}, {8, checkBox->height() / 2}); }
 
@@ -54,7 +53,7 @@ void click(QCheckBox *checkBox) { QTest::mouseClick(checkBox, Qt::LeftButton, {}
 
 Q_DECLARE_METATYPE(QDialogButtonBox::StandardButton)
 
-class TestInterfacesDialog : public QObject
+class InterfacesDialogTest final : public QObject
 {
     Q_OBJECT
 
@@ -69,10 +68,11 @@ private slots:
     void endsAsButtonSays();
     void endsAsKeySays_data();
     void endsAsKeySays();
+    void scrollsBeyondTwoThirdsOfTheScreen();
     void keepsButtonsOnScreen();
 };
 
-void TestInterfacesDialog::hasListAboveButtons()
+void InterfacesDialogTest::hasListAboveButtons()
 {
     const InterfacesDialog dialog{{{QStringLiteral("eth0"), true}}};
     QCOMPARE(dialog.windowTitle(), QStringLiteral("Select interfaces"));
@@ -89,14 +89,14 @@ void TestInterfacesDialog::hasListAboveButtons()
     QCOMPARE(buttonBox->standardButtons(), QDialogButtonBox::Save | QDialogButtonBox::Cancel);
 }
 
-void TestInterfacesDialog::listsInterfacesInOrder_data()
+void InterfacesDialogTest::listsInterfacesInOrder_data()
 {
     QTest::addColumn<Choice>("interfaces");
     QTest::addColumn<QStringList>("texts");
-    const QString eth0 = QStringLiteral("eth0");
-    const QString eth1 = QStringLiteral("eth1");
-    const QString eth10 = QStringLiteral("eth10");
-    const QString upper = QStringLiteral("WAN");
+    const QString eth0{QStringLiteral("eth0")};
+    const QString eth1{QStringLiteral("eth1")};
+    const QString eth10{QStringLiteral("eth10")};
+    const QString upper{QStringLiteral("WAN")};
     QTest::addRow("one") << Choice{{eth0, true}} << QStringList{eth0};
     QTest::addRow("several") << Choice{{eth1, true}, {eth10, false}, {eth0, false}} << QStringList{eth0, eth1, eth10};
     QTest::addRow("capitals first") << Choice{{eth0, true}, {upper, true}} << QStringList{upper, eth0};
@@ -105,14 +105,14 @@ void TestInterfacesDialog::listsInterfacesInOrder_data()
                               << QStringList{QStringLiteral("a & <b>b</b>")};
 }
 
-void TestInterfacesDialog::listsInterfacesInOrder()
+void InterfacesDialogTest::listsInterfacesInOrder()
 {
     QFETCH(const Choice, interfaces);
     QFETCH(const QStringList, texts);
     const InterfacesDialog dialog{interfaces};
     const auto *groupBox = dialog.findChild<QGroupBox *>();
     QList<QCheckBox *> checkBoxes;
-    for (int item = 0; item < groupBox->layout()->count(); ++item)
+    for (int item{0}; item < groupBox->layout()->count(); ++item)
         checkBoxes.append(qobject_cast<QCheckBox *>(groupBox->layout()->itemAt(item)->widget()));
     QVERIFY(!checkBoxes.contains(nullptr));
     QCOMPARE(textsOf(checkBoxes), texts);
@@ -121,7 +121,7 @@ void TestInterfacesDialog::listsInterfacesInOrder()
     QCOMPARE(dialog.interfaces(), interfaces);
 }
 
-void TestInterfacesDialog::saysThatThereAreNone()
+void InterfacesDialogTest::saysThatThereAreNone()
 {
     const InterfacesDialog dialog{{}};
     const auto *groupBox = dialog.findChild<QGroupBox *>();
@@ -133,7 +133,7 @@ void TestInterfacesDialog::saysThatThereAreNone()
     QCOMPARE(dialog.interfaces(), Choice{});
 }
 
-void TestInterfacesDialog::textsAreTranslatedInTheDialogContext()
+void InterfacesDialogTest::textsAreTranslatedInTheDialogContext()
 {
     ContextTranslator translator;
     QVERIFY(QCoreApplication::installTranslator(&translator));
@@ -144,11 +144,11 @@ void TestInterfacesDialog::textsAreTranslatedInTheDialogContext()
     QCOMPARE(groupBox->findChild<QLabel *>()->text(), QStringLiteral("QDialog|Available interfaces are not found!"));
 }
 
-void TestInterfacesDialog::returnsWhatIsChecked()
+void InterfacesDialogTest::returnsWhatIsChecked()
 {
-    const QString eth0 = QStringLiteral("eth0");
-    const QString eth1 = QStringLiteral("eth1");
-    const QString eth2 = QStringLiteral("eth2");
+    const QString eth0{QStringLiteral("eth0")};
+    const QString eth1{QStringLiteral("eth1")};
+    const QString eth2{QStringLiteral("eth2")};
     InterfacesDialog dialog{{{eth0, true}, {eth1, false}, {eth2, true}}};
     dialog.show();
     QVERIFY(QTest::qWaitForWindowExposed(&dialog));
@@ -159,7 +159,7 @@ void TestInterfacesDialog::returnsWhatIsChecked()
     QCOMPARE(dialog.interfaces(), (Choice{{eth0, false}, {eth1, false}, {eth2, true}}));
 }
 
-void TestInterfacesDialog::endsAsButtonSays_data()
+void InterfacesDialogTest::endsAsButtonSays_data()
 {
     QTest::addColumn<QDialogButtonBox::StandardButton>("button");
     QTest::addColumn<int>("result");
@@ -167,7 +167,7 @@ void TestInterfacesDialog::endsAsButtonSays_data()
     QTest::addRow("cancel") << QDialogButtonBox::Cancel << int{QDialog::Rejected};
 }
 
-void TestInterfacesDialog::endsAsButtonSays()
+void InterfacesDialogTest::endsAsButtonSays()
 {
     QFETCH(const QDialogButtonBox::StandardButton, button);
     QFETCH(const int, result);
@@ -176,13 +176,13 @@ void TestInterfacesDialog::endsAsButtonSays()
         dialog.setResult(-1);
         dialog.show();
         QVERIFY(QTest::qWaitForWindowExposed(&dialog));
-        press(dialog, button);
+        driver::click(dialog, button);
         QVERIFY(!dialog.isVisible());
         QCOMPARE(dialog.result(), result);
     }
 }
 
-void TestInterfacesDialog::endsAsKeySays_data()
+void InterfacesDialogTest::endsAsKeySays_data()
 {
     QTest::addColumn<Qt::Key>("key");
     QTest::addColumn<int>("result");
@@ -190,7 +190,7 @@ void TestInterfacesDialog::endsAsKeySays_data()
     QTest::addRow("escape") << Qt::Key_Escape << int{QDialog::Rejected};
 }
 
-void TestInterfacesDialog::endsAsKeySays()
+void InterfacesDialogTest::endsAsKeySays()
 {
     QFETCH(const Qt::Key, key);
     InterfacesDialog dialog{{{QStringLiteral("eth0"), true}}};
@@ -202,9 +202,34 @@ void TestInterfacesDialog::endsAsKeySays()
     QTEST(dialog.result(), "result");
 }
 
-void TestInterfacesDialog::keepsButtonsOnScreen()
+void InterfacesDialogTest::scrollsBeyondTwoThirdsOfTheScreen()
 {
-    const Choice interfaces = manyInterfaces();
+    const int screenHeight{QGuiApplication::primaryScreen()->availableGeometry().height()};
+    const auto heightOf = [](int count) { return InterfacesDialog{interfacesOf(count)}.sizeHint().height(); };
+    const int rowHeight{heightOf(2) - heightOf(1)};
+    const int longest{1 + (screenHeight * 2 / 3 - heightOf(1)) / rowHeight};
+    QVERIFY(heightOf(1) + longest * rowHeight < screenHeight); // one more would fit the screen
+
+    for (const int count : {longest, longest + 1}) {
+        InterfacesDialog dialog{interfacesOf(count)};
+        dialog.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&dialog));
+        QVERIFY(dialog.height() * 3 <= screenHeight * 2);
+        const QList<QCheckBox *> checkBoxes{dialog.findChildren<QCheckBox *>()};
+        QCOMPARE(checkBoxes.size(), count);
+        const auto isVisible = [](const QCheckBox *checkBox) {
+            return checkBox->visibleRegion() == QRegion{checkBox->rect()};
+        };
+        QCOMPARE(std::all_of(checkBoxes.begin(), checkBoxes.end(), isVisible), count == longest);
+        const auto *area = dialog.findChild<QScrollArea *>();
+        QCOMPARE(area && area->verticalScrollBar()->isVisible() && area->verticalScrollBar()->maximum() > 0,
+                 count > longest);
+    }
+}
+
+void InterfacesDialogTest::keepsButtonsOnScreen()
+{
+    const Choice interfaces{interfacesOf(200)};
     InterfacesDialog dialog{interfaces};
     dialog.show();
     QVERIFY(QTest::qWaitForWindowActive(&dialog));
@@ -217,12 +242,12 @@ void TestInterfacesDialog::keepsButtonsOnScreen()
     QCOMPARE(dialog.interfaces(), interfaces);
     const auto *scrollArea = dialog.findChild<QScrollArea *>();
     QVERIFY(scrollArea->viewport()->width() >= dialog.findChild<QGroupBox *>()->minimumSizeHint().width());
-    QCheckBox *last = checkBoxOf(dialog, interfaces.lastKey());
+    QCheckBox *last{checkBoxOf(dialog, interfaces.lastKey())};
 
-    // What the keyboard comes to comes into sight.
+    // A check box that gets the focus is scrolled into view.
     QCOMPARE(dialog.focusWidget(), checkBoxOf(dialog, interfaces.firstKey()));
     QVERIFY(last->visibleRegion().isEmpty());
-    for (int key = 1; key < interfaces.size(); ++key)
+    for (int key{1}; key < interfaces.size(); ++key)
         QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
     QCOMPARE(dialog.focusWidget(), last);
     QVERIFY(!last->visibleRegion().isEmpty());
@@ -234,10 +259,10 @@ void TestInterfacesDialog::keepsButtonsOnScreen()
     QCOMPARE(dialog.focusWidget(), checkBoxOf(dialog, interfaces.firstKey()));
 
     QTest::keyClick(last, Qt::Key_Space);
-    press(dialog, QDialogButtonBox::Save);
+    driver::click(dialog, QDialogButtonBox::Save);
     QCOMPARE(dialog.result(), int{QDialog::Accepted});
     QVERIFY(dialog.interfaces().last() != interfaces.last());
 }
 
-QTEST_MAIN(TestInterfacesDialog)
+QTEST_MAIN(InterfacesDialogTest)
 #include "tst_interfacesdialog.moc"

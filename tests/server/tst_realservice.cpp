@@ -27,16 +27,16 @@ using said::running;
 using said::stopped;
 using said::updating;
 
-// For what the service manager does sooner or later. Where a question to it is repeated meanwhile, it takes much
-// longer.
-constexpr int patience = 20'000;
+// How long the service manager may take for what it does sooner or later; asking it over and over again makes it
+// much slower.
+constexpr int patience{20'000};
 
-constexpr const char *holdingPipe = "/run/hold";
-const QString initScript = QStringLiteral("/etc/init.d/isc-dhcp-server");
-const QString initScriptAside = QStringLiteral("/root/isc-dhcp-server");
-const QString jobFailed = QStringLiteral(
+constexpr const char *holdingPipe{"/run/hold"};
+const QString initScript{QStringLiteral("/etc/init.d/isc-dhcp-server")};
+const QString initScriptAside{QStringLiteral("/root/isc-dhcp-server")};
+const QString jobFailed{QStringLiteral(
     "Job for isc-dhcp-server.service failed because the control process exited with error code.\n"
-    "See \"systemctl status isc-dhcp-server.service\" and \"journalctl -xeu isc-dhcp-server.service\" for details.\n");
+    "See \"systemctl status isc-dhcp-server.service\" and \"journalctl -xeu isc-dhcp-server.service\" for details.\n")};
 
 struct Answer
 {
@@ -73,7 +73,7 @@ QString journal()
 QStringList servers()
 {
     return run(QStringLiteral("pgrep"), {QStringLiteral("-ax"), QStringLiteral("dhcpd")})
-        .output.split(QLatin1Char('\n'), Qt::SkipEmptyParts);
+        .output.split(QLatin1Char{'\n'}, Qt::SkipEmptyParts);
 }
 
 void writeConfiguration(const QByteArray &more = {})
@@ -95,7 +95,7 @@ void stop()
     QTRY_COMPARE_WITH_TIMEOUT(servers(), QStringList{}, patience);
 }
 
-// What a status tells about the unit, without what differs from time to time and from machine to machine.
+// What a status says about the unit, without what varies with the time and the machine.
 QString description(QString status)
 {
     static const std::array<std::pair<QRegularExpression, QString>, 4> differing{{
@@ -116,7 +116,7 @@ QStringList messages(const QString &journal)
                                          QRegularExpression::MultilineOption};
     QStringList messages;
     for (auto matches = line.globalMatch(journal); matches.hasNext();) {
-        const QRegularExpressionMatch match = matches.next();
+        const QRegularExpressionMatch match{matches.next()};
         messages.append(match.captured(1) + match.captured(2));
     }
     return messages;
@@ -130,14 +130,14 @@ QStringList notLogged(QStringList expected)
     return expected;
 }
 
-// The real status is what the replaying systemctl prints for `state`.
+// Fails the test unless the real status is what FakeSystemctl prints for `state`.
 void compareWithRecording(FakeSystemctl::State state)
 {
-    const FakeSystemctl::Reply recorded = FakeSystemctl::statusReply(state);
-    const QString output = QString::fromUtf8(recorded.output);
+    const FakeSystemctl::Reply recorded{FakeSystemctl::statusReply(state)};
+    const QString output{QString::fromUtf8(recorded.output)};
     QTRY_COMPARE_WITH_TIMEOUT(description(status()), description(output), patience);
     QTRY_COMPARE_WITH_TIMEOUT(notLogged(messages(output)), QStringList{}, patience);
-    const Answer real = systemctl(QStringLiteral("status"));
+    const Answer real{systemctl(QStringLiteral("status"))};
     QCOMPARE(real.errors, QString::fromUtf8(recorded.errors));
     QCOMPARE(real.exitCode, recorded.exitCode);
 }
@@ -158,7 +158,7 @@ struct Manager
 } // namespace
 
 // The real systemctl, init script and server, in the container of scripts/service-container.
-class TestRealService : public QObject
+class RealServiceTest final : public QObject
 {
     Q_OBJECT
 
@@ -186,13 +186,13 @@ private:
 
     QByteArray m_defaultsAsInstalled;
     QByteArray m_defaults; // with an interface to serve
-    int m_pipe{-1};        // what the init script waits at
+    int m_pipe{-1};        // what the init script waits for
 };
 
-void TestRealService::initTestCase()
+void RealServiceTest::initTestCase()
 {
-    // It changes the service and its files.
-    if (QSysInfo::machineHostName() != QLatin1String("service-container"))
+    // The test changes the service and its files.
+    if (QSysInfo::machineHostName() != QLatin1String{"service-container"})
         QFAIL("Only for the container of scripts/service-container");
     m_defaultsAsInstalled = readTestFile(paths::serverDefaults());
     QVERIFY(m_defaultsAsInstalled.contains("\nINTERFACESv4=\"\"\n"));
@@ -200,14 +200,14 @@ void TestRealService::initTestCase()
     m_defaults.replace("INTERFACESv4=\"\"", "INTERFACESv4=\"lan0\"");
 }
 
-void TestRealService::init()
+void RealServiceTest::init()
 {
     writeConfiguration();
     writeTestFile(paths::serverDefaults(), m_defaults);
     systemctl(QStringLiteral("reset-failed")); // also forgets earlier starts, of which only a few are allowed in a row
 }
 
-void TestRealService::cleanup()
+void RealServiceTest::cleanup()
 {
     if (QTest::currentTestFailed())
         qInfo("%s\n%s", qPrintable(status()), qPrintable(journal()));
@@ -215,8 +215,8 @@ void TestRealService::cleanup()
         release();
 }
 
-// From now on the init script waits, when it is called with `argument`, until release().
-void TestRealService::hold(const QByteArray &argument)
+// From now on the init script, called with `argument`, waits until release().
+void RealServiceTest::hold(const QByteArray &argument)
 {
     QFile::remove(QFile::decodeName(holdingPipe));
     QCOMPARE(mkfifo(holdingPipe, 0600), 0);
@@ -224,22 +224,22 @@ void TestRealService::hold(const QByteArray &argument)
                   m_defaults + "[ \"$1\" != " + argument + " ] || read -r _ <" + holdingPipe + '\n');
 }
 
-// Returns when it waits.
-void TestRealService::awaitHold()
+// Returns once the init script is waiting.
+void RealServiceTest::awaitHold()
 {
     QTRY_VERIFY_WITH_TIMEOUT((m_pipe = ::open(holdingPipe, O_WRONLY | O_NONBLOCK | O_CLOEXEC)) != -1, patience);
 }
 
-void TestRealService::release()
+void RealServiceTest::release()
 {
     QCOMPARE(::write(m_pipe, "\n", 1), ssize_t{1});
     QCOMPARE(::close(std::exchange(m_pipe, -1)), 0);
 }
 
-void TestRealService::readsThatItWasNeverStarted()
+void RealServiceTest::readsThatItWasNeverStarted()
 {
-    const Answer status = systemctl(QStringLiteral("status"));
-    QVERIFY2(status.output.contains(QLatin1String("Active: inactive (dead)\n")), qPrintable(status.output));
+    const Answer status{systemctl(QStringLiteral("status"))};
+    QVERIFY2(status.output.contains(QLatin1String{"Active: inactive (dead)\n"}), qPrintable(status.output));
     QCOMPARE(status.exitCode, 3);
     QStringList events;
     DhcpServerManager service;
@@ -248,7 +248,7 @@ void TestRealService::readsThatItWasNeverStarted()
     QCOMPARE(events, QStringList{stopped});
 }
 
-void TestRealService::startsOnTheChosenInterface()
+void RealServiceTest::startsOnTheChosenInterface()
 {
     stop();
     writeTestFile(paths::serverDefaults(), m_defaultsAsInstalled);
@@ -258,12 +258,12 @@ void TestRealService::startsOnTheChosenInterface()
     manager.service.runServer();
     QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{stopped, updating, running}), patience);
     QCOMPARE(servers().size(), 1);
-    QVERIFY2(servers().constFirst().endsWith(QLatin1String(" -cf /etc/dhcp/dhcpd.conf lan0")),
+    QVERIFY2(servers().constFirst().endsWith(QLatin1String{" -cf /etc/dhcp/dhcpd.conf lan0"}),
              qPrintable(servers().constFirst()));
     compareWithRecording(FakeSystemctl::Running);
 }
 
-void TestRealService::startsOnce()
+void RealServiceTest::startsOnce()
 {
     stop();
     hold("start");
@@ -281,7 +281,7 @@ void TestRealService::startsOnce()
     manager.events.clear();
     release();
     QTRY_COMPARE_WITH_TIMEOUT(manager.events, QStringList{running}, patience);
-    const QStringList started = servers();
+    const QStringList started{servers()};
     QCOMPARE(started.size(), 1);
 
     manager.service.runServer();
@@ -289,10 +289,10 @@ void TestRealService::startsOnce()
     QCOMPARE(servers(), started);
 }
 
-void TestRealService::restarts()
+void RealServiceTest::restarts()
 {
     start();
-    const QString before = servers().constFirst();
+    const QString before{servers().constFirst()};
     Manager manager;
     manager.service.restartServer();
     QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{running, updating, running}), patience);
@@ -300,7 +300,7 @@ void TestRealService::restarts()
     QVERIFY(servers().constFirst() != before);
 }
 
-void TestRealService::stopsOnce()
+void RealServiceTest::stopsOnce()
 {
     start();
     hold("stop");
@@ -325,7 +325,7 @@ void TestRealService::stopsOnce()
     QCOMPARE(manager.events, (QStringList{stopped, stopped, alreadyStopped}));
 }
 
-void TestRealService::startsStoppedServiceOnRestart()
+void RealServiceTest::startsStoppedServiceOnRestart()
 {
     stop();
     Manager manager;
@@ -334,7 +334,7 @@ void TestRealService::startsStoppedServiceOnRestart()
     QCOMPARE(servers().size(), 1);
 }
 
-void TestRealService::reportsFailedStart()
+void RealServiceTest::reportsFailedStart()
 {
     stop();
     writeConfiguration("no sense;\n");
@@ -350,7 +350,7 @@ void TestRealService::reportsFailedStart()
     QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{stopped, updating, running}), patience);
 }
 
-void TestRealService::reportsFailedRestart()
+void RealServiceTest::reportsFailedRestart()
 {
     start();
     writeConfiguration("no sense;\n");
@@ -362,12 +362,12 @@ void TestRealService::reportsFailedRestart()
     compareWithRecording(FakeSystemctl::Failed);
 }
 
-void TestRealService::restartsServiceWhoseServerDied()
+void RealServiceTest::restartsServiceWhoseServerDied()
 {
     start();
     Manager manager;
     run(QStringLiteral("pkill"), {QStringLiteral("-KILL"), QStringLiteral("-x"), QStringLiteral("dhcpd")});
-    QTRY_VERIFY_WITH_TIMEOUT(status().contains(QLatin1String("Active: active (exited)")), patience);
+    QTRY_VERIFY_WITH_TIMEOUT(status().contains(QLatin1String{"Active: active (exited)"}), patience);
     manager.service.checkRunning();
     QCOMPARE(manager.events, QStringList{});
     manager.service.restartServer();
@@ -375,20 +375,20 @@ void TestRealService::restartsServiceWhoseServerDied()
     QCOMPARE(servers().size(), 1);
 }
 
-void TestRealService::reportsMaskedService()
+void RealServiceTest::reportsMaskedService()
 {
     stop();
     QCOMPARE(systemctl(QStringLiteral("mask")).exitCode, 0);
     const auto unmask = qScopeGuard([] { systemctl(QStringLiteral("unmask")); });
     Manager manager;
     manager.service.runServer();
-    const QString refusal =
-        QStringLiteral("Failed to start isc-dhcp-server.service: Unit isc-dhcp-server.service is masked.\n");
+    const QString refusal{
+        QStringLiteral("Failed to start isc-dhcp-server.service: Unit isc-dhcp-server.service is masked.\n")};
     QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{stopped, updating, failedOperation(refusal), stopped}),
                               patience);
 }
 
-void TestRealService::reportsServiceThatIsNotInstalled()
+void RealServiceTest::reportsServiceThatIsNotInstalled()
 {
     stop();
     Manager manager;
@@ -401,8 +401,8 @@ void TestRealService::reportsServiceThatIsNotInstalled()
         reloadUnits();
         compareWithRecording(FakeSystemctl::NoSuchUnit);
         manager.service.runServer();
-        const QString refusal =
-            QStringLiteral("Failed to start isc-dhcp-server.service: Unit isc-dhcp-server.service not found.\n");
+        const QString refusal{
+            QStringLiteral("Failed to start isc-dhcp-server.service: Unit isc-dhcp-server.service not found.\n")};
         QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{updating, failedOperation(refusal)}), patience);
         manager.service.runServer();
         QCOMPARE(manager.events.constLast(), busy);
@@ -412,5 +412,5 @@ void TestRealService::reportsServiceThatIsNotInstalled()
     QCOMPARE(manager.events, QStringList{stopped});
 }
 
-QTEST_GUILESS_MAIN(TestRealService)
+QTEST_GUILESS_MAIN(RealServiceTest)
 #include "tst_realservice.moc"

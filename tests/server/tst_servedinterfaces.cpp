@@ -29,19 +29,19 @@ QStringList errorsOf(const QSignalSpy &spy)
     return errors;
 }
 
-// What the manager's map is to be: the interfaces that this machine has, and `served` with the flag set.
+// The map to expect: the interfaces of this machine, and those of `served` with the flag set.
 Choice machineInterfacesAnd(const QStringList &served)
 {
     const TemporaryRoot root;
     DhcpServerManager manager;
     manager.collectSystemInterfaces();
-    Choice interfaces = manager.interfaces();
+    Choice interfaces{manager.interfaces()};
     for (const QString &name : served)
         interfaces.insert(name, true);
     return interfaces;
 }
 
-// While it lives, files are opened as by a user without privileges, also where the test runs as the superuser.
+// While it lives, files are opened as an unprivileged user opens them, even where the test runs as the superuser.
 class WithoutPrivileges final
 {
 public:
@@ -54,17 +54,17 @@ public:
     Q_DISABLE_COPY_MOVE(WithoutPrivileges)
 };
 
-constexpr QFile::Permissions everyoneMayEnter =
-    QFile::ReadOwner | QFile::ExeOwner | QFile::ReadGroup | QFile::ExeGroup | QFile::ReadOther | QFile::ExeOther;
-constexpr QFile::Permissions everyoneMayChange =
-    everyoneMayEnter | QFile::WriteOwner | QFile::WriteGroup | QFile::WriteOther;
-constexpr QFile::Permissions everyoneMayRead = QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther;
+constexpr QFile::Permissions everyoneMayEnter{QFile::ReadOwner | QFile::ExeOwner | QFile::ReadGroup | QFile::ExeGroup |
+                                              QFile::ReadOther | QFile::ExeOther};
+constexpr QFile::Permissions everyoneMayChange{everyoneMayEnter | QFile::WriteOwner | QFile::WriteGroup |
+                                               QFile::WriteOther};
+constexpr QFile::Permissions everyoneMayRead{QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther};
 
 QString defaultsFolder() { return QFileInfo{paths::serverDefaults()}.absolutePath(); }
 
 } // namespace
 
-class TestServedInterfaces : public QObject
+class ServedInterfacesTest final : public QObject
 {
     Q_OBJECT
 
@@ -90,11 +90,11 @@ private slots:
     void doesNotWriteOverDirectory();
 };
 
-void TestServedInterfaces::offersInterfacesOfTheMachine()
+void ServedInterfacesTest::offersInterfacesOfTheMachine()
 {
     Choice expected;
     for (const QNetworkInterface &interface : QNetworkInterface::allInterfaces()) {
-        const QList<QNetworkAddressEntry> addresses = interface.addressEntries();
+        const QList<QNetworkAddressEntry> addresses{interface.addressEntries()};
         const auto isIpv4 = [](const QNetworkAddressEntry &address) {
             return address.ip().protocol() == QAbstractSocket::IPv4Protocol;
         };
@@ -107,7 +107,7 @@ void TestServedInterfaces::offersInterfacesOfTheMachine()
     QCOMPARE(manager.interfaces(), expected);
 }
 
-void TestServedInterfaces::readsServedNames_data()
+void ServedInterfacesTest::readsServedNames_data()
 {
     QTest::addColumn<QByteArray>("content");
     QTest::addColumn<QStringList>("served");
@@ -158,20 +158,20 @@ void TestServedInterfaces::readsServedNames_data()
     row("Latin-1", "# B\xfcro\nINTERFACESv4=\"b\xfcro\"\n", names({"b\u00fcro"}));
 }
 
-void TestServedInterfaces::readsServedNames()
+void ServedInterfacesTest::readsServedNames()
 {
     QFETCH(const QByteArray, content);
     QFETCH(const QStringList, served);
-    const Choice expected = machineInterfacesAnd(served);
+    const Choice expected{machineInterfacesAnd(served)};
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), content);
     const DhcpServerManager manager;
     QCOMPARE(manager.interfaces(), expected);
 }
 
-void TestServedInterfaces::forgetsNamesThatTheFileNoLongerHas()
+void ServedInterfacesTest::forgetsNamesThatTheFileNoLongerHas()
 {
-    const Choice expected = machineInterfacesAnd({QStringLiteral("srv1")});
+    const Choice expected{machineInterfacesAnd({QStringLiteral("srv1")})};
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0\"\n");
     DhcpServerManager manager;
@@ -180,7 +180,7 @@ void TestServedInterfaces::forgetsNamesThatTheFileNoLongerHas()
     QCOMPARE(manager.interfaces(), expected);
 }
 
-void TestServedInterfaces::reportsUnreadableFile_data()
+void ServedInterfacesTest::reportsUnreadableFile_data()
 {
     QTest::addColumn<QString>("path");
     QTest::addRow("missing") << QStringLiteral("/etc/default/absent");
@@ -188,10 +188,10 @@ void TestServedInterfaces::reportsUnreadableFile_data()
     QTest::addRow("directory") << QStringLiteral("/etc/default");
 }
 
-void TestServedInterfaces::reportsUnreadableFile()
+void ServedInterfacesTest::reportsUnreadableFile()
 {
     QFETCH(const QString, path);
-    const Choice expected = machineInterfacesAnd({QStringLiteral("srv0")});
+    const Choice expected{machineInterfacesAnd({QStringLiteral("srv0")})};
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0\"\n");
     DhcpServerManager manager;
@@ -201,7 +201,7 @@ void TestServedInterfaces::reportsUnreadableFile()
     QCOMPARE(manager.interfaces(), expected);
 }
 
-void TestServedInterfaces::writesChoice_data()
+void ServedInterfacesTest::writesChoice_data()
 {
     QTest::addColumn<QByteArray>("before");
     QTest::addColumn<Choice>("choice");
@@ -209,9 +209,9 @@ void TestServedInterfaces::writesChoice_data()
     const auto row = [](const char *name, const QByteArray &before, const Choice &choice, const QByteArray &after) {
         QTest::addRow("%s", name) << before << choice << after;
     };
-    const QString a = QStringLiteral("srv0");
-    const QString b = QStringLiteral("srv1");
-    const QString c = QStringLiteral("srv2");
+    const QString a{QStringLiteral("srv0")};
+    const QString b{QStringLiteral("srv1")};
+    const QString c{QStringLiteral("srv2")};
     const QByteArray plain{"INTERFACESv4=\"x\"\n"};
     row("all", plain, {{a, true}, {b, true}}, "INTERFACESv4=\"srv0 srv1\"\n");
     row("none", plain, {{a, false}, {b, false}}, "INTERFACESv4=\"\"\n");
@@ -246,7 +246,7 @@ void TestServedInterfaces::writesChoice_data()
     row("Latin-1 stays", "# B\xfcro\nINTERFACESv4=\"\"\n", {{a, true}}, "# B\xfcro\nINTERFACESv4=\"srv0\"\n");
 }
 
-void TestServedInterfaces::writesChoice()
+void ServedInterfacesTest::writesChoice()
 {
     QFETCH(const QByteArray, before);
     QFETCH(const Choice, choice);
@@ -261,7 +261,7 @@ void TestServedInterfaces::writesChoice()
     QCOMPARE(errorsOf(errors), QStringList{});
 }
 
-void TestServedInterfaces::writesLinesThatItRead_data()
+void ServedInterfacesTest::writesLinesThatItRead_data()
 {
     QTest::addColumn<QByteArray>("content");
     QTest::addRow("ASCII") << QByteArray{"# x\n\n\tX=\"y z\"  \n"};
@@ -274,7 +274,7 @@ void TestServedInterfaces::writesLinesThatItRead_data()
     QTest::addRow("CR only") << QByteArray{"\r\r# x\r\n"};
 }
 
-void TestServedInterfaces::writesLinesThatItRead()
+void ServedInterfacesTest::writesLinesThatItRead()
 {
     QFETCH(const QByteArray, content);
     const TemporaryRoot root;
@@ -284,27 +284,27 @@ void TestServedInterfaces::writesLinesThatItRead()
     QCOMPARE(readTestFile(paths::serverDefaults()), content + "INTERFACESv4=\"srv0\"\n" + content);
 }
 
-void TestServedInterfaces::writesToAnotherPath()
+void ServedInterfacesTest::writesToAnotherPath()
 {
     const TemporaryRoot root;
     const QByteArray before{"X=1\nINTERFACESv4=\"srv0\"\n"};
     writeTestFile(paths::serverDefaults(), before);
     DhcpServerManager manager;
     manager.setInterfaces({{QStringLiteral("srv0"), true}});
-    const QString other = root.path(QStringLiteral("/etc/default/other"));
+    const QString other{root.path(QStringLiteral("/etc/default/other"))};
     manager.writeDHCPServerConfig(other);
     QCOMPARE(readTestFile(other), before);
     manager.writeDHCPServerConfig();
     QCOMPARE(readTestFile(paths::serverDefaults()), before);
 }
 
-void TestServedInterfaces::ignoresEmptyChoice()
+void ServedInterfacesTest::ignoresEmptyChoice()
 {
     const TemporaryRoot root;
     const QByteArray content{"INTERFACESv4=\"srv0  \"\n"};
     writeTestFile(paths::serverDefaults(), content);
     DhcpServerManager manager;
-    const Choice before = manager.interfaces();
+    const Choice before{manager.interfaces()};
     const QSignalSpy changes{&manager, &DhcpServerManager::interfacesChanged};
     manager.setInterfaces({});
     QCOMPARE(manager.interfaces(), before);
@@ -312,7 +312,7 @@ void TestServedInterfaces::ignoresEmptyChoice()
     QCOMPARE(readTestFile(paths::serverDefaults()), content);
 }
 
-void TestServedInterfaces::ignoresEqualChoice()
+void ServedInterfacesTest::ignoresEqualChoice()
 {
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0 srv1\"\n");
@@ -325,12 +325,12 @@ void TestServedInterfaces::ignoresEqualChoice()
     QCOMPARE(readTestFile(paths::serverDefaults()), meanwhile);
 }
 
-void TestServedInterfaces::announcesChangedChoice()
+void ServedInterfacesTest::announcesChangedChoice()
 {
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0\"\n");
     DhcpServerManager manager;
-    Choice choice = manager.interfaces();
+    Choice choice{manager.interfaces()};
     choice.insert(QStringLiteral("srv0"), false);
     const QSignalSpy changes{&manager, &DhcpServerManager::interfacesChanged};
     manager.setInterfaces(choice);
@@ -340,7 +340,7 @@ void TestServedInterfaces::announcesChangedChoice()
     QCOMPARE(readTestFile(paths::serverDefaults()), QByteArray{"INTERFACESv4=\"\"\n"});
 }
 
-void TestServedInterfaces::createsMissingFileWithoutTheChoice()
+void ServedInterfacesTest::createsMissingFileWithoutTheChoice()
 {
     const TemporaryRoot root;
     DhcpServerManager manager;
@@ -352,11 +352,11 @@ void TestServedInterfaces::createsMissingFileWithoutTheChoice()
     QCOMPARE(manager.interfaces(), choice);
 }
 
-void TestServedInterfaces::neverOverwritesFileThatItCouldNotRead()
+void ServedInterfacesTest::neverOverwritesFileThatItCouldNotRead()
 {
     const TemporaryRoot root;
     const QByteArray content{"INTERFACESv4=\"srv0\"\n"};
-    const QString path = paths::serverDefaults();
+    const QString path{paths::serverDefaults()};
     writeTestFile(path, content);
     QVERIFY(QFile::setPermissions(path, {}));
     QVERIFY(QFile::setPermissions(root.path({}), everyoneMayEnter | QFile::WriteOwner));
@@ -364,7 +364,7 @@ void TestServedInterfaces::neverOverwritesFileThatItCouldNotRead()
     {
         const WithoutPrivileges withoutPrivileges;
         DhcpServerManager manager;
-        const Choice before = manager.interfaces();
+        const Choice before{manager.interfaces()};
         const QSignalSpy errors{&manager, &DhcpServerManager::error};
         manager.setInterfaces({{QStringLiteral("srv1"), true}});
         QCOMPARE(errorsOf(errors), (QStringList{couldNotRead(path), couldNotWrite(path)}));
@@ -374,9 +374,9 @@ void TestServedInterfaces::neverOverwritesFileThatItCouldNotRead()
     QCOMPARE(readTestFile(path), content);
 }
 
-void TestServedInterfaces::neverOverwritesFileThatAppearedUnread()
+void ServedInterfacesTest::neverOverwritesFileThatAppearedUnread()
 {
-    const Choice expected = machineInterfacesAnd({QStringLiteral("srv0")});
+    const Choice expected{machineInterfacesAnd({QStringLiteral("srv0")})};
     const TemporaryRoot root;
     DhcpServerManager manager;
     const QSignalSpy errors{&manager, &DhcpServerManager::error};
@@ -386,20 +386,20 @@ void TestServedInterfaces::neverOverwritesFileThatAppearedUnread()
     QCOMPARE(errorsOf(errors), QStringList{couldNotWrite(paths::serverDefaults())});
     QCOMPARE(readTestFile(paths::serverDefaults()), content);
 
-    // The failure has read the file, so that the next choice can be written.
+    // The failure read the file again, so the next choice can be written.
     QCOMPARE(manager.interfaces(), expected);
     manager.setInterfaces({{QStringLiteral("srv1"), true}});
     QCOMPARE(readTestFile(paths::serverDefaults()), QByteArray{"# just installed\nINTERFACESv4=\"srv1\"\n"});
 }
 
-void TestServedInterfaces::givesChoiceUpWhenWriteFails()
+void ServedInterfacesTest::givesChoiceUpWhenWriteFails()
 {
     const TemporaryRoot root;
     const QByteArray content{"X=1\nINTERFACESv4=\"srv0\"\n"};
-    const QString path = paths::serverDefaults();
+    const QString path{paths::serverDefaults()};
     writeTestFile(path, content);
     DhcpServerManager manager;
-    const Choice before = manager.interfaces();
+    const Choice before{manager.interfaces()};
     QVERIFY(QFile::setPermissions(path, everyoneMayRead));
     QVERIFY(QFile::setPermissions(root.path({}), everyoneMayEnter | QFile::WriteOwner));
     QVERIFY(QFile::setPermissions(defaultsFolder(), everyoneMayEnter));
@@ -424,7 +424,7 @@ void TestServedInterfaces::givesChoiceUpWhenWriteFails()
     QCOMPARE(readTestFile(path), QByteArray{"X=1\nINTERFACESv4=\"srv1\"\n"});
 }
 
-void TestServedInterfaces::doesNotWriteOverDirectory()
+void ServedInterfacesTest::doesNotWriteOverDirectory()
 {
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0\"\n");
@@ -435,5 +435,5 @@ void TestServedInterfaces::doesNotWriteOverDirectory()
     QVERIFY(QFileInfo{defaultsFolder()}.isDir());
 }
 
-QTEST_GUILESS_MAIN(TestServedInterfaces)
+QTEST_GUILESS_MAIN(ServedInterfacesTest)
 #include "tst_servedinterfaces.moc"

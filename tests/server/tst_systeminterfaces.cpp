@@ -14,10 +14,10 @@ namespace {
 
 using Interfaces = QMap<QString, bool>;
 
-// Gives the process a network of its own, in which it may make interfaces; returns why not, empty when it has one.
+// Gives the process a network of its own, in which it may make interfaces. Returns why that failed, or an empty text.
 QString enterOwnNetwork()
 {
-    const uid_t user = getuid();
+    const uid_t user{getuid()};
     if (unshare(user == 0 ? CLONE_NEWNET : CLONE_NEWUSER | CLONE_NEWNET) == -1)
         return QStringLiteral("no network namespace: %1")
             .arg(QString::fromStdString(std::system_category().message(errno)));
@@ -26,11 +26,11 @@ QString enterOwnNetwork()
     return {};
 }
 
-// Runs `ip` with the words of `command`; returns what went wrong, empty when it succeeded.
+// Runs `ip` with the words of `command`. Returns what went wrong, or an empty text.
 QString ip(const QString &command)
 {
     QProcess process;
-    process.start(QStringLiteral("ip"), command.split(QLatin1Char(' ')));
+    process.start(QStringLiteral("ip"), command.split(QLatin1Char{' '}));
     if (process.waitForFinished(-1) && process.exitCode() == 0)
         return {};
     return QStringLiteral("ip %1: %2").arg(command, QString::fromLocal8Bit(process.readAllStandardError()));
@@ -39,12 +39,12 @@ QString ip(const QString &command)
 } // namespace
 
 // Virtual interfaces of every kind that matters, in a network that has none.
-class TestSystemInterfaces : public QObject
+class SystemInterfacesTest final : public QObject
 {
     Q_OBJECT
 
 public:
-    explicit TestSystemInterfaces(QString noOwnNetwork)
+    explicit SystemInterfacesTest(QString noOwnNetwork)
         : m_noOwnNetwork{std::move(noOwnNetwork)}
     {
     }
@@ -61,22 +61,22 @@ private:
     TemporaryRoot m_root;
 };
 
-void TestSystemInterfaces::initTestCase()
+void SystemInterfacesTest::initTestCase()
 {
     if (!m_noOwnNetwork.isEmpty())
         QSKIP(qPrintable(m_noOwnNetwork));
 }
 
-void TestSystemInterfaces::offersNothingWithoutInterfaces()
+void SystemInterfacesTest::offersNothingWithoutInterfaces()
 {
     QCOMPARE(ip(QStringLiteral("link set lo up")), QString{});
     QCOMPARE(collected(), Interfaces{});
 }
 
-void TestSystemInterfaces::offersInterfacesWithIpv4Address()
+void SystemInterfacesTest::offersInterfacesWithIpv4Address()
 {
     for (const char *link : {"link add up0 type veth peer name down0", "link add none0 type veth peer name six0"}) {
-        const QString refusal = ip(QString::fromLatin1(link));
+        const QString refusal{ip(QString::fromLatin1(link))};
         if (!refusal.isEmpty())
             QSKIP(qPrintable(refusal));
     }
@@ -94,7 +94,7 @@ void TestSystemInterfaces::offersInterfacesWithIpv4Address()
     QCOMPARE(collected(), marked);
 }
 
-Interfaces TestSystemInterfaces::collected() const
+Interfaces SystemInterfacesTest::collected() const
 {
     const DhcpServerManager manager;
     return manager.interfaces();
@@ -102,8 +102,8 @@ Interfaces TestSystemInterfaces::collected() const
 
 int main(int argc, char **argv)
 {
-    // First of all: a process that has threads cannot enter a namespace of its user's.
-    TestSystemInterfaces test{enterOwnNetwork()};
+    // First of all, since a process with threads cannot enter a user namespace.
+    SystemInterfacesTest test{enterOwnNetwork()};
     QCoreApplication application{argc, argv};
     return QTest::qExec(&test, argc, argv);
 }

@@ -6,5 +6,5 @@ bool ContextTranslator::isEmpty() const { return false; }
 QString ContextTranslator::translate(const char *context, const char *sourceText, const char * /*disambiguation*/,
                                      int /*n*/) const
 {
-    return QString::fromUtf8(context) + QLatin1Char('|') + QString::fromUtf8(sourceText);
+    return QString::fromUtf8(context) + QLatin1Char{'|'} + QString::fromUtf8(sourceText);
 }

@@ -11,17 +11,18 @@
 
 namespace {
 
-// Each verb has a folder beside the script: what to print on either channel, and the commands to end with. "status" is
-// a link to the folder of the present state, so that those commands can change it.
-constexpr const char *script = R"(#!/bin/sh
+// Each verb has a folder beside the script: the commands to begin with, what to print on either channel, and the
+// commands to end with. "status" is a link to the folder of the present state, so that those commands can change it.
+constexpr const char *script{R"(#!/bin/sh
 here=${0%/*}
 printf '%s\n' "$@" '' >>"$here/calls"
 while [ -e "$here/$1.held" ]; do sleep 0.01; done
 reply=$here/$1
+. "$reply/begin"
 [ ! -s "$reply/errors" ] || cat "$reply/errors" >&2
 [ ! -s "$reply/output" ] || cat "$reply/output"
 . "$reply/end"
-)";
+)"};
 
 struct Status
 {
@@ -141,20 +142,20 @@ FakeSystemctl::~FakeSystemctl() { qputenv("PATH", m_oldPath); }
 
 FakeSystemctl::Reply FakeSystemctl::statusReply(State state)
 {
-    const Status &status = statusOfStates.at(state);
+    const Status &status{statusOfStates.at(state)};
     return {status.output, status.errors, status.exitCode, {}, 0};
 }
 
 void FakeSystemctl::setState(State state)
 {
-    const QString link = filePath(QStringLiteral("status"));
+    const QString link{filePath(QStringLiteral("status"))};
     QFile::remove(link);
     QVERIFY(QFile::link(nameOf(state), link));
 }
 
 void FakeSystemctl::setReply(const QString &verb, const Reply &reply)
 {
-    const QString folder = QStringLiteral("reply-") + verb;
+    const QString folder{QStringLiteral("reply-") + verb};
     writeReply(folder, reply);
     QFile::remove(filePath(verb));
     QVERIFY(QFile::link(folder, filePath(verb)));
@@ -166,8 +167,8 @@ void FakeSystemctl::release(const QString &verb) { QVERIFY(QFile::remove(filePat
 
 void FakeSystemctl::setInstalled(bool installed)
 {
-    const QString program = filePath(QStringLiteral("systemctl"));
-    const QByteArray folder = QFile::encodeName(m_folder.path());
+    const QString program{filePath(QStringLiteral("systemctl"))};
+    const QByteArray folder{QFile::encodeName(m_folder.path())};
     if (installed) {
         writeTestFile(program, script);
         QVERIFY(QFile::setPermissions(program, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
@@ -186,7 +187,7 @@ QList<QStringList> FakeSystemctl::calls() const
         return calls; // not called yet
     QStringList arguments;
     while (!record.atEnd()) {
-        const QString argument = QString::fromLocal8Bit(record.readLine().chopped(1));
+        const QString argument{QString::fromLocal8Bit(record.readLine().chopped(1))};
         if (argument.isEmpty())
             calls.append(std::exchange(arguments, {}));
         else
@@ -209,6 +210,8 @@ void FakeSystemctl::writeReply(const QString &folder, const Reply &reply)
 {
     QVERIFY(QDir{}.mkpath(filePath(folder)));
     const QDir replyFolder{filePath(folder)};
+    writeTestFile(replyFolder.filePath(QStringLiteral("begin")),
+                  reply.seconds ? "sleep " + QByteArray::number(reply.seconds) : QByteArray{});
     writeTestFile(replyFolder.filePath(QStringLiteral("output")), reply.output);
     writeTestFile(replyFolder.filePath(QStringLiteral("errors")), reply.errors);
     QString end;

@@ -32,6 +32,7 @@ public:
         int exitCode{};             ///< how it exits
         std::optional<State> state; ///< the state of the service from then on; none: as before
         int signal{};               ///< the signal that it kills itself with instead of exiting
+        int seconds{};              ///< how long it takes before it answers
     };
 
     /// The service is in `state`; start, stop and restart succeed.

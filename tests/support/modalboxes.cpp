@@ -16,8 +16,8 @@ namespace {
 
 void failTest(const QString &failure) { QTest::qFail(qPrintable(failure), __FILE__, __LINE__); }
 
-/// Whether the window, about to be shown, keeps its opener waiting. Submenus and a menu bar's menus after the first are
-/// part of what is open already.
+/// Whether the window, about to be shown, makes the code that opened it wait. Submenus and a menu bar's menus after the
+/// first belong to a menu that is open already.
 bool isModal(const QWidget *window)
 {
     if (qobject_cast<const QMenu *>(window))
@@ -60,7 +60,7 @@ QMessageBox::StandardButton defaultButton(const QMessageBox &box)
     return found == buttons.cend() ? QMessageBox::NoButton : box.standardButton(*found);
 }
 
-/// A value as a failure shows it.
+/// A value as the message of a failure shows it.
 QString shown(const QString &text) { return QLatin1Char{'"'} + text + QLatin1Char{'"'}; }
 QString shown(QMessageBox::Icon icon) { return QVariant::fromValue(icon).toString(); }
 QString shown(QMessageBox::StandardButtons buttons)
@@ -82,7 +82,8 @@ ModalBoxes::~ModalBoxes() { verify(); }
 void ModalBoxes::expectBox(const Box &box, QMessageBox::StandardButton answer)
 {
     expectBox(box, [this, answer](QMessageBox *shownBox) {
-        if (QAbstractButton *button = shownBox->button(answer))
+        QAbstractButton *button{shownBox->button(answer)};
+        if (button)
             QTest::mouseClick(button, Qt::LeftButton);
         else
             m_report(QStringLiteral("%1 has no such button to press: %2").arg(described(*shownBox), shown(answer)));
@@ -161,7 +162,7 @@ bool ModalBoxes::eventFilter(QObject *watched, QEvent *event)
     if (event->type() == QEvent::Show && !event->spontaneous() && watched->isWidgetType()) {
         auto *window = static_cast<QWidget *>(watched);
         if (window->isWindow() && isModal(window)) {
-            // Not before the window runs its event loop: what closes it earlier is undone by showing it.
+            // Not before the window runs its event loop: showing it would undo an earlier closing.
             ++m_open;
             QMetaObject::invokeMethod(
                 this,

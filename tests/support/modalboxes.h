@@ -48,11 +48,11 @@ public:
         QString informativeText{};
         QString detailedText{};
     };
-    /// Takes the account of a failure. By default it fails the running test function.
+    /// Called with the message of a failure; by default it fails the running test function.
     using Report = std::function<void(const QString &failure)>;
 
     explicit ModalBoxes(Report report = {});
-    /// Verifies.
+    /// Calls verify().
     ~ModalBoxes() override;
     Q_DISABLE_COPY_MOVE(ModalBoxes)
 
@@ -60,14 +60,14 @@ public:
     void expectBox(const Box &box, QMessageBox::StandardButton answer);
     /// The next is a message box like `box`, answered by the key (Return presses its default button, Escape leaves it).
     void expectBox(const Box &box, Qt::Key answer);
-    /// The next is a dialog of the class, handed to `use`.
+    /// The next is a dialog of the class, passed to `use`.
     template<typename Dialog>
     void expectDialog(const std::function<void(Dialog *dialog)> &use)
     {
         expect(Dialog::staticMetaObject, QString::fromLatin1(Dialog::staticMetaObject.className()),
                [use](QWidget *window) { use(static_cast<Dialog *>(window)); });
     }
-    /// The next is a file dialog, in which the path is typed and taken with the mouse.
+    /// The next is a file dialog, in which the path is typed and accepted with the mouse.
     void expectFileDialog(const QString &path);
     /// The next is a context menu; the action with the text is triggered with the mouse.
     void expectMenu(const QString &actionText);

@@ -36,8 +36,8 @@ QString complaintOf(const QString &dhcpd, const QByteArray &configuration)
     const bool hasExited{process.waitForFinished(-1) && process.exitStatus() == QProcess::NormalExit};
     if (hasExited && process.exitCode() == 0)
         return {};
-    const auto output = QString::fromUtf8(process.readAll());
+    const QString output{QString::fromUtf8(process.readAll())};
     const QRegularExpression complaint{QRegularExpression::escape(file) + QStringLiteral(" (line [0-9]+: .*)")};
-    const auto match = complaint.match(output);
+    const QRegularExpressionMatch match{complaint.match(output)};
     return match.hasMatch() ? match.captured(1) : process.errorString() + output;
 }

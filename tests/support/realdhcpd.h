@@ -9,5 +9,5 @@
 QString realDhcpd();
 
 /// What `dhcpd`, the path of a DHCP server, first complains about in a configuration, as "line 3: expecting
-/// semicolon."; empty when it accepts it. Its whole output when it could not judge, and so no line is to blame.
+/// semicolon."; empty when it accepts it. Its whole output when it gave no verdict that names a line.
 QString complaintOf(const QString &dhcpd, const QByteArray &configuration);

@@ -29,7 +29,7 @@ public:
 
     bool isInstalled() const { return m_installed; }
 
-    /// That of the program, and that of Qt.
+    /// The program's, and Qt's own.
     static std::unique_ptr<Language> program(const QString &locale)
     {
         return std::make_unique<Language>(locale, QStringLiteral("orv-admin-dhcp"), QStringLiteral(":/i18n"));
@@ -55,7 +55,7 @@ QStringList textsOf(const QList<QAction *> &actions)
     return texts;
 }
 
-/// Fails the test when two of the actions answer to the same letter.
+/// Fails the test when two of the actions have the same mnemonic.
 void compareLetters(const QList<QAction *> &actions)
 {
     QMap<QString, QString> texts;
@@ -70,7 +70,7 @@ void compareLetters(const QList<QAction *> &actions)
 
 } // namespace
 
-/// The window, and Qt's boxes, as somebody sees them whose language is German.
+/// The window, and Qt's boxes, as somebody with a German desktop sees them.
 class GermanInterfaceTest final : public QObject
 {
     Q_OBJECT

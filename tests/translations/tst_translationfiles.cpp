@@ -39,7 +39,7 @@ QVector<Message> messagesOf(const QString &path)
         } else if (xml.name() == QLatin1String{"source"}) {
             messages.append({context, xml.readElementText(), {}});
         } else if (xml.name() == QLatin1String{"translation"}) {
-            Message &message = messages.last();
+            Message &message{messages.last()};
             message.finished = !xml.attributes().hasAttribute(QLatin1String{"type"});
             message.translation = xml.readElementText();
         }
@@ -58,11 +58,11 @@ QStringList namesOf(const QVector<Message> &messages)
     return names;
 }
 
-/// What `pattern` matches in `text`, in the order of the alphabet: languages put their words in different orders.
+/// What `pattern` matches in `text`, sorted, since languages differ in the order of their words.
 QStringList matchesOf(const char *pattern, const QString &text)
 {
     QStringList matches;
-    auto each = QRegularExpression{QLatin1String{pattern}}.globalMatch(text);
+    QRegularExpressionMatchIterator each{QRegularExpression{QLatin1String{pattern}}.globalMatch(text)};
     while (each.hasNext())
         matches.append(each.next().captured());
     matches.sort();
@@ -156,7 +156,7 @@ void TranslationFilesTest::textsComeOutInGerman_data()
     row("OrvHelpMenu", "&Help", "&Hilfe");
     row("DhcpdConfigStatement", "All network", "Gesamtes Netzwerk");
     row("DhcpdConfigStatement", "Range", "Adressbereich");
-    // Beside large numbers in the code, where lupdate can miss them.
+    // Next to large numbers in the code, where lupdate can miss them.
     row("DhcpdConfigStatement", " mounth ", " Monat(e) ");
     row("DhcpdConfigStatement", " days ", " Tag(e) ");
     row("DhcpdConfigStatement", " hours ", " Std. ");
@@ -183,7 +183,7 @@ void TranslationFilesTest::englishIsFoundAndChangesNothing()
 {
     QVERIFY(QFile::exists(QStringLiteral(":/i18n/orv-admin-dhcp_en.qm")));
     QTranslator translator;
-    // Whether Qt calls an empty translation loaded is its own affair.
+    // Whether Qt calls an empty translation loaded does not matter.
     translator.load(QLocale{QStringLiteral("en_US")}, QStringLiteral("orv-admin-dhcp"), QStringLiteral("_"),
                     QStringLiteral(":/i18n"));
     QVERIFY(translator.isEmpty());

@@ -5,13 +5,13 @@
 #include <QDialogButtonBox>
 #include <QTest>
 
-/// What the tests of the dialogs have in common: they find widgets by name and drive them with real events.
+/// Finds the widgets of dialogs and drives them with real events.
 namespace driver {
 
-/// Shows the dialog, active and with its focus; fails the test when that does not come about.
+/// Shows the dialog; fails the test unless it becomes active and a widget gets the focus.
 void open(QDialog &dialog);
 
-/// The widget of the class and name; an empty name stands for the only one of the class. Fails the test without it.
+/// The widget of the class and name, or of the class alone where the name is empty; ends the test without one.
 template<typename Widget>
 Widget *find(const QWidget &parent, const QString &name = {})
 {
@@ -21,9 +21,9 @@ Widget *find(const QWidget &parent, const QString &name = {})
     return widget;
 }
 
-/// Types over what the focused widget holds.
+/// Replaces what the focused widget holds.
 void retype(const QString &text);
-/// The key to the focused widget.
+/// Presses the key in the focused widget.
 void press(Qt::Key key, Qt::KeyboardModifiers modifiers = {});
 void click(QWidget *widget);
 /// Clicks a button of the dialog's button box.

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
-#include "tests/dialogs/dialogdriver.h"
+#include "tests/support/dialogdriver.h"
 
 #include <QApplication>
 #include <QPushButton>
@@ -30,7 +30,7 @@ void click(QWidget *widget) { QTest::mouseClick(widget, Qt::LeftButton); }
 
 void click(const QDialog &dialog, QDialogButtonBox::StandardButton button)
 {
-    click(find<QDialogButtonBox>(dialog, QStringLiteral("buttonBox"))->button(button));
+    click(find<QDialogButtonBox>(dialog)->button(button));
 }
 
 } // namespace driver
