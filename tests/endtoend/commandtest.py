@@ -1,8 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """What the tests of the commands of the topology tree's context menus have in common.
 
-A test is a table of commands: where each is chosen, what its dialog shows and is told, what comes of it in the tree and
-in the file. A menu with an entry that no row of the tables chooses fails.
+A test is a table of commands: where each is chosen, what its dialog shows and what is typed there, and the result in
+the tree and in the file.
 """
 
 import dataclasses
@@ -252,7 +252,7 @@ def changes(before, after):
 
 
 class CommandTest(ProgramTest):
-    """Runs commands one after the other in one program. What they make is saved in the end, and then judged."""
+    """Runs commands one after the other in one program. The result is saved in the end and checked by the server."""
 
     SITE = ""
 

@@ -89,7 +89,7 @@ class StoppedServer(ServiceTest):
             self.main.button(START).click()
             self.wait(lambda: self.server_state == "Updating DHCP-server status...", "the start under way")
             self.assertFalse(self.main.button(START).is_enabled)
-            self.main.press("ctrl+r")  # which the disabled command does not heed
+            self.main.press("ctrl+r")  # which does nothing while the command is disabled
             self.main.button(RESTART).click()
             self.message("Error", "Some operation with DHCP-server already executes").answer("OK")
             self.assertEqual(machine.server_command(), [])

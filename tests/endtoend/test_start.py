@@ -131,6 +131,18 @@ class SecondStart(ProgramTest):
         self.assertEqual(len(self.tree.rows), len(SITE.splitlines()))
 
 
+class StartInGerman(ProgramTest):
+    def start(self):
+        self.launch(LC_ALL="de_DE.UTF-8")
+        self.main = self.program.window("DHCP-Server konfigurieren")
+
+    def test_speaks_german_throughout(self):
+        self.main.press("F5")
+        question = "Möchten Sie die Konfiguration neu aus der Datei laden?"
+        # The texts of the buttons are not the program's own but Qt's.
+        self.message("Information", question, buttons=["Ja", "Nein"], default="Ja").answer("Nein")
+
+
 class StartWithoutConfiguration(ProgramTest):
     def prepare(self):
         machine.CONFIGURATION.unlink()

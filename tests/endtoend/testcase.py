@@ -38,9 +38,9 @@ class DesktopTest(unittest.TestCase):
             if name.startswith("test"):
                 setattr(cls, name, keeping_picture(test))
 
-    def launch(self):
+    def launch(self, **environment):
         """Starts the program for as long as the test."""
-        self.program = desktop.Program()
+        self.program = desktop.Program(environment=environment)
         self.addCleanup(self.program.end)
 
     def finish(self):
