@@ -247,7 +247,6 @@ zone 30.20.10.in-addr.arpa. {
 
 CANCELLED_FIRST = (
     ("Add host",),
-    ("Add static route",),
     ("Add arbitrary declaration",),
     option("Add DHCP dynamic zone update"),
 )

@@ -87,7 +87,7 @@ host camera {
 """
 
 CAMERA = ROOT.below("Host: camera", "host camera")
-CANCELLED_FIRST = ("Shared network", "Gateways", "class")
+CANCELLED_FIRST = ("Shared network", "class")
 REMOVED = ("Shared network: attic", "Range: 10.1.0.10", "Gateways", "MAC address: 00:11:22:33:44:77")
 BLOCKS = (
     "All network",
