@@ -486,7 +486,6 @@ void LeaseCommandsTest::reservationLeavesOutSyntax_data()
     QTest::addRow("comment") << QByteArray{"pc#1"} << QStringLiteral("pc1");
     QTest::addRow("quotes") << QByteArray{R"(\"pc\")"} << QStringLiteral(R"(\pc\)");
     QTest::addRow("tab") << QByteArray{"p\tc"} << QStringLiteral("pc");
-    QTest::addRow("carriage return") << QByteArray{"p\rc"} << QStringLiteral("pc");
     QTest::addRow("lowest control characters") << QByteArray{"p\x01\x02"
                                                              "c"}
                                                << QStringLiteral("pc");
@@ -580,7 +579,7 @@ void LeaseCommandsTest::rowsAreAsTallAsALine()
     for (int row{0}; row < 4; ++row) {
         QCOMPARE(site.table->rowHeight(row), site.table->rowHeight(0));
         QVERIFY(site.table->rowHeight(row) >= line);
-        QVERIFY(site.table->rowHeight(row) < line + line / 2);
+        QVERIFY(site.table->rowHeight(row) < line + line / 3);
     }
 }
 

@@ -615,7 +615,8 @@ void MainWindowTest::headersOfTheTree()
 
 void MainWindowTest::rowsOfTheTreeAreEquallyTall()
 {
-    writeTestFile(paths::configuration(), configuration + "option motd \"one\ntwo\nthree\nfour\";\n");
+    // With the sign that Unicode has for a line break.
+    writeTestFile(paths::configuration(), configuration + "option motd \"one\xe2\x80\xa8two\xe2\x80\xa8three\";\n");
     const auto window = m_machine->openWindow();
     const QTreeView *tree{treeOf(*window)};
     const QRect first{tree->visualRect(indexOf(tree, root))};

@@ -222,8 +222,7 @@ void InterfacesDialogTest::scrollsBeyondTwoThirdsOfTheScreen()
         };
         QCOMPARE(std::all_of(checkBoxes.begin(), checkBoxes.end(), isVisible), count == longest);
         const auto *area = dialog.findChild<QScrollArea *>();
-        QCOMPARE(area && area->verticalScrollBar()->isVisible() && area->verticalScrollBar()->maximum() > 0,
-                 count > longest);
+        QCOMPARE(area && area->verticalScrollBar()->isVisible(), count > longest);
     }
 }
 
