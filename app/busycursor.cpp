@@ -7,7 +7,7 @@
 
 namespace {
 
-constexpr qint64 momentaryBytes = qint64{4} << 20U;
+constexpr qint64 momentaryBytes{qint64{4} << 20U};
 
 } // namespace
 

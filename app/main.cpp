@@ -13,9 +13,9 @@
 
 namespace {
 
-constexpr const char *version = "2.1.6+ci1";
-constexpr const char *description = QT_TRANSLATE_NOOP("OrvHelpMenu", "Configure DHCP server");
-constexpr int raiseMilliseconds = 5000;
+constexpr const char *version{"2.1.6+ci1"};
+constexpr const char *description{QT_TRANSLATE_NOOP("OrvHelpMenu", "Configure DHCP server")};
+constexpr int raiseMilliseconds{5000};
 
 void installTranslator(QTranslator *translator, const QString &name, const QString &directory)
 {

@@ -6,7 +6,7 @@
 
 namespace {
 
-constexpr int burstMilliseconds = 100;
+constexpr int burstMilliseconds{100};
 
 void unwatch(QFileSystemWatcher *watcher)
 {
