@@ -6,11 +6,15 @@
 #include <QProcess>
 #include <QStandardPaths>
 
+#include <csignal>
 #include <utility>
 
 #include <fcntl.h>
+#include <sys/prctl.h>
 
 namespace {
+
+constexpr int longestOutput{64 * 1024};
 
 QString findServer()
 {
@@ -37,11 +41,18 @@ public:
     Q_DISABLE_COPY_MOVE(CheckProcess)
 
 protected:
-    void setupChildProcess() override { fcntl(m_file.get(), F_SETFD, 0); }
+    void setupChildProcess() override
+    {
+        fcntl(m_file.get(), F_SETFD, 0);
+        prctl(PR_SET_PDEATHSIG, SIGKILL); // a server that hangs goes with the program, however that ends
+    }
 
 private:
     FileDescriptor m_file;
 };
+
+/// What a complaint of the server about a line of the text begins with.
+QString lineOf(const QString &candidate) { return candidate + QStringLiteral(" line "); }
 
 /// The first line of the server's output that says what is wrong: behind its banner, and no warning.
 QString firstComplaint(const QString &output, const QString &candidate)
@@ -54,7 +65,7 @@ QString firstComplaint(const QString &output, const QString &candidate)
             break;
         }
     }
-    const QString place{candidate + QStringLiteral(" line ")};
+    const QString place{lineOf(candidate)};
     for (const QString &line : qAsConst(lines)) {
         if (line.startsWith(place))
             return ConfigCheck::tr("line %1").arg(line.mid(place.size()));
@@ -95,17 +106,28 @@ void ConfigCheck::start(const QByteArray &content)
     m_process = new CheckProcess{std::move(file), parent()};
     m_process->setProcessChannelMode(QProcess::MergedChannels);
     m_process->setStandardInputFile(QProcess::nullDevice());
+    connect(m_process, &QProcess::readyRead, this, &ConfigCheck::readOutput);
     connect(m_process, qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this, &ConfigCheck::readVerdict);
     m_process->start(server, {QStringLiteral("-t"), QStringLiteral("-cf"), m_candidate});
 }
 
+void ConfigCheck::readOutput()
+{
+    m_output += m_process->read(longestOutput - m_output.size());
+    if (m_output.size() == longestOutput)
+        m_process->kill();
+}
+
 void ConfigCheck::readVerdict()
 {
-    if (m_process->exitStatus() != QProcess::NormalExit || m_process->exitCode() == 0)
-        return;
-    const QString output{QString::fromUtf8(m_process->readAll())};
+    readOutput();
+    const QString output{QString::fromUtf8(m_output)};
     const QString complaint{firstComplaint(output, m_candidate)};
+    // A server that was ended because it has so much to say has refused the text if it complains of a line.
+    const bool isRefused{m_process->exitStatus() == QProcess::NormalExit
+                             ? m_process->exitCode() != 0
+                             : m_output.size() == longestOutput && output.contains(lineOf(m_candidate))};
     // That the server cannot read the text is no verdict on it.
-    if (!complaint.isEmpty() && !complaint.startsWith(QStringLiteral("Can't open ") + m_candidate))
+    if (isRefused && !complaint.isEmpty() && !complaint.startsWith(QStringLiteral("Can't open ") + m_candidate))
         emit refused(complaint, output);
 }

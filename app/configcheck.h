@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include <QByteArray>
 #include <QObject>
+#include <QString>
 
 class QProcess;
 
@@ -23,13 +25,15 @@ public:
     void start(const QByteArray &content);
 
 signals:
-    /// The server refuses the configuration: its first complaint, with the line where it names one, and all that it
-    /// said.
+    /// The server refuses the configuration: its first complaint, with the line where it names one, and what it said,
+    /// which is not read to the end where it is very long.
     void refused(const QString &complaint, const QString &output);
 
 private:
+    void readOutput();
     void readVerdict();
 
     QProcess *m_process{};
+    QByteArray m_output;
     QString m_candidate; // the path under which the child finds the text
 };

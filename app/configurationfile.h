@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include "common/filestamp.h"
+
 #include <QByteArray>
 #include <QObject>
 
@@ -35,8 +37,9 @@ public:
 
     /// Reads the file anew.
     void reload();
-    /// Asks whether to write the model over the file, and tells if the server refuses it; writes it and reads it again.
-    /// The model reports a failure.
+    /// Asks whether to write the model over the file, and tells what a save loses and whether the server refuses it;
+    /// writes it and reads it again. A file that changes meanwhile is not written over before that is asked again. The
+    /// model reports a failure.
     SaveResult save();
 
 public slots:
@@ -48,13 +51,17 @@ signals:
     void reloaded();
 
 private:
-    bool askToWrite(const QByteArray &content);
+    bool askToWrite(const QByteArray &content, bool tellsLosses);
+    /// What the text of the file holds that the model does not keep, in words for the user.
+    QString losses() const;
     /// Writes without noticing that as a change; false, with the system's `reason`, when that failed.
     bool write(const QByteArray &content, QString *reason);
 
     DhcpdConfigModel *m_model;
     QWidget *m_window;
-    PathWatch *m_watch; // the window's
+    PathWatch *m_watch;    // the window's
+    FileStamp m_readStamp; // of the file that the model holds
+    bool m_isOwnText{};    // whether a save wrote that, so that the next one loses nothing
     bool m_ignoreNextChange{};
     bool m_changedOutside{};
 };

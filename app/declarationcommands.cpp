@@ -1,12 +1,14 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/declarationcommands.h"
 
+#include "app/commandguard.h"
 #include "app/reservation.h"
 #include "app/statementcommands.h"
 #include "common/paths.h"
 #include "config/bind9reader.h"
 #include "config/dhcpdconfigdeclaration.h"
 #include "config/dhcpdconfigmodel.h"
+#include "config/staticroutes.h"
 #include "config/values.h"
 #include "dialogs/hostinputdialog.h"
 #include "dialogs/ipinputdialog.h"
@@ -46,6 +48,20 @@ const Statement *firstChild(const Statement &declaration, bool (*isKind)(const S
     return nullptr;
 }
 
+/// Whether `text` is one address and all that a fixed address says: it may say several, or names.
+bool isAddress(const Statement &fixedAddress, const QString &text)
+{
+    return values::isValue(fixedAddress, 1, text) && values::usableAddress(text);
+}
+
+int countOf(const Statement &declaration, bool (*isKind)(const Statement &))
+{
+    int count{};
+    for (int row{0}; row < declaration.childCount(); ++row)
+        count += isKind(*declaration.child(row)) ? 1 : 0;
+    return count;
+}
+
 /// The position of the word that holds the first address of `range`.
 int firstAddressOf(const Statement &range) { return values::rangeFlag(range).isEmpty() ? 1 : 2; }
 
@@ -58,8 +74,7 @@ void DeclarationCommands::addArbitrary()
 
 void DeclarationCommands::editArbitrary()
 {
-    m_commands.editAsText(tr("Edit arbitrary declaration"), tr("Declaration:"),
-                          declarationOf<&Statement::isDeclaration>);
+    m_commands.editAsText(tr("Edit arbitrary declaration"), declarationOf<&Statement::isDeclaration>);
 }
 
 void DeclarationCommands::addSharedNetwork()
@@ -74,8 +89,12 @@ void DeclarationCommands::editSharedNetwork()
     SharedNetworkInputDialog dialog{m_commands.window()};
     m_commands.editValue(
         tr("Edit shared network"), dialog, declarationOf<&Statement::isSharedNetwork>,
-        [&dialog](const Statement &network) { dialog.setName(network.textFrom(1)); },
-        [&dialog] { return values::quotedIfSpaced(dialog.name()); });
+        [&dialog](const Statement &network) { dialog.setName(values::unquoted(network.textFrom(1))); },
+        [&dialog] { return values::quotedIfSpaced(dialog.name()); },
+        [&dialog](const Statement &network) {
+            const QString name{dialog.name()};
+            return values::isValue(network, 1, name) || values::isValue(network, 1, values::quoted(name));
+        });
 }
 
 void DeclarationCommands::addSubnet()
@@ -96,7 +115,12 @@ void DeclarationCommands::editSubnet()
             dialog.setAddress(subnet.word(1));
             dialog.setNetmask(subnet.word(3));
         },
-        [&dialog] { return values::subnetText(dialog.address(), dialog.netmask()); });
+        [&dialog] { return values::subnetText(dialog.address(), dialog.netmask()); },
+        [&dialog](const Statement &subnet) {
+            const QString mask{dialog.netmask()};
+            return values::isValue(
+                subnet, 1, mask.isEmpty() ? dialog.address() : dialog.address() + QLatin1String{" netmask "} + mask);
+        });
 }
 
 void DeclarationCommands::addRange()
@@ -129,12 +153,11 @@ void DeclarationCommands::editRange()
         words.insert(1, flag);
         model.replaceWords(index, words);
     };
-    m_commands.edit(tr("Edit range"), dialog, declarationOf<&Statement::isRange>,
-                    {fill,
-                     [&dialog] {
-                         return QStringList{dialog.startIp(), dialog.endIp()};
-                     }},
-                    store);
+    const auto addresses = [&dialog] { return QStringList{dialog.startIp(), dialog.endIp()}; };
+    const auto showsAll = [&addresses](const Statement &range) {
+        return values::isValue(range, firstAddressOf(range), addresses().join(QLatin1Char{' '}).trimmed());
+    };
+    m_commands.edit(tr("Edit range"), dialog, declarationOf<&Statement::isRange>, {fill, addresses, showsAll}, store);
 }
 
 void DeclarationCommands::addHost()
@@ -165,44 +188,52 @@ void DeclarationCommands::editHost()
         dialog.setMac(hardware ? hardware->word(2) : values::noMacAddress());
         dialog.setIp(fixedAddress ? fixedAddress->textFrom(1) : QString{});
     };
-    const auto fields = [&dialog] {
-        return QStringList{values::quotedIfSpaced(dialog.name()), dialog.mac(), dialog.ip()};
+    const auto fields = [&dialog] { return QStringList{dialog.name(), dialog.mac(), dialog.ip()}; };
+    const auto showsAll = [&](const Statement &host) {
+        const Statement *hardware{firstChild(host, isHardware)};
+        const Statement *fixedAddress{firstChild(host, isFixedAddress)};
+        return values::isValue(host, 1, dialog.name()) && countOf(host, isHardware) <= 1 &&
+               countOf(host, isFixedAddress) <= 1 && (!hardware || values::isValue(*hardware, 2, dialog.mac())) &&
+               (!fixedAddress || isAddress(*fixedAddress, dialog.ip()));
     };
     const auto store = [&](const QModelIndex &index, const QStringList &now, const QStringList &shown) {
         DhcpdConfigModel &model{m_commands.model()};
-        const Statement &host{*model.statementFor(index)};
-        const auto setValue = [&model](const Statement &statement, const QString &text) {
-            model.setData(model.indexOf(statement, 1), text, Qt::EditRole);
+        // A refusal is told in a box, and while that is open the host may go.
+        const QPersistentModelIndex host{index};
+        const auto setValue = [&](Field field, const Statement *statement) {
+            if (statement && now.at(field) != shown.at(field))
+                model.setData(model.indexOf(*statement, 1), now.at(field), Qt::EditRole);
+            return host.isValid();
         };
-        if (now.at(Name) != shown.at(Name))
-            setValue(host, now.at(Name));
-        if (const Statement * hardware{firstChild(host, isHardware)}; hardware && now.at(Mac) != shown.at(Mac))
-            setValue(*hardware, now.at(Mac));
-        if (now.at(Address) == shown.at(Address))
+        const auto child = [&](bool (*isKind)(const Statement &)) {
+            return firstChild(*model.statementFor(host), isKind);
+        };
+        if (!setValue(Name, model.statementFor(host)) || !setValue(Mac, child(isHardware)))
             return;
-        const QModelIndex hostIndex{index.siblingAtColumn(0)};
-        if (const Statement * fixedAddress{firstChild(host, isFixedAddress)})
-            setValue(*fixedAddress, now.at(Address));
-        else
-            m_commands.addTo(hostIndex, [&] { model.addFixedAddress(now.at(Address), hostIndex); });
+        const Statement *fixedAddress{child(isFixedAddress)};
+        setValue(Address, fixedAddress);
+        if (!fixedAddress && now.at(Address) != shown.at(Address)) {
+            const QModelIndex parent{host.sibling(host.row(), 0)};
+            m_commands.addTo(parent, [&] { model.addFixedAddress(now.at(Address), parent); });
+        }
     };
-    m_commands.edit(tr("Edit host"), dialog, declarationOf<&Statement::isHost>, {fill, fields}, store);
+    m_commands.edit(tr("Edit host"), dialog, declarationOf<&Statement::isHost>, {fill, fields, showsAll}, store);
 }
 
 bool DeclarationCommands::reserve(const Reservation &lease)
 {
     // Without a configuration there is nothing that the host could be added to.
     DhcpdConfigModel &model{m_commands.model()};
-    const QModelIndex network{model.index(0, 0)};
-    if (!network.isValid())
+    const QPersistentModelIndex network{model.index(0, 0)};
+    if (!network.isValid() || !mayStartCommand())
         return false;
     HostInputDialog dialog{m_commands.window()};
     dialog.setWindowTitle(tr("Reserve an IP address"));
     dialog.setIp(lease.address);
     dialog.setMac(lease.mac);
-    dialog.setName(values::withoutSyntax(lease.hostName));
+    dialog.setName(values::hostName(lease.hostName));
     dialog.adjustSize();
-    if (dialog.exec() != QDialog::Accepted)
+    if (dialog.exec() != QDialog::Accepted || !network.isValid())
         return false;
 
     m_commands.addTo(
@@ -226,37 +257,39 @@ void DeclarationCommands::editFixedAddress()
     m_commands.editValue(
         tr("Edit fixed address"), dialog, declarationOf<&Statement::isFixedAddress>,
         [&dialog](const Statement &fixedAddress) { dialog.setIp(fixedAddress.textFrom(1)); },
-        [&dialog] { return dialog.ip(); });
+        [&dialog] { return dialog.ip(); },
+        [&dialog](const Statement &fixedAddress) { return isAddress(fixedAddress, dialog.ip()); });
 }
 
 void DeclarationCommands::addStaticRoute()
 {
     StaticRouteInputDialog dialog{m_commands.window()};
     m_commands.add(tr("Add static route"), dialog, [&](const QModelIndex &parent) {
-        m_commands.model().addStaticRoutes(dialog.routes(), dialog.isMsRoute(), parent);
+        m_commands.model().addRoutes(staticroutes::fromDialog(dialog.routes()), dialog.isMsRoute(), parent);
     });
 }
 
 void DeclarationCommands::editStaticRoute()
 {
     if (values::isDefinition(m_commands.currentStatement())) {
-        m_commands.editAsText(tr("Edit static route"), tr("Parameter:"), isRoute);
+        m_commands.editAsText(tr("Edit static route"), isRoute);
         return;
     }
     StaticRouteInputDialog dialog{m_commands.window()};
+    const auto value = [&dialog] { return values::routeList(staticroutes::fromDialog(dialog.routes())); };
     m_commands.editValue(
         tr("Edit static route"), dialog, isRoute,
         [&dialog](const Statement &option) {
-            dialog.setRoutes(option.textFrom(2), option.isMsStaticRoute());
+            dialog.setRoutes(staticroutes::toDialog(option.textFrom(2)), option.isMsStaticRoute());
             dialog.lockMsRoute();
         },
-        [&dialog] { return values::routeList(dialog.routes()); });
+        value, [&value](const Statement &option) { return staticroutes::areSame(option.textFrom(2), value()); });
 }
 
 void DeclarationCommands::addBind9Settings()
 {
-    const QModelIndex parent{m_commands.currentDeclaration()};
-    if (!parent.isValid())
+    const QPersistentModelIndex parent{m_commands.currentDeclaration()};
+    if (!parent.isValid() || !mayStartCommand())
         return;
     QWidget *window{m_commands.window()};
     const auto answer = QMessageBox::information(
@@ -266,7 +299,7 @@ void DeclarationCommands::addBind9Settings()
         return;
     const QString file{QFileDialog::getOpenFileName(window, tr("Choose the bind9 configuration with the update key"),
                                                     QFileInfo{paths::bind9LocalConfiguration()}.absolutePath())};
-    if (file.isEmpty())
+    if (file.isEmpty() || !parent.isValid())
         return;
     DhcpdConfigModel &model{m_commands.model()};
     m_commands.addTo(

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/fmain.h"
 
+#include "app/commandguard.h"
 #include "app/configurationfile.h"
 #include "app/leasepage.h"
+#include "app/plainmessagebox.h"
 #include "app/servicecontrols.h"
 #include "app/topologypage.h"
 #include "common/fileio.h"
@@ -14,7 +16,6 @@
 
 #include <QCloseEvent>
 #include <QGuiApplication>
-#include <QMessageBox>
 #include <QSettings>
 
 namespace {
@@ -93,7 +94,8 @@ void FMain::setUpService()
 void FMain::setUpTopology()
 {
     m_configModel = new DhcpdConfigModel{{tr("Topology"), tr("Value")}, this};
-    connect(m_configModel, &DhcpdConfigModel::error, this, [this](const QString &message) { showError(message); });
+    connect(m_configModel, &DhcpdConfigModel::error, this,
+            [this](const QString &message) { showError(message, m_configModel->errorReason()); });
     connect(m_configModel, &DhcpdConfigModel::dataChanged, this,
             [this] { m_ui->aSave->setEnabled(m_configModel->isModified()); });
     m_file = std::make_unique<ConfigurationFile>(m_configModel, this);
@@ -126,6 +128,8 @@ void FMain::setUpLeases()
 
 void FMain::reload()
 {
+    if (!mayStartCommand())
+        return;
     if (m_ui->mainTabWidget->currentIndex() == LeasesTab) {
         m_leases->reload();
         return;
@@ -137,10 +141,18 @@ void FMain::reload()
         m_file->reload();
 }
 
-void FMain::save() { m_file->save(); }
+void FMain::save()
+{
+    if (mayStartCommand())
+        m_file->save();
+}
 
 void FMain::closeEvent(QCloseEvent *event)
 {
+    if (!mayStartCommand()) {
+        event->ignore();
+        return;
+    }
     if (!m_configModel->isModified()) {
         event->accept();
         return;
@@ -158,8 +170,8 @@ void FMain::closeEvent(QCloseEvent *event)
 
 void FMain::showError(const QString &text, const QString &reason)
 {
-    QMessageBox box{QMessageBox::Critical, tr("Error"), text, QMessageBox::Ok, this};
-    box.setInformativeText(reason);
+    PlainMessageBox box{QMessageBox::Critical, tr("Error"), text, QMessageBox::Ok, this};
+    box.setPlainInformativeText(reason);
     // A failed load reports from under the busy cursor.
     QGuiApplication::setOverrideCursor(QCursor{Qt::ArrowCursor});
     box.exec();
@@ -168,7 +180,7 @@ void FMain::showError(const QString &text, const QString &reason)
 
 void FMain::showInformation(const QString &text)
 {
-    QMessageBox::information(this, tr("Information"), text, QMessageBox::Ok);
+    PlainMessageBox{QMessageBox::Information, tr("Information"), text, QMessageBox::Ok, this}.exec();
 }
 
 void FMain::currentTabChanged(int index)
@@ -189,13 +201,25 @@ void FMain::handleTreeItemChanged(QModelIndex current)
 
 void FMain::configChanged() { m_file->noteChange(); }
 
-void FMain::getInterfaces() { m_service->chooseInterfaces(); }
+void FMain::getInterfaces()
+{
+    if (mayStartCommand())
+        m_service->chooseInterfaces();
+}
 
-void FMain::startStopServer() { m_service->startOrStop(); }
+void FMain::startStopServer()
+{
+    if (mayStartCommand())
+        m_service->startOrStop();
+}
 
 void FMain::handleServerStateChanged(DhcpServerManager::ServerStates state) { m_service->showState(state); }
 
-void FMain::handleTreeContextMenuRequested(QPoint /*position*/) { m_topology->openMenu(); }
+void FMain::handleTreeContextMenuRequested(QPoint /*position*/)
+{
+    if (mayStartCommand())
+        m_topology->openMenu();
+}
 
 void FMain::handleTreeDoubleClicked(QModelIndex index) { m_topology->edit(index); }
 

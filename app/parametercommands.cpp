@@ -4,6 +4,7 @@
 #include "app/statementcommands.h"
 #include "app/valuedialog.h"
 #include "config/dhcpdconfigmodel.h"
+#include "config/values.h"
 
 #include <QAction>
 #include <QDialog>
@@ -97,10 +98,7 @@ void ParameterCommands::addArbitrary()
     m_commands.addAsText(tr("Add arbitrary parameter"), tr("Parameter:"), &DhcpdConfigModel::addParameter);
 }
 
-void ParameterCommands::editArbitrary()
-{
-    m_commands.editAsText(tr("Edit arbitrary parameter"), tr("Parameter:"), isParameter);
-}
+void ParameterCommands::editArbitrary() { m_commands.editAsText(tr("Edit arbitrary parameter"), isParameter); }
 
 void ParameterCommands::add(const ParameterKind &kind)
 {
@@ -121,5 +119,8 @@ void ParameterCommands::edit(const ParameterKind &kind)
         [&kind](const DhcpdConfigStatement &statement) {
             return statement.isParam() && &ParameterKind::of(statement) == &kind;
         },
-        [&](const DhcpdConfigStatement &statement) { input.setValue(kind.valueOf(statement)); }, input.value);
+        [&](const DhcpdConfigStatement &statement) { input.setValue(kind.valueOf(statement)); }, input.value,
+        [&](const DhcpdConfigStatement &statement) {
+            return values::isValue(statement, kind.valuePosition(), input.value());
+        });
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/statementcommands.h"
 
+#include "app/commandguard.h"
 #include "app/treeviewstate.h"
 #include "config/dhcpdconfigdeclaration.h"
 #include "config/dhcpdconfigmodel.h"
@@ -56,11 +57,12 @@ void StatementCommands::addTo(const QModelIndex &parent, const std::function<voi
 void StatementCommands::add(const QString &title, QDialog &dialog,
                             const std::function<void(const QModelIndex &parent)> &change, OpenBranches open)
 {
-    const QModelIndex parent{currentDeclaration()};
-    if (!parent.isValid())
+    // Whatever resets the tree while the dialog is open makes the index invalid.
+    const QPersistentModelIndex parent{currentDeclaration()};
+    if (!parent.isValid() || !mayStartCommand())
         return;
     dialog.setWindowTitle(title);
-    if (dialog.exec() == QDialog::Accepted)
+    if (dialog.exec() == QDialog::Accepted && parent.isValid())
         addTo(
             parent, [&] { change(parent); }, open);
 }
@@ -68,24 +70,27 @@ void StatementCommands::add(const QString &title, QDialog &dialog,
 void StatementCommands::edit(const QString &title, QDialog &dialog, const KindTest &isKind, const Fields &fields,
                              const Store &store)
 {
-    if (!isCurrent(isKind))
+    if (!isCurrent(isKind) || !mayStartCommand())
         return;
-    const DhcpdConfigStatement &statement{currentStatement()};
-    dialog.setWindowTitle(title);
-    fields.fill(statement);
+    fields.fill(currentStatement());
+    if (!fields.showsAll(currentStatement())) {
+        editAsText(title, isKind);
+        return;
+    }
+    const QPersistentModelIndex index{m_model.indexOf(currentStatement(), 1)};
     const QStringList shown{fields.values()};
-    if (dialog.exec() != QDialog::Accepted)
+    dialog.setWindowTitle(title);
+    if (dialog.exec() != QDialog::Accepted || !index.isValid())
         return;
     const QStringList values{fields.values()};
     if (values != shown)
-        store(m_model.indexOf(statement, 1), values, shown);
+        store(index, values, shown);
 }
 
-void StatementCommands::editValue(const QString &title, QDialog &dialog, const KindTest &isKind,
-                                  const std::function<void(const DhcpdConfigStatement &statement)> &fill,
-                                  const std::function<QString()> &value)
+void StatementCommands::editValue(const QString &title, QDialog &dialog, const KindTest &isKind, const Fill &fill,
+                                  const std::function<QString()> &value, const ShowsAll &showsAll)
 {
-    edit(title, dialog, isKind, {fill, [&value] { return QStringList{value()}; }},
+    edit(title, dialog, isKind, {fill, [&value] { return QStringList{value()}; }, showsAll},
          [this](const QModelIndex &index, const QStringList &values, const QStringList & /*shown*/) {
              m_model.setData(index, values.first(), Qt::EditRole);
          });
@@ -95,7 +100,7 @@ void StatementCommands::addAsText(const QString &title, const QString &label,
                                   bool (DhcpdConfigModel::*operation)(const QStringList &words,
                                                                       const QModelIndex &parent))
 {
-    if (!currentDeclaration().isValid() || !askForAdvancedEditing())
+    if (!currentDeclaration().isValid() || !mayStartCommand() || !askForAdvancedEditing())
         return;
     StatementInputDialog dialog{m_window};
     dialog.setLabelText(label);
@@ -104,15 +109,18 @@ void StatementCommands::addAsText(const QString &title, const QString &label,
         OpenBranches::All);
 }
 
-void StatementCommands::editAsText(const QString &title, const QString &label, const KindTest &isKind)
+void StatementCommands::editAsText(const QString &title, const KindTest &isKind)
 {
-    if (!isCurrent(isKind) || !askForAdvancedEditing())
+    if (!isCurrent(isKind) || !mayStartCommand() || !askForAdvancedEditing())
         return;
     StatementInputDialog dialog{m_window};
-    dialog.setLabelText(label);
     edit(title, dialog, isKind,
-         {[&dialog](const DhcpdConfigStatement &statement) { dialog.setStatementText(statement.joinedWords()); },
-          [&dialog] { return dialog.statementWords(); }},
+         {[&dialog](const DhcpdConfigStatement &statement) {
+              dialog.setLabelText(statement.isDeclaration() ? tr("Declaration:") : tr("Parameter:"));
+              dialog.setStatementText(statement.joinedWords());
+          },
+          [&dialog] { return dialog.statementWords(); },
+          [](const DhcpdConfigStatement & /*statement*/) { return true; }},
          [this](const QModelIndex &index, const QStringList &words, const QStringList & /*shown*/) {
              m_model.replaceWords(index, words);
          });

@@ -51,29 +51,33 @@ public:
     void add(const QString &title, QDialog &dialog, const std::function<void(const QModelIndex &parent)> &change,
              OpenBranches open = OpenBranches::AsBefore);
 
-    /// How a dialog is made to show a statement, and the values that it shows then.
+    using Fill = std::function<void(const DhcpdConfigStatement &statement)>;
+    using ShowsAll = std::function<bool(const DhcpdConfigStatement &statement)>;
+    /// How a dialog is made to show a statement, the values that it shows then, and whether those are all that the
+    /// statement says.
     struct Fields
     {
-        std::function<void(const DhcpdConfigStatement &statement)> fill;
+        Fill fill;
         std::function<QStringList()> values;
+        ShowsAll showsAll;
     };
     /// Stores the values of an accepted dialog in the statement at an index of column 1; those it showed at first are
     /// given too.
     using Store = std::function<void(const QModelIndex &index, const QStringList &values, const QStringList &shown)>;
 
     /// Asks with `dialog` about the current statement, if that is of the kind, and when it is accepted with other
-    /// values than it showed at first, has them stored.
+    /// values than it showed at first, has them stored. A statement that the dialog cannot show all of is edited as
+    /// text.
     void edit(const QString &title, QDialog &dialog, const KindTest &isKind, const Fields &fields, const Store &store);
     /// The same for a single value, which goes to the model's setData().
-    void editValue(const QString &title, QDialog &dialog, const KindTest &isKind,
-                   const std::function<void(const DhcpdConfigStatement &statement)> &fill,
-                   const std::function<QString()> &value);
+    void editValue(const QString &title, QDialog &dialog, const KindTest &isKind, const Fill &fill,
+                   const std::function<QString()> &value, const ShowsAll &showsAll);
 
     /// Adds a statement of any words to the current declaration, after a warning.
     void addAsText(const QString &title, const QString &label,
                    bool (DhcpdConfigModel::*operation)(const QStringList &words, const QModelIndex &parent));
     /// Edits all words of the current statement, if that is of the kind, after a warning.
-    void editAsText(const QString &title, const QString &label, const KindTest &isKind);
+    void editAsText(const QString &title, const KindTest &isKind);
 
 private:
     bool isCurrent(const KindTest &isKind) const;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/topologypage.h"
 
+#include "app/commandguard.h"
 #include "app/reservation.h"
 #include "app/treeviewstate.h"
 #include "config/dhcpdconfigmodel.h"
@@ -87,7 +88,7 @@ void TopologyPage::removeCurrent()
 {
     const QModelIndex index{m_ui.topologyTree->currentIndex()};
     const Statement &statement{*m_model->statementFor(index)};
-    if (statement.isRoot())
+    if (statement.isRoot() || !mayStartCommand())
         return;
     const Statement &parent{*statement.parent()};
     m_model->removeStatement(index);

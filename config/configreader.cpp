@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <array>
+#include <optional>
 #include <utility>
 
 namespace {
@@ -56,74 +57,180 @@ bool isDeclarationKeyword(std::string_view word)
                        [word](std::string_view keyword) { return equalsIgnoringCase(word, keyword); });
 }
 
+/// Follows the quoted texts as the server sees them, where the reader sees words, and notes what it changes in them.
+class LossWatcher final
+{
+public:
+    explicit LossWatcher(std::string_view text)
+        : m_text{text}
+    {
+    }
+
+    void seeComment() { ++m_comments; }
+    void seeQuote(std::size_t place);
+    /// A statement that the server does not take for a block becomes one because of the word at `place`.
+    void seeStrayKeyword(std::size_t place, bool isQuoted) { note(isQuoted ? m_quotedTexts : m_statements, place); }
+    /// Whether a quoted text is open.
+    bool isQuoted() const { return m_opening != std::string_view::npos; }
+
+    ReadingLosses losses() const;
+
+private:
+    using Places = std::vector<std::size_t>; // each in the text
+
+    bool isEscaped(std::size_t quote) const;
+    static void note(Places &places, std::size_t place);
+    std::vector<int> linesOf(Places places) const;
+
+    std::string_view m_text;
+    std::size_t m_opening{std::string_view::npos}; // of the quoted text that is open
+    int m_comments{};
+    Places m_quotedTexts;
+    Places m_statements;
+};
+
+void LossWatcher::seeQuote(std::size_t place)
+{
+    if (!isQuoted()) {
+        m_opening = place;
+        return;
+    }
+    if (isEscaped(place)) {
+        note(m_quotedTexts, m_opening); // the reader takes it for the end
+        return;
+    }
+    const std::string_view quoted{m_text.substr(m_opening, place - m_opening)};
+    if (quoted.find_first_of(";{}\t\n") != std::string_view::npos || quoted.find("  ") != std::string_view::npos)
+        note(m_quotedTexts, m_opening);
+    m_opening = std::string_view::npos;
+}
+
+ReadingLosses LossWatcher::losses() const
+{
+    Places carriageReturns;
+    for (auto place = m_text.find('\r'); place != std::string_view::npos; place = m_text.find('\r', place + 1))
+        carriageReturns.push_back(place);
+    return {m_comments, linesOf(m_quotedTexts), linesOf(m_statements), linesOf(std::move(carriageReturns))};
+}
+
+bool LossWatcher::isEscaped(std::size_t quote) const
+{
+    const std::size_t last{m_text.find_last_not_of('\\', quote - 1)};
+    return (quote - last) % 2 == 0;
+}
+
+void LossWatcher::note(Places &places, std::size_t place)
+{
+    if (places.empty() || places.back() != place)
+        places.push_back(place);
+}
+
+/// The numbers of the lines that hold the places, each once.
+std::vector<int> LossWatcher::linesOf(Places places) const
+{
+    std::sort(places.begin(), places.end());
+    std::vector<int> lines;
+    int line{1};
+    std::size_t counted{0};
+    for (const std::size_t place : places) {
+        const std::string_view between{m_text.substr(counted, place - counted)};
+        line += static_cast<int>(std::count(between.begin(), between.end(), '\n'));
+        counted = place;
+        if (lines.empty() || lines.back() != line)
+            lines.push_back(line);
+    }
+    return lines;
+}
+
 class Reader final
 {
 public:
-    explicit Reader(DhcpdConfigDeclaration &top);
+    Reader(std::string_view text, DhcpdConfigDeclaration &top);
 
     /// False when blocks are nested too deep.
-    bool read(std::string_view text);
+    bool read();
     std::unique_ptr<DhcpdConfigDeclaration> takeTree() { return std::move(m_allNetwork); }
+    ReadingLosses losses() const { return m_losses.losses(); }
 
 private:
-    void endWord(std::string_view word);
+    struct StrayKeyword
+    {
+        std::size_t place;
+        bool isQuoted;
+    };
+
+    void endWord(std::size_t begin, std::size_t end);
     bool endStatement(Kind delimiter);
     WordList takeWords();
     void clearWords();
     void closeBlock();
 
+    std::string_view m_text;
+    LossWatcher m_losses;
     std::unique_ptr<DhcpdConfigDeclaration> m_allNetwork;
     DhcpdConfigDeclaration *m_current; // the block that is open
     WordList::Buffer m_words;          // of the statement that is being read
     int m_wordCount{};
-    bool m_hasDeclarationKeyword{}; // whether one of those words makes it a declaration
+    bool m_hasDeclarationKeyword{};             // whether one of those words makes it a declaration
+    std::optional<StrayKeyword> m_strayKeyword; // where that is not the first one
 };
 
-Reader::Reader(DhcpdConfigDeclaration &top)
-    : m_allNetwork{std::make_unique<DhcpdConfigDeclaration>(
+Reader::Reader(std::string_view text, DhcpdConfigDeclaration &top)
+    : m_text{text}
+    , m_losses{text}
+    , m_allNetwork{std::make_unique<DhcpdConfigDeclaration>(
           QStringList{DhcpdConfigStatement::tr("All network"), QString{}}, &top)}
     , m_current{m_allNetwork.get()}
 {
 }
 
-bool Reader::read(std::string_view text)
+bool Reader::read()
 {
     bool quoted{};
     std::size_t wordStart{};
-    for (std::size_t i{}; i < text.size(); ++i) {
-        const Kind kind{kindOf(text[i])};
+    for (std::size_t i{}; i < m_text.size(); ++i) {
+        const Kind kind{kindOf(m_text[i])};
         if (kind == Kind::Ordinary)
             continue;
         if (kind == Kind::Quote) {
             quoted = !quoted;
+            m_losses.seeQuote(i);
             continue;
         }
         if (kind == Kind::Hash && quoted)
             continue;
 
         // Quotes matter to the start of a comment only: blanks and delimiters end a quoted word as well, deliberately.
-        endWord(text.substr(wordStart, i - wordStart));
-        if (kind == Kind::Hash)
-            i = std::min(text.find('\n', i), text.size());
-        else if (kind != Kind::Blank && !endStatement(kind))
+        endWord(wordStart, i);
+        if (kind == Kind::Hash) {
+            m_losses.seeComment();
+            i = std::min(m_text.find('\n', i), m_text.size());
+        } else if (kind != Kind::Blank && !endStatement(kind)) {
             return false;
+        }
         wordStart = i + 1;
     }
     return true; // what was not ended by a delimiter is dropped
 }
 
-void Reader::endWord(std::string_view word)
+void Reader::endWord(std::size_t begin, std::size_t end)
 {
-    if (word.empty())
+    if (begin == end)
         return;
+    const std::string_view word{m_text.substr(begin, end - begin)};
     m_words.add(word);
     ++m_wordCount;
-    m_hasDeclarationKeyword = m_hasDeclarationKeyword || isDeclarationKeyword(word);
+    if (!m_hasDeclarationKeyword && isDeclarationKeyword(word)) {
+        m_hasDeclarationKeyword = true;
+        if (m_wordCount > 1)
+            m_strayKeyword = StrayKeyword{begin, m_losses.isQuoted()};
+    }
 }
 
 bool Reader::endStatement(Kind delimiter)
 {
     const bool isDeclaration{m_hasDeclarationKeyword || delimiter == Kind::OpeningBrace};
+    const auto strayKeyword = m_strayKeyword;
     if (delimiter == Kind::ClosingBrace) {
         clearWords(); // they make no statement before a closing brace, deliberately
         closeBlock();
@@ -132,8 +239,10 @@ bool Reader::endStatement(Kind delimiter)
     } else if (isDeclaration) {
         auto *declaration = m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
         if (delimiter == Kind::OpeningBrace) {
-            declaration->setReadAsBlock();
+            declaration->setBraced();
             m_current = declaration;
+        } else if (strayKeyword) {
+            m_losses.seeStrayKeyword(strayKeyword->place, strayKeyword->isQuoted);
         }
     } else {
         m_current->addParam(std::make_unique<DhcpdConfigParam>(takeWords(), m_current));
@@ -154,6 +263,7 @@ void Reader::clearWords()
     m_words.clear();
     m_wordCount = 0;
     m_hasDeclarationKeyword = false;
+    m_strayKeyword.reset();
 }
 
 void Reader::closeBlock()
@@ -164,8 +274,13 @@ void Reader::closeBlock()
 
 } // namespace
 
-std::unique_ptr<DhcpdConfigDeclaration> readConfiguration(std::string_view text, DhcpdConfigDeclaration &top)
+std::unique_ptr<DhcpdConfigDeclaration> readConfiguration(std::string_view text, DhcpdConfigDeclaration &top,
+                                                          ReadingLosses *losses)
 {
-    Reader reader{top};
-    return reader.read(text) ? reader.takeTree() : nullptr;
+    Reader reader{text, top};
+    if (!reader.read())
+        return nullptr;
+    if (losses)
+        *losses = reader.losses();
+    return reader.takeTree();
 }

@@ -57,12 +57,11 @@ void append(Text &text, const DhcpdConfigParam &param)
         appendLine(text, param, ";\n");
 }
 
-/// Whether a declaration is written without its children. They are only dropped, deliberately, where an edit put them:
-/// a block that was read with braces, as those of subclasses often are, keeps them.
+/// Whether a declaration is written without its children, deliberately, unless those have their braces.
 bool isOneLine(const DhcpdConfigDeclaration &declaration)
 {
     return (declaration.isRange() || declaration.isSubclass() || declaration.isFixedAddress()) &&
-           !(declaration.isReadAsBlock() && declaration.childCount() > 0);
+           !(declaration.isBraced() && declaration.childCount() > 0);
 }
 
 void append(Text &text, const DhcpdConfigDeclaration &declaration);

@@ -29,9 +29,10 @@ public:
     DhcpdConfigParam *addParam(const QStringList &words);
     DhcpdConfigDeclaration *addDeclaration(const QStringList &words);
 
-    /// Whether the declaration stood in the file with a body in braces, whatever its keyword is.
-    bool isReadAsBlock() const { return m_isReadAsBlock; }
-    void setReadAsBlock() { m_isReadAsBlock = true; }
+    /// Whether the declaration has a body in braces, whatever its keyword is: as it stood in the file, or since an edit
+    /// put statements there.
+    bool isBraced() const { return m_isBraced; }
+    void setBraced() { m_isBraced = true; }
     /// Whether a block in this one would not be nested too deep.
     bool takesBlocks() const { return depth() + 1 < maximumBlockDepth; }
 
@@ -61,6 +62,6 @@ private:
     template<class List>
     static bool eraseFound(List &list, const DhcpdConfigStatement *statement);
 
-    bool m_isReadAsBlock{};
+    bool m_isBraced{};
     std::unique_ptr<Children> m_children; // null while there were none: most declarations are ranges and addresses
 };

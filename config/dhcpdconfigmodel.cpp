@@ -132,7 +132,8 @@ void DhcpdConfigModel::append(const std::optional<QByteArray> &content, const QS
 {
     const TextEncoding encoding{content ? TextEncoding::detect(*content) : m_encoding};
     if (!content || !parseUtf8(encoding.toUtf8(*content))) {
-        refuse(tr("Unable to open file '%1' for read").arg(confFile), reason);
+        refuse(tr("Unable to open file '%1' for read").arg(confFile),
+               content ? tr("The blocks of the file are nested too deeply.") : reason);
         return;
     }
     m_encoding = encoding;
@@ -159,7 +160,8 @@ void DhcpdConfigModel::reportUnwritten(const QString &confFile, const QString &r
 
 bool DhcpdConfigModel::parseUtf8(const QByteArray &text)
 {
-    auto allNetwork = readConfiguration({text.constData(), static_cast<std::size_t>(text.size())}, *m_topNode);
+    auto allNetwork =
+        readConfiguration({text.constData(), static_cast<std::size_t>(text.size())}, *m_topNode, &m_losses);
     if (!allNetwork)
         return false;
     m_topNode->addDeclaration(std::move(allNetwork));

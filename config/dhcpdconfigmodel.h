@@ -5,6 +5,7 @@
 #include "common/textencoding.h"
 #include "config/dhcpdconfigdeclaration.h"
 #include "config/parameterkind.h"
+#include "config/readinglosses.h"
 
 #include <QAbstractItemModel>
 #include <QHash>
@@ -46,6 +47,8 @@ public:
 
     /// Appends what `text` holds; false, with nothing appended, when its blocks are nested too deep.
     bool parse(const QString &text);
+    /// What of the text that was read last the tree does not keep.
+    const ReadingLosses &losses() const { return m_losses; }
     /// The bytes that write() puts into the file; null when nothing was read, or they could not be read again.
     QByteArray fileContent() const;
     /// As reload(), of what was read from the file already; nothing where it could not be read, for that `reason`.
@@ -89,6 +92,8 @@ public:
 
     /// Adds the value of the option for routes, and its definition unless the declaration or the one around it has it.
     void addStaticRoutes(const QStringList &routes, bool ms, const QModelIndex &parent);
+    /// The same, with the definition at the top of the file, where alone the server takes it.
+    void addRoutes(const QStringList &routes, bool ms, const QModelIndex &parent);
 
     /// Puts `words` in the place of all words of a statement, without a reset; nothing is modified when it has them
     /// already. False for the nodes above the file's statements.
@@ -116,9 +121,12 @@ private:
     bool parseUtf8(const QByteArray &text);
     void append(const std::optional<QByteArray> &content, const QString &confFile, const QString &reason);
     void setModified();
-    /// Runs `change`, which adds or removes statements, within a reset.
+    /// Runs `change`, which removes statements, within a reset.
     template<typename Change>
     void changeTree(Change change);
+    /// Runs `change`, which adds statements to `holder`, within a reset.
+    template<typename Change>
+    void addTo(DhcpdConfigDeclaration *holder, Change change);
     /// The declaration of `index`; null when its statement is a parameter.
     DhcpdConfigDeclaration *declarationFor(const QModelIndex &index) const;
     QString keywordFor(const QModelIndex &index) const { return statementFor(index)->keyword(); }
@@ -139,6 +147,7 @@ private:
     std::unique_ptr<DhcpdConfigDeclaration> m_topNode; // invisible; its words are the header labels
     bool m_modified{};
     QString m_errorReason;
+    ReadingLosses m_losses;
     TextEncoding m_encoding; // of the file that was read last
     mutable QHash<QString, QIcon> m_icons;
 };
@@ -150,4 +159,13 @@ void DhcpdConfigModel::changeTree(Change change)
     change();
     endResetModel();
     setModified();
+}
+
+template<typename Change>
+void DhcpdConfigModel::addTo(DhcpdConfigDeclaration *holder, Change change)
+{
+    changeTree([&] {
+        change();
+        holder->setBraced(); // its children are to be written, whatever its keyword is
+    });
 }

@@ -46,7 +46,7 @@ void DhcpdConfigModel::addSharedNetwork(const QString &name, const QModelIndex &
     if (!takesTopBlocks(holder))
         refuse(tr("Error adding shared-network. Can not add shared-network to '%1'").arg(keywordFor(parent)));
     else
-        changeTree([&] { holder->addDeclaration({QStringLiteral("shared-network"), name}); });
+        addTo(holder, [&] { holder->addDeclaration({QStringLiteral("shared-network"), name}); });
 }
 
 void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, const QModelIndex &parent)
@@ -59,8 +59,8 @@ void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, co
     else if (!takesTopBlocks(holder) && !(holder && holder->isSharedNetwork() && holder->takesBlocks()))
         refuse(tr("Error adding subnet. Can not add subnet to '%1'").arg(keywordFor(parent)));
     else
-        changeTree(
-            [&] { holder->addDeclaration(QStringList{QStringLiteral("subnet")} + values::subnetWords(*subnet)); });
+        addTo(holder,
+              [&] { holder->addDeclaration(QStringList{QStringLiteral("subnet")} + values::subnetWords(*subnet)); });
 }
 
 QStringList DhcpdConfigModel::defaultRange(const QString &subnet)
@@ -84,8 +84,8 @@ void DhcpdConfigModel::addRange(const QString &start, const QString &end, const 
     else if (!holder->isSubnet())
         refuse(tr("Error adding range. Can not add range to '%1'").arg(keywordFor(parent)));
     else if (!problem)
-        changeTree(
-            [&] { holder->addDeclaration(QStringList{QStringLiteral("range")} + std::get<QStringList>(words)); });
+        addTo(holder,
+              [&] { holder->addDeclaration(QStringList{QStringLiteral("range")} + std::get<QStringList>(words)); });
     else if (*problem == RangeProblem::InvalidSubnet)
         refuse(tr("Error adding range. Invalid parent subnet"));
     else if (*problem == RangeProblem::InvalidStart)
@@ -108,7 +108,7 @@ void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QS
     }
     const bool isMac{values::isValid(ValueType::MacAddress, mac)};
     const auto fixedAddress = values::usableAddress(address);
-    changeTree([&] {
+    addTo(holder, [&] {
         auto *host =
             holder->addDeclaration({QStringLiteral("host"), name.contains(blank) ? values::quoted(name) : name});
         if (!mac.isEmpty())
@@ -135,7 +135,7 @@ void DhcpdConfigModel::addFixedAddress(const QString &address, const QModelIndex
     const auto old =
         std::find_if(children.begin(), children.end(), [](const auto &child) { return child->isFixedAddress(); });
     if (old == children.end()) {
-        changeTree([&] { host->addDeclaration(fixedAddressWords(*fixedAddress)); });
+        addTo(host, [&] { host->addDeclaration(fixedAddressWords(*fixedAddress)); });
     } else {
         (*old)->setWordsFrom(1, {*fixedAddress});
         setModified();
@@ -149,7 +149,7 @@ bool DhcpdConfigModel::addBind9(const QStringList &statements, const QModelIndex
         return refuse(tr("Error adding bind9. Can not add bind9 to '%1'").arg(keywordFor(parent)));
     if (statements.isEmpty())
         return refuse(tr("Error adding bind9. bind9 can not be empty."));
-    changeTree([&] {
+    addTo(holder, [&] {
         DhcpdConfigDeclaration *block{};
         for (int i{}; i < statements.size(); i += wordsOfLine) {
             const QStringList words{(statements.at(i) + blank + statements.value(i + 1)).split(blank)};
@@ -167,7 +167,7 @@ bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelInde
     auto *holder = declarationFor(parent);
     if (!takesAnything(holder) || !holder->takesBlocks())
         return refuse(tr("Error adding declaration. Can not add declaration to '%1'").arg(keywordFor(parent)));
-    changeTree([&] { holder->addDeclaration(words); });
+    addTo(holder, [&] { holder->addDeclaration(words); });
     return true;
 }
 
@@ -176,7 +176,7 @@ bool DhcpdConfigModel::addParameter(const QStringList &words, const QModelIndex 
     auto *holder = declarationFor(parent);
     if (!takesAnything(holder))
         return refuse(tr("Error adding parameter. Can not add parameter to '%1'").arg(keywordFor(parent)));
-    changeTree([&] { holder->addParam(words); });
+    addTo(holder, [&] { holder->addParam(words); });
     return true;
 }
 

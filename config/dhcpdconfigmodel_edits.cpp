@@ -31,6 +31,8 @@ bool DhcpdConfigModel::replaceWords(const QModelIndex &index, const QStringList 
     if (statement->isRoot())
         return false;
     if (words != statement->wordsFrom(0)) {
+        if (statement->isDeclaration() && statement->childCount() > 0)
+            static_cast<DhcpdConfigDeclaration *>(statement)->setBraced(); // whatever its keyword becomes
         statement->setWordsFrom(0, words);
         setModified();
     }

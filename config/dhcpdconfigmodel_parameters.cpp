@@ -20,6 +20,11 @@ DhcpdConfigParam *findParam(const DhcpdConfigDeclaration &declaration, const Par
     return findParam(declaration, [&kind](const DhcpdConfigParam &param) { return kind.matches(param); });
 }
 
+const ParameterKind &routeKind(bool ms)
+{
+    return ParameterKind::named(ms ? "ms-classless-static-routes" : "classless-static-routes");
+}
+
 } // namespace
 
 bool DhcpdConfigModel::setParameter(const ParameterKind &kind, const QString &value, const QModelIndex &parent)
@@ -36,7 +41,7 @@ bool DhcpdConfigModel::setParameter(const ParameterKind &kind, const QString &va
         old->setWordsFrom(kind.valuePosition(), words);
         setModified();
     } else {
-        changeTree([&] { holder->addParam(kind.start() + words); });
+        addTo(holder, [&] { holder->addParam(kind.start() + words); });
     }
     return true;
 }
@@ -77,9 +82,27 @@ void DhcpdConfigModel::addDomainName(const QString &name, const QModelIndex &par
     setParameter(ParameterKind::named("domain-name"), name, parent);
 }
 
+void DhcpdConfigModel::addRoutes(const QStringList &routes, bool ms, const QModelIndex &parent)
+{
+    auto *holder = declarationFor(parent);
+    if (!holder || holder->depth() < 1 || routes.isEmpty()) {
+        addStaticRoutes(routes, ms, parent);
+        return;
+    }
+    const ParameterKind &kind{routeKind(ms)};
+    auto *top = holder->parent();
+    while (!top->isRoot())
+        top = top->parent();
+    addTo(holder, [&] {
+        if (!findParam(*top, kind))
+            top->addParam(kind.start() + QStringList{values::routeDefinition(ms)});
+        holder->addParam(kind.start() + QStringList{values::routeList(routes)});
+    });
+}
+
 void DhcpdConfigModel::addStaticRoutes(const QStringList &routes, bool ms, const QModelIndex &parent)
 {
-    const ParameterKind &kind{ParameterKind::named(ms ? "ms-classless-static-routes" : "classless-static-routes")};
+    const ParameterKind &kind{routeKind(ms)};
     const QString option{kind.start().constLast()};
     auto *holder = declarationFor(parent);
     if (!holder) {
@@ -100,7 +123,7 @@ void DhcpdConfigModel::addStaticRoutes(const QStringList &routes, bool ms, const
         setModified();
         return;
     }
-    changeTree([&] {
+    addTo(holder, [&] {
         auto *outer = holder->parent() && holder->parent() != m_topNode.get() ? holder->parent() : holder;
         if (!findParam(*holder, kind) && !findParam(*outer, kind))
             outer->addParam(kind.start() + QStringList{values::routeDefinition(ms)});

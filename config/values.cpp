@@ -44,6 +44,12 @@ bool isUsableList(const QString &list)
                        [](const QString &piece) { return usableAddress(piece).has_value(); });
 }
 
+QString withoutBlanksAtCommas(QString text)
+{
+    static const QRegularExpression commas{QStringLiteral(" *, *")};
+    return text.replace(commas, QStringLiteral(","));
+}
+
 } // namespace
 
 bool isValid(ValueType type, const QString &text)
@@ -134,10 +140,19 @@ QString quotedIfSpaced(const QString &name)
     return name.contains(blank) && !name.startsWith(quote) ? quoted(name) : name;
 }
 
-QString withoutSyntax(const QString &name)
+QString hostName(const QString &clientName)
 {
-    static const QRegularExpression syntax{QStringLiteral("[\"#;{}\\x00-\\x1f]")};
-    return QString{name}.remove(syntax);
+    static const QRegularExpression others{QStringLiteral("[^A-Za-z0-9._-]+")};
+    static const QRegularExpression hyphensAtEnds{QStringLiteral("^-+|-+$")};
+    return QString{clientName}.replace(others, QStringLiteral("-")).remove(hyphensAtEnds);
+}
+
+bool isValue(const DhcpdConfigStatement &statement, int position, const QString &text)
+{
+    QStringList words{statement.wordsFrom(position)};
+    while (!words.isEmpty() && words.last().isEmpty())
+        words.removeLast();
+    return withoutBlanksAtCommas(words.join(blank)) == withoutBlanksAtCommas(text);
 }
 
 QString routeList(const QStringList &routes) { return routes.join(QStringLiteral(", ")); }

@@ -64,9 +64,12 @@ QString unquoted(const QString &name);
 /// `name`, in quotes if it has blanks and is not in quotes yet.
 QString quotedIfSpaced(const QString &name);
 
-/// The name that a client gives itself without the characters that would end it in the configuration: the client might
-/// write statements of its own there.
-QString withoutSyntax(const QString &name);
+/// A name for a host that the server takes, made of the one that a client gives itself: letters, digits, hyphens, dots
+/// and underscores, each run of others one hyphen. What a client says must not become statements of its own.
+QString hostName(const QString &clientName);
+
+/// Whether `text` is all that `statement` says from the word at `position` on, blanks around commas aside.
+bool isValue(const DhcpdConfigStatement &statement, int position, const QString &text);
 
 /// Routes as the value of their option.
 QString routeList(const QStringList &routes);

@@ -4,6 +4,20 @@
 #include "ui_statementinputdialog.h"
 
 #include <QShortcut>
+#include <QTextDocument>
+
+namespace {
+
+/// The text of the document as it is; QTextDocument::toPlainText() makes blanks of no-break spaces.
+QString textOf(const QTextDocument &document)
+{
+    QString text{document.toRawText()};
+    for (const ushort lineEnd : {ushort{QChar::ParagraphSeparator}, ushort{QChar::LineSeparator}})
+        text.replace(QChar{lineEnd}, QLatin1Char{'\n'});
+    return text;
+}
+
+} // namespace
 
 StatementInputDialog::StatementInputDialog(QWidget *parent)
     : QDialog{parent}
@@ -23,7 +37,7 @@ void StatementInputDialog::setStatementText(const QString &text) { m_ui->attribu
 
 QStringList StatementInputDialog::statementWords() const
 {
-    QStringList words{m_ui->attributes->toPlainText().split(QLatin1Char{' '})};
+    QStringList words{textOf(*m_ui->attributes->document()).split(QLatin1Char{' '})};
     while (words.size() < 2)
         words.append(QString{});
     return words;

@@ -158,6 +158,10 @@
         <source>Error adding static route. Static route parametrs can not be empty.</source>
         <translation>Fehler beim Hinzufügen der statischen Route. Die Angaben zur statischen Route dürfen nicht leer sein.</translation>
     </message>
+    <message>
+        <source>The blocks of the file are nested too deeply.</source>
+        <translation>Die Blöcke der Datei sind zu tief verschachtelt.</translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>
@@ -645,6 +649,54 @@ Möchten Sie fortfahren?</translation>
     <message>
         <source>Answer of the DHCP server</source>
         <translation>Antwort des DHCP-Servers</translation>
+    </message>
+    <message>
+        <source>%1 more</source>
+        <translation>%1 weiteren</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 und %2</translation>
+    </message>
+    <message>
+        <source>The comment of the file will not be kept.</source>
+        <translation>Der Kommentar der Datei bleibt nicht erhalten.</translation>
+    </message>
+    <message>
+        <source>The %1 comments of the file will not be kept.</source>
+        <translation>Die %1 Kommentare der Datei bleiben nicht erhalten.</translation>
+    </message>
+    <message>
+        <source>The quoted text in line %1 will be changed.</source>
+        <translation>Der Text in Anführungszeichen in Zeile %1 wird verändert.</translation>
+    </message>
+    <message>
+        <source>The quoted texts in lines %1 will be changed.</source>
+        <translation>Die Texte in Anführungszeichen in den Zeilen %1 werden verändert.</translation>
+    </message>
+    <message>
+        <source>The statement in line %1 will be changed.</source>
+        <translation>Die Anweisung in Zeile %1 wird verändert.</translation>
+    </message>
+    <message>
+        <source>The statements in lines %1 will be changed.</source>
+        <translation>Die Anweisungen in den Zeilen %1 werden verändert.</translation>
+    </message>
+    <message>
+        <source>The carriage return in line %1 will become part of a word.</source>
+        <translation>Das Wagenrücklaufzeichen in Zeile %1 wird Teil eines Wortes.</translation>
+    </message>
+    <message>
+        <source>The carriage returns in lines %1 will become parts of words.</source>
+        <translation>Die Wagenrücklaufzeichen in den Zeilen %1 werden Teile von Wörtern.</translation>
+    </message>
+    <message>
+        <source>The configuration could not be read, so there is nothing to save.</source>
+        <translation>Die Konfiguration konnte nicht gelesen werden, daher gibt es nichts zu speichern.</translation>
+    </message>
+    <message>
+        <source>The text would be too long, or its blocks nested too deeply, to be read again.</source>
+        <translation>Der Text wäre zu lang oder seine Blöcke zu tief verschachtelt, um wieder gelesen zu werden.</translation>
     </message>
 </context>
 <context>

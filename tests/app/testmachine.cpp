@@ -75,9 +75,9 @@ ModalBoxes::Box saveQuestion(const QString &text)
             QMessageBox::Save};
 }
 
-ModalBoxes::Box cannotRead()
+ModalBoxes::Box cannotRead(const QString &reason)
 {
-    return errorBox(QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()));
+    return errorBox(QStringLiteral("Unable to open file '%1' for read").arg(paths::configuration()), reason);
 }
 
 void runOutside(const QString &path, const QByteArray &command, const QByteArray &input)

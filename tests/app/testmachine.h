@@ -69,7 +69,7 @@ inline const QString overwriteText{
 ModalBoxes::Box saveQuestion(const QString &text = rewriteText);
 
 /// The box that says that the configuration could not be read.
-ModalBoxes::Box cannotRead();
+ModalBoxes::Box cannotRead(const QString &reason = QStringLiteral("No such file or directory"));
 
 /// Runs a shell command with `path` as its argument and `input` on its standard input; meanwhile the event loop runs.
 /// Fails the test when the command fails.

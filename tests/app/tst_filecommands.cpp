@@ -8,6 +8,7 @@
 #include "tests/support/modalboxes.h"
 #include "tests/support/realdhcpd.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QAction>
 #include <QCheckBox>
@@ -16,6 +17,7 @@
 #include <QElapsedTimer>
 #include <QFileSystemWatcher>
 #include <QHeaderView>
+#include <QLabel>
 #include <QPushButton>
 #include <QRegularExpression>
 #include <QSignalSpy>
@@ -50,9 +52,19 @@ ModalBoxes::Box reloadQuestion()
             QMessageBox::Yes};
 }
 
-ModalBoxes::Box cannotWrite()
+constexpr auto commentLoss = "The comment of the file will not be kept.";
+
+ModalBoxes::Box withLoss(ModalBoxes::Box question, const char *loss)
 {
-    return errorBox(QStringLiteral("Unable to open file '%1' for write").arg(paths::configuration()));
+    question.informativeText = text(loss);
+    return question;
+}
+
+constexpr auto nothingToSave = "The configuration could not be read, so there is nothing to save.";
+
+ModalBoxes::Box cannotWrite(const char *reason)
+{
+    return errorBox(QStringLiteral("Unable to open file '%1' for write").arg(paths::configuration()), text(reason));
 }
 
 /// The window on the configuration, and how often it was notified of a change of the file.
@@ -170,12 +182,12 @@ QList<QByteArray> backups()
 }
 
 // Closes the window and chooses to save the changes, which fails.
-void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes)
+void closeAlthoughNothingCanBeSaved(const Site &site, ModalBoxes &boxes, const char *reason)
 {
     boxes.expectDialog<QMessageBox>(
         [](QMessageBox *box) { QTest::mouseClick(box->button(QMessageBox::Yes), Qt::LeftButton); });
     boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    boxes.expectBox(cannotWrite(reason), QMessageBox::Ok);
     site.window->close();
     boxes.verify();
     QVERIFY(!site.window->isVisible());
@@ -205,11 +217,17 @@ private slots:
     void savingShowsTheWholeTopology();
     void cancelledSaveHidesTheNextChange();
     void savesInARowRewrite();
+    void saveTellsWhatIsLost_data();
+    void saveTellsWhatIsLost();
+    void lossesComeBeforeTheVerdict();
+    void lossesOfAnotherVersionAreNotTold();
+    void textsAreShownAsTheyAre();
     void outsideChangeIsNoticed_data();
     void outsideChangeIsNoticed();
     void burstOfWritesIsFewNotices();
     void steadyWritingIsNoticedMeanwhile();
-    void changeDuringTheQuestionIsIgnored();
+    void changeDuringTheQuestionIsAskedAbout_data();
+    void changeDuringTheQuestionIsAskedAbout();
     void failedSaveChangesNothing();
     void failedSaveKeepsChangedOutside();
     void changeWhileAFailureIsShownIsNoticed();
@@ -305,6 +323,102 @@ void FileCommandsTest::cancelledSaveHidesTheNextChange()
     site.cancelSave(overwriteText);
 }
 
+void FileCommandsTest::saveTellsWhatIsLost_data()
+{
+    QTest::addColumn<QByteArray>("content");
+    QTest::addColumn<QString>("told");
+    const auto row = [](const char *name, const QByteArray &content, const char *told) {
+        QTest::addRow("%s", name) << content << text(told);
+    };
+    const QByteArray end{"host first {\n}\nhost last {\n}\n"};
+    row("nothing", end, "");
+    row("a comment", "# by hand\n" + end, "The comment of the file will not be kept.");
+    row("comments", "# by hand\n# and more\n" + end, "The 2 comments of the file will not be kept.");
+    row("options of a vendor", "option vend \"s1ip=10.1.29.8;p1=4100;a1=1;\";\n" + end,
+        "The quoted text in line 1 will be changed.");
+    row("blanks", "\noption a \"a   b\";\noption b \"c\td\";\n" + end,
+        "The quoted texts in lines 2 and 3 will be changed.");
+    row("address of a page", "filename \"http://x?mac={mac}\";\n" + end, "The quoted text in line 1 will be changed.");
+    row("message", "log(info, \"bad range asked\");\n" + end, "The quoted text in line 1 will be changed.");
+    row("inches", "option a \"5\\\" disk\";\nping-check true; # really\n" + end,
+        "The quoted text in line 1 will be changed.");
+    row("carriage returns", QByteArray{end}.replace("\n", "\r\n"),
+        "The carriage returns in lines 1, 2, 3 and 4 will become parts of words.");
+    row("many lines", QByteArray{"option a \"b;\";\n"}.repeated(12) + end,
+        "The quoted texts in lines 1, 2, 3, 4, 5, 6, 7, 8, 9, 10 and 2 more will be changed.");
+    row("all", "# a\nb \"c;\";\nd range;\n" + end,
+        "The comment of the file will not be kept.\nThe quoted text in line 2 will be changed.\n"
+        "The statement in line 3 will be changed.");
+}
+
+void FileCommandsTest::saveTellsWhatIsLost()
+{
+    QFETCH(QByteArray, content);
+    QFETCH(QString, told);
+    writeTestFile(paths::configuration(), content);
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    m_boxes->expectBox(withLoss(saveQuestion(), qPrintable(told)), QMessageBox::Save);
+    site.pressSave();
+    m_boxes->verify();
+
+    site.save(rewriteText); // there is nothing left to tell
+}
+
+void FileCommandsTest::lossesComeBeforeTheVerdict()
+{
+    m_machine->programs().install(QStringLiteral("dhcpd"), R"(echo "$3 line 2: no such thing"; exit 1)");
+    writeTestFile(paths::configuration(), "# by hand\n" + configuration);
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    m_boxes->expectDialog<QMessageBox>([](QMessageBox *box) {
+        QCOMPARE(box->informativeText(), text("The comment of the file will not be kept."));
+        QTRY_COMPARE(box->informativeText(), text("The comment of the file will not be kept.\n"
+                                                  "The DHCP server refuses this configuration:\n"
+                                                  "line 2: no such thing"));
+        QTest::mouseClick(box->button(QMessageBox::Cancel), Qt::LeftButton);
+    });
+    site.pressSave();
+    m_boxes->verify();
+}
+
+void FileCommandsTest::lossesOfAnotherVersionAreNotTold()
+{
+    writeTestFile(paths::configuration(), "# by hand\n" + configuration);
+    const Site site{*m_machine, *m_boxes};
+    writeTestFile(paths::configuration(), configuration + "# another one\n");
+    site.settle();
+    site.save(overwriteText);
+}
+
+void FileCommandsTest::textsAreShownAsTheyAre()
+{
+    m_machine->programs().install(QStringLiteral("dhcpd"), R"(echo "$3 line 2: <b>no</b> &lt; such"; exit 1)");
+    const Site site{*m_machine, *m_boxes};
+    site.modify();
+    const auto compareFormats = [](QMessageBox *box) {
+        const auto labels = box->findChildren<QLabel *>(QRegularExpression{QStringLiteral("^qt_msgbox_(label|info)")});
+        QVERIFY(!labels.isEmpty());
+        for (const QLabel *label : labels)
+            QCOMPARE(label->textFormat(), Qt::PlainText);
+    };
+    m_boxes->expectDialog<QMessageBox>([&](QMessageBox *box) {
+        QTRY_VERIFY(box->informativeText().contains(text("line 2: <b>no</b> &lt; such")));
+        compareFormats(box);
+        QTest::mouseClick(box->button(QMessageBox::Cancel), Qt::LeftButton);
+    });
+    site.pressSave();
+    m_boxes->verify();
+
+    m_boxes->expectDialog<QMessageBox>([&](QMessageBox *box) {
+        QCOMPARE(box->text(), text("<h1>X</h1>"));
+        compareFormats(box);
+        QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
+    });
+    emit site.model->error(text("<h1>X</h1>"));
+    m_boxes->verify();
+}
+
 void FileCommandsTest::savesInARowRewrite()
 {
     const Site site{*m_machine, *m_boxes};
@@ -369,8 +483,16 @@ void FileCommandsTest::steadyWritingIsNoticedMeanwhile()
     QVERIFY(site.notices.count() > 1);
 }
 
-void FileCommandsTest::changeDuringTheQuestionIsIgnored()
+void FileCommandsTest::changeDuringTheQuestionIsAskedAbout_data()
 {
+    QTest::addColumn<bool>("saved");
+    QTest::addRow("saved") << true;
+    QTest::addRow("cancelled") << false;
+}
+
+void FileCommandsTest::changeDuringTheQuestionIsAskedAbout()
+{
+    QFETCH(bool, saved);
     const Site site{*m_machine, *m_boxes};
     site.modify();
     ModalBoxes &boxes{*m_boxes};
@@ -378,11 +500,13 @@ void FileCommandsTest::changeDuringTheQuestionIsIgnored()
         changeOutside(site);
         QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
     });
+    boxes.expectBox(saveQuestion(overwriteText), saved ? QMessageBox::Save : QMessageBox::Cancel);
     site.pressSave();
     boxes.verify();
     site.settle();
-    QCOMPARE(readTestFile(paths::configuration()), site.model->fileContent());
-    site.save(rewriteText);
+    QCOMPARE(readTestFile(paths::configuration()), saved ? site.model->fileContent() : configuration + "# by hand\n");
+    QCOMPARE(site.isModified(), !saved);
+    site.save(saved ? rewriteText : overwriteText);
 }
 
 void FileCommandsTest::failedSaveChangesNothing()
@@ -396,7 +520,7 @@ void FileCommandsTest::failedSaveChangesNothing()
         disk = std::make_unique<FullDisk>();
         QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
     });
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    boxes.expectBox(cannotWrite("File too large"), QMessageBox::Ok);
     site.pressSave();
     disk.reset();
     boxes.verify();
@@ -419,7 +543,7 @@ void FileCommandsTest::failedSaveKeepsChangedOutside()
     site.modify();
     ModalBoxes &boxes{*m_boxes};
     boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    boxes.expectBox(cannotWrite("Is a directory"), QMessageBox::Ok);
     site.pressSave();
     boxes.verify();
     QVERIFY(site.isModified());
@@ -442,7 +566,7 @@ void FileCommandsTest::changeWhileAFailureIsShownIsNoticed()
     });
     boxes.expectDialog<QMessageBox>([&disk, &site](QMessageBox *box) {
         disk.reset();
-        QCOMPARE(box->text(), cannotWrite().text);
+        QCOMPARE(box->text(), cannotWrite("").text);
         changeOutside(site); // taken for the program's own
         changeOutside(site);
         QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
@@ -464,6 +588,7 @@ void FileCommandsTest::noticeOfTheReplacedVersionIsDropped()
         QVERIFY(told.wait());
         QTest::mouseClick(box->button(QMessageBox::Save), Qt::LeftButton);
     });
+    boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
     site.pressSave();
     boxes.verify();
     site.settle();
@@ -520,7 +645,7 @@ void FileCommandsTest::nothingIsSavedFromNothing()
     writeTestFile(paths::configuration(), configuration); // somebody puts it back
     site.settle();
     boxes.expectBox(saveQuestion(overwriteText), QMessageBox::Save);
-    boxes.expectBox(cannotWrite(), QMessageBox::Ok);
+    boxes.expectBox(cannotWrite(nothingToSave), QMessageBox::Ok);
     site.window->save();
     boxes.verify();
     QCOMPARE(readTestFile(paths::configuration()), configuration);
@@ -591,7 +716,10 @@ void FileCommandsTest::reloadKeepsChangedOutside()
     site.pressReload();
     boxes.verify();
     site.settle();
-    site.save(overwriteText);
+    site.modify();
+    boxes.expectBox(withLoss(saveQuestion(overwriteText), commentLoss), QMessageBox::Save);
+    site.pressSave();
+    boxes.verify();
     site.save(rewriteText);
 }
 
@@ -644,9 +772,9 @@ void FileCommandsTest::busyCursorShowsWhileMuchIsSaved()
     bool wasBusy{false};
     connect(site.model, &DhcpdConfigModel::error, this, [&wasBusy] { wasBusy = isCursorBusy(); });
     ModalBoxes &boxes{*m_boxes};
-    boxes.expectBox(saveQuestion(), QMessageBox::Save);
+    boxes.expectBox(withLoss(saveQuestion(), commentLoss), QMessageBox::Save);
     boxes.expectDialog<QMessageBox>([](QMessageBox *box) {
-        QCOMPARE(box->text(), cannotWrite().text);
+        QCOMPARE(box->text(), cannotWrite("").text);
         QVERIFY(!isCursorBusy());
         QTest::mouseClick(box->button(QMessageBox::Ok), Qt::LeftButton);
     });
@@ -740,7 +868,7 @@ void FileCommandsTest::unwrittenConfigurationIsKept()
     site.settle();
     site.modify();
     const QByteArray unsaved{site.model->fileContent()};
-    closeAlthoughNothingCanBeSaved(site, *m_boxes);
+    closeAlthoughNothingCanBeSaved(site, *m_boxes, "Is a directory");
     QCOMPARE(backups(), QList<QByteArray>{unsaved});
 }
 
@@ -755,7 +883,7 @@ void FileCommandsTest::nothingIsKeptOfNothing()
     boxes.verify();
     QVERIFY(site.isModified());
     site.settle();
-    closeAlthoughNothingCanBeSaved(site, boxes);
+    closeAlthoughNothingCanBeSaved(site, boxes, nothingToSave);
     QCOMPARE(backups(), QList<QByteArray>{});
     QVERIFY(!QFile::exists(paths::configuration()));
 }

@@ -6,6 +6,7 @@
 #include "tests/app/testmachine.h"
 #include "tests/support/modalboxes.h"
 #include "tests/support/temporaryroot.h"
+#include "tests/support/text.h"
 
 #include <QDir>
 #include <QFileSystemWatcher>
@@ -970,7 +971,7 @@ void MainWindowTest::configurationThatCannotBeReadIsReported()
     if (directory)
         QVERIFY(QDir{}.mkpath(paths::configuration()));
     ModalBoxes boxes;
-    boxes.expectBox(cannotRead(), QMessageBox::Ok);
+    boxes.expectBox(directory ? cannotRead(text("Is a directory")) : cannotRead(), QMessageBox::Ok);
     const FMain window;
     boxes.verify();
     QCOMPARE(treeOf(window)->model()->rowCount(), 0);

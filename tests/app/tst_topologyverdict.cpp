@@ -39,7 +39,7 @@ zone "example.org" IN {
 constexpr auto saved = R"(authoritative ;
 min-lease-time 120;
 option classless-static-routes code 121 = array of integer 8;
-option classless-static-routes 24, 192,168,1,0, 10,0,0,3;
+option classless-static-routes 24, 192,168,1, 10,0,0,3;
 option ms-classless-static-routes code 249 = array of unsigned integer 8;
 subnet 10.0.0.0 netmask 255.255.255.0 {
     option routers 10.0.0.1, 10.0.0.3;
@@ -57,7 +57,7 @@ subnet 10.0.0.0 netmask 255.255.255.0 {
 }
 host single {
     hardware ethernet 00:11:22:33:44:88;
-    option ms-classless-static-routes 16, 172,16,0,0, 10,0,0,1;
+    option ms-classless-static-routes 16, 172,16, 10,0,0,1;
     fixed-address 10.0.0.6;
 }
 shared-network attic {

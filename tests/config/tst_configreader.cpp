@@ -7,6 +7,9 @@
 #include <QRandomGenerator>
 #include <QTest>
 
+using Lines = std::vector<int>;
+Q_DECLARE_METATYPE(Lines)
+
 namespace {
 
 ConfigNode node(const char *words) { return {QString::fromUtf8(words).split(QLatin1Char{'|'})}; }
@@ -68,6 +71,8 @@ private slots:
     void agreesWithReferenceOnFiles();
     void endsOnAnyBytes_data();
     void endsOnAnyBytes();
+    void notesWhatItDoesNotKeep_data();
+    void notesWhatItDoesNotKeep();
 };
 
 void ConfigReaderTest::reads_data()
@@ -249,6 +254,49 @@ void ConfigReaderTest::endsOnAnyBytes()
     const auto tree = readConfiguration({bytes.constData(), static_cast<std::size_t>(bytes.size())}, *top);
     QVERIFY(tree);
     QTEST(tree->childCount(), "children");
+}
+
+void ConfigReaderTest::notesWhatItDoesNotKeep_data()
+{
+    QTest::addColumn<QByteArray>("content");
+    QTest::addColumn<int>("comments");
+    QTest::addColumn<Lines>("quotedTexts");
+    QTest::addColumn<Lines>("statements");
+    QTest::addColumn<Lines>("carriageReturns");
+    const auto row = [](const char *name, const char *content, int comments, const Lines &quotedTexts,
+                        const Lines &statements = {}, const Lines &carriageReturns = {}) {
+        QTest::addRow("%s", name) << QByteArray{content} << comments << quotedTexts << statements << carriageReturns;
+    };
+    row("nothing", "a b;\nc { d \"e f\"; }\n", 0, {});
+    row("comments", "# a\nb; # c \" # d\n#\n", 3, {});
+    row("comment sign in quotes", "a \"# b\"; # c\n", 1, {});
+    row("semicolons", "a;\noption vend \"s1ip=10.1.29.8;p1=4100;a1=1;\";\n", 0, {2});
+    row("braces", "\n\nfilename \"http://x?mac={mac}\";\n", 0, {3});
+    row("blanks in a row", "a \"a   b\";\n", 0, {1});
+    row("tab", "a \"a\tb\";\n", 0, {1});
+    row("line feed", "a;\nb \"c\nd\"; e \"  \";\n", 0, {2, 3});
+    row("single blanks", "a \" b c \"  \"\";\n", 0, {});
+    row("escaped quote", "a;\noption x \"5\\\" disk\"; # b\n", 0, {2});
+    row("escaped backslash", "a \"b\\\\\"; # c\n", 1, {});
+    row("keyword in quotes", "a;\nlog(info, \"bad range asked\");\n", 0, {2});
+    row("keyword behind others", "a;\nb subclass c;\n", 0, {}, {2});
+    row("keyword at the start", "range a b; fixed-address range; subclass \"range\" 1;\n", 0, {});
+    row("keyword in the heading of a block", "a range b { c; }\n", 0, {});
+    row("carriage returns", "a;\r\nb;\nc {\r\n}\r\n", 0, {}, {}, {1, 3, 4});
+    row("several in a line", "a \"b;\" \"c;\"; d \"e;\";\nf \"g;\";\n", 0, {1, 2});
+    row("quoted text without an end", "a \"b;\n", 0, {});
+}
+
+void ConfigReaderTest::notesWhatItDoesNotKeep()
+{
+    QFETCH(QByteArray, content);
+    const auto top = makeTop();
+    ReadingLosses losses;
+    QVERIFY(readConfiguration({content.constData(), static_cast<std::size_t>(content.size())}, *top, &losses));
+    QTEST(losses.comments, "comments");
+    QTEST(losses.quotedTextLines, "quotedTexts");
+    QTEST(losses.statementLines, "statements");
+    QTEST(losses.carriageReturnLines, "carriageReturns");
 }
 
 QTEST_GUILESS_MAIN(ConfigReaderTest)

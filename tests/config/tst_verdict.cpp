@@ -202,6 +202,16 @@ void VerdictTest::verdictOnEdit_data()
     accepted("static routes for MS systems", "", addRoutes(true));
     accepted("static routes of a subnet", "subnet 10.0", addRoutes(false));
     accepted("static routes of a host for MS systems", "host single", addRoutes(true));
+    for (const char *place :
+         {"", "subnet 10.0", "shared-network", "subnet 10.1", "group", "host grouped", "host single"}) {
+        for (const bool ms : {false, true}) {
+            const QByteArray name{QByteArray{"routes wherever: "} + place + (ms ? " for MS systems" : "")};
+            accepted(name, place, [ms](Model &model, const QModelIndex &parent) {
+                model.addRoutes({text("24"), text("192,168,1"), text("10,0,0,1")}, ms, parent);
+                model.addRoutes({text("0"), text("10,0,0,1")}, !ms, parent);
+            });
+        }
+    }
     accepted("static routes of both kinds in both places", "host single", [](Model &model, const QModelIndex &host) {
         for (const bool ms : {false, true, false, true}) {
             addRoutes(ms)(model, host);

@@ -170,10 +170,10 @@ host scanner.lan {
         Lines(
             """\
 Static route MS: code 249 = array of unsigned integer 8
-Static route MS: 24, 192,168,1,0, 10,1,0,1, 16, 172,16,0,0, 10,1,0,2""",
+Static route MS: 24, 192,168,1, 10,1,0,1, 16, 172,16, 10,1,0,2""",
             """\
 option ms-classless-static-routes code 249 = array of unsigned integer 8;
-option ms-classless-static-routes 24, 192,168,1,0, 10,1,0,1, 16, 172,16,0,0, 10,1,0,2;""",
+option ms-classless-static-routes 24, 192,168,1, 10,1,0,1, 16, 172,16, 10,1,0,2;""",
         ),
     ),
     Add(

@@ -207,7 +207,7 @@ shared-network "big lab" {
             False,
             steps(without_first("table"), cell(0, 2, "10.1.0.9")),
         ),
-        Lines("Static route: 16, 172,17,0,0, 10,1,0,9", "option classless-static-routes 16, 172,17,0,0, 10,1,0,9;"),
+        Lines("Static route: 16, 172,17, 10,1,0,9", "option classless-static-routes 16, 172,17, 10,1,0,9;"),
     ),
     Edit(
         ROOT,

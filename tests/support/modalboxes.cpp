@@ -229,4 +229,7 @@ void ModalBoxes::compare(const Box &expected, const QMessageBox &box) const
     check("detailed text", shown(box.detailedText()), shown(expected.detailedText));
 }
 
-ModalBoxes::Box errorBox(const QString &text) { return {QMessageBox::Critical, QStringLiteral("Error"), text}; }
+ModalBoxes::Box errorBox(const QString &text, const QString &reason)
+{
+    return {QMessageBox::Critical, QStringLiteral("Error"), text, QMessageBox::Ok, QMessageBox::Ok, reason};
+}

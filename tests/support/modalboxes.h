@@ -100,5 +100,5 @@ private:
     int m_open{0};
 };
 
-/// The box in which the program tells of an error.
-ModalBoxes::Box errorBox(const QString &text);
+/// The box in which the program tells of an error, with the reason below its text.
+ModalBoxes::Box errorBox(const QString &text, const QString &reason = {});
