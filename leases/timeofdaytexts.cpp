@@ -47,13 +47,8 @@ QString TimeOfDayTexts::text(QTime time) const
     const auto put = [&text](Field field, const QString &number) {
         text.replace(field.position, field.length, number);
     };
-    // From the back, so that the position of the other stays right.
-    if (hour.minute.position < hour.second.position) {
-        put(hour.second, second);
-        put(hour.minute, minute);
-    } else {
-        put(hour.minute, minute);
-        put(hour.second, second);
-    }
+    // No locale writes the second before the minute, whose position stays right like this.
+    put(hour.second, second);
+    put(hour.minute, minute);
     return text;
 }
