@@ -7,7 +7,7 @@ class LeaseTextPattern;
 
 /// Applies a pattern to many of a table's texts, of which few have the needle: one pass over the memory in which they
 /// lie finds where the next one can be, and all before are answered by their place. It is fast if they are asked for in
-/// the order in which they were added. Searching a million leases takes a quarter to a half less time with it.
+/// the order in which they were added. A search in a million leases takes up to half less time with it.
 class LeaseTextScan final
 {
 public:
