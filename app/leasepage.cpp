@@ -89,6 +89,8 @@ void LeasePage::update()
 void LeasePage::search(const QString &text)
 {
     m_matchPosition = 0;
+    QTableView &table{*m_ui.dhcpdLeaseTable};
+    const LeaseViewState viewState{table};
     // The filter respects letter case, the search among the rows that it left does not, deliberately.
     m_proxy.setFilterFixedString(text);
 
@@ -97,8 +99,12 @@ void LeasePage::search(const QString &text)
     m_ui.searchLease->setStyleSheet(QLatin1String{isFound || text.isEmpty() ? foundStyle : notFoundStyle});
     m_ui.searchPrevLease->setEnabled(isFound);
     m_ui.searchNextLease->setEnabled(isFound);
-    if (isFound)
+    if (isFound) {
         showMatch(first.first());
+    } else if (text.isEmpty()) {
+        viewState.restoreIn(table); // the lease that was found stays current among all others
+        table.scrollTo(table.currentIndex());
+    }
 }
 
 void LeasePage::step(int step)

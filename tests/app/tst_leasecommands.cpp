@@ -146,6 +146,7 @@ private slots:
     void search_data();
     void search();
     void searchForAnEnd();
+    void clearedSearchKeepsTheFoundLease();
     void clearedSearchShowsEverything();
     void matchesAreScrolledTo();
     void stepsDoNotWrap();
@@ -247,6 +248,21 @@ void LeaseCommandsTest::searchForAnEnd()
     QCOMPARE(site.addresses(), QStringList{QStringLiteral("10.0.1.9")});
     QCOMPARE(site.table->currentIndex().column(), int{DhcpdLeasesModel::End});
     QVERIFY(site.stepsAreEnabled());
+}
+
+void LeaseCommandsTest::clearedSearchKeepsTheFoundLease()
+{
+    QByteArray content;
+    for (int number{1}; number < 200; ++number)
+        content += lease("10.0.2." + QByteArray::number(number), "pc-" + QByteArray::number(number));
+    writeTestFile(paths::leases(), content);
+    const Site site{*m_machine};
+    site.type(QStringLiteral("pc-150"));
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.2.150"));
+    site.field->clear();
+    QCOMPARE(site.table->model()->rowCount(), 199);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.2.150"));
+    QVERIFY(site.table->viewport()->rect().intersects(site.table->visualRect(site.table->currentIndex())));
 }
 
 void LeaseCommandsTest::clearedSearchShowsEverything()
