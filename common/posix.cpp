@@ -65,7 +65,7 @@ QVector<QByteArray> entries(int directory)
     const std::unique_ptr<DIR, int (*)(DIR *)> stream{fdopendir(readable.get()), closedir};
     if (stream)
         readable.release(); // the stream closes it
-    while (const dirent *entry{stream ? readdir(stream.get()) : nullptr})
+    while (const auto *entry = stream ? readdir(stream.get()) : nullptr)
         names.append(entry->d_name);
     return names;
 }
