@@ -2,7 +2,7 @@
 """Closing the window with and without unsaved changes."""
 
 import machine
-from test_saving import CANNOT_WRITE, CONFIGURATION, NEW_LEASE_TIME, SAVED, SavingTest
+from test_saving import CANNOT_WRITE, CONFIGURATION, NEW_LEASE_TIME, READ_ONLY, SAVED, SavingTest
 from testcase import CANCELLATIONS
 
 
@@ -65,7 +65,7 @@ class Closing(SavingTest):
             self.main.close()
             self.confirmation().answer("Yes")
             self.save_question().answer("Save")
-            self.message("Error", CANNOT_WRITE).answer("OK")
+            self.message("Error", CANNOT_WRITE, informative_text=READ_ONLY).answer("OK")
             self.assert_ended()
         self.assertEqual(machine.CONFIGURATION.read_text(), CONFIGURATION)
         self.assertIn(SAVED, [backup.read_text() for backup in machine.backups()])

@@ -149,7 +149,9 @@ class StartWithoutConfiguration(ProgramTest):
 
     def start(self):
         self.launch()
-        self.message("Error", "Unable to open file '/etc/dhcp/dhcpd.conf' for read").answer("OK")
+        reason = "No such file or directory"
+        box = self.message("Error", "Unable to open file '/etc/dhcp/dhcpd.conf' for read", informative_text=reason)
+        box.answer("OK")
         self.main = self.program.window(desktop.MAIN_TITLE)
 
     def test_shows_an_empty_tree(self):

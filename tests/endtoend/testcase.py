@@ -74,6 +74,14 @@ class DesktopTest(unittest.TestCase):
         return box
 
 
+def told_comments(content):
+    """What the save question says of a file whose only signs for comments stand before comments."""
+    count = content.count("#")
+    if count == 0:
+        return ""
+    return "The " + (f"{count} comments" if count > 1 else "comment") + " of the file will not be kept."
+
+
 class ProgramTest(DesktopTest):
     """Each test has the machine as it was at first, and the program freshly started on it.
 
@@ -101,7 +109,9 @@ class ProgramTest(DesktopTest):
         return self.message("Information", question, buttons=["Yes", "No"], default="Yes")
 
     def save_question(self, text=SAVE_QUESTION):
-        return self.message("Information", text, buttons=["Save", "Cancel"], default="Save")
+        """Asks before a save, and tells of the comments that it drops, unless the file is another than was read."""
+        lost = told_comments(machine.CONFIGURATION.read_text()) if text == SAVE_QUESTION else ""
+        return self.message("Information", text, informative_text=lost, buttons=["Save", "Cancel"], default="Save")
 
     def save(self, text=SAVE_QUESTION):
         """Saves the configuration, which the server accepts."""
