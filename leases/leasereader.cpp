@@ -11,8 +11,10 @@ namespace {
 // Small enough that a piece is still in the processor's cache when it is parsed.
 constexpr std::size_t pieceSize{std::size_t{1} << 18U};
 
-// How much of what was read is compared: at the beginning and at the end, and in samples at regular distances.
-constexpr int comparedAtEnds{4096};
+// How much of what was read is compared: at the beginning, which is all of a small file, at the end, and in samples at
+// regular distances.
+constexpr int comparedAtBeginning{1 << 16};
+constexpr int comparedAtEnd{4096};
 constexpr int sampleSize{64};
 constexpr qint64 sampleDistance{1 << 20};
 
@@ -76,7 +78,7 @@ void LeaseReader::remember(std::string_view bytes)
     const QByteArray read{QByteArray::fromRawData(bytes.data(), static_cast<int>(bytes.size()))};
     QByteArray &sample{m_samples.back().bytes};
     // A sample that is not full yet ends where these bytes begin.
-    sample += read.left((m_samples.size() == 1 ? comparedAtEnds : sampleSize) - sample.size());
-    m_lastBytes += read.right(comparedAtEnds);
-    m_lastBytes = m_lastBytes.right(comparedAtEnds);
+    sample += read.left((m_samples.size() == 1 ? comparedAtBeginning : sampleSize) - sample.size());
+    m_lastBytes += read.right(comparedAtEnd);
+    m_lastBytes = m_lastBytes.right(comparedAtEnd);
 }

@@ -21,8 +21,8 @@ public:
     /// Empties the table; what is read next is a whole file.
     void clear();
 
-    /// Whether `file` is the one read last and begins with what was read then. Its beginning, its end and samples
-    /// between are compared.
+    /// Whether `file` is the one read last and begins with what was read then. A small file is compared as a whole, of
+    /// a large one its beginning, its end and samples between.
     bool continues(const LeaseFile &file) const;
     /// The number of bytes read so far.
     qint64 position() const { return m_position; }

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasetimetexts.h"
 
-#include <utility>
-
 namespace {
 
 // Far more days than a lease file names, and too few to take much memory.
@@ -18,7 +16,6 @@ QString LeaseTimeTexts::text(LeaseTime time)
 QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
 {
     followLocale();
-    followZone();
     if (!m_timesOfDay)
         m_timesOfDay.emplace(m_locale);
     return m_timesOfDay->text(time.time());
@@ -42,14 +39,4 @@ void LeaseTimeTexts::followLocale()
         m_dates.clear();
         m_timesOfDay.reset();
     }
-}
-
-/// At most once a second, since the locale takes microseconds to tell and the name changes with a second.
-void LeaseTimeTexts::followZone()
-{
-    const std::time_t now{std::time(nullptr)};
-    const QTime example{0, 0};
-    if (std::exchange(m_zoneChecked, now) != now && m_timesOfDay &&
-        m_timesOfDay->text(example) != m_locale.toString(example, QLocale::LongFormat))
-        m_timesOfDay.reset();
 }

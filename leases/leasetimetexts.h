@@ -8,12 +8,11 @@
 #include <QLocale>
 #include <QString>
 
-#include <ctime>
 #include <optional>
 
-/// The texts of times in the default locale: its long time, a separator and its narrow date. Long times usually name
-/// the local zone as it is called when the text is made, with daylight saving time or without. The locale takes
-/// microseconds for a text and few are distinct, so they are remembered.
+/// The texts of times in the default locale: its long time, a separator and its narrow date. Where the locale's long
+/// time names a zone, that is UTC: the server writes all its times in it. The locale takes microseconds for a text and
+/// few are distinct, so they are remembered.
 class LeaseTimeTexts final
 {
 public:
@@ -27,10 +26,8 @@ public:
 
 private:
     void followLocale();
-    void followZone();
 
     QLocale m_locale;
     QHash<quint32, QString> m_dates;
     std::optional<TimeOfDayTexts> m_timesOfDay;
-    std::time_t m_zoneChecked{};
 };

@@ -1,18 +1,39 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/timeofdaytexts.h"
 
+#include <QDateTime>
 #include <QLocale>
 
 #include <algorithm>
 #include <iterator>
+
+namespace {
+
+// The locale whose texts `locale` has for times: the system's may take them from another one, which Qt does not tell.
+QLocale localeOfTimes(const QLocale &locale)
+{
+    if (locale != QLocale::system())
+        return locale;
+    for (const char *variable : {"LC_ALL", "LC_TIME", "LANG"}) {
+        if (const QString name{qEnvironmentVariable(variable)}; !name.isEmpty())
+            return QLocale{name};
+    }
+    return locale;
+}
+
+} // namespace
 
 TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
 {
     // Two numbers with no digit in common.
     constexpr int number{11};
     constexpr int otherNumber{22};
-    const auto text = [&locale](int hour, int minute, int second) {
-        return locale.toString(QTime{hour, minute, second}, QLocale::LongFormat);
+    // A time without a date would be given the name of the local zone.
+    const QLocale timeLocale{localeOfTimes(locale)};
+    const QString format{timeLocale.timeFormat(QLocale::LongFormat)};
+    const QDate anyDay{1970, 1, 1};
+    const auto text = [&](int hour, int minute, int second) {
+        return timeLocale.toString(QDateTime{anyDay, QTime{hour, minute, second}, Qt::UTC}, format);
     };
     for (std::size_t i{0}; i < m_hours.size(); ++i) {
         const int hour{static_cast<int>(i)};

@@ -8,8 +8,8 @@
 
 class QLocale;
 
-/// The long texts of all times of day in one locale. The locale takes microseconds for each, but within an hour texts
-/// differ only in their minutes and seconds, so it is enough to ask for a few dozen.
+/// The long texts of all times of day in one locale, where a zone is named as UTC. The locale takes microseconds for
+/// each, but within an hour texts differ only in their minutes and seconds, so it is enough to ask for a few dozen.
 class TimeOfDayTexts final
 {
 public:

@@ -76,6 +76,8 @@ private slots:
     void updateOfAnUnchangedFileSaysNothing();
     void updateReadsTheWholeOfAnotherFile_data();
     void updateReadsTheWholeOfAnotherFile();
+    void updateNoticesAnEditOfTheSameLength_data();
+    void updateNoticesAnEditOfTheSameLength();
     void updateReadsEverythingAfterAnError();
     void updateEqualsReload();
 
@@ -460,6 +462,34 @@ void DhcpdLeasesModelTest::updateReadsTheWholeOfAnotherFile()
     model.update(m_path);
     QCOMPARE(resets.size(), 1);
     QCOMPARE(inserted.size(), 0);
+    QCOMPARE(rowsOf(model), referenceRows(readTestFile(m_path)));
+}
+
+void DhcpdLeasesModelTest::updateNoticesAnEditOfTheSameLength_data()
+{
+    QTest::addColumn<int>("lease");
+    for (const int lease : {1, 60, 120, 180, 199})
+        QTest::addRow("lease %d of 200", lease) << lease;
+}
+
+/// In a file of the size that most servers have: some 50 KiB.
+void DhcpdLeasesModelTest::updateNoticesAnEditOfTheSameLength()
+{
+    QFETCH(const int, lease);
+    QByteArray file;
+    for (int i{0}; i < 200; ++i)
+        file += leaseBlock(0, i, i % 7);
+    QVERIFY(file.size() > 40'000 && file.size() < 60'000);
+    writeTestFile(m_path, file);
+    DhcpdLeasesModel model;
+    model.reload(m_path);
+    QCOMPARE(model.rowCount(), 200);
+
+    const int block{file.indexOf(leaseBlock(0, lease, lease % 7))};
+    const int mac{file.indexOf("hardware ethernet ", block) + int{sizeof "hardware ethernet"}};
+    overwrite(m_path, mac, "ab:cd:ef");
+    model.update(m_path);
+    QVERIFY(model.index(lease, DhcpdLeasesModel::Mac).data().toString().startsWith(text("ab:cd:ef")));
     QCOMPARE(rowsOf(model), referenceRows(readTestFile(m_path)));
 }
 

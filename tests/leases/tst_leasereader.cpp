@@ -151,6 +151,9 @@ void LeaseReaderTest::noticesChangesInWhatCameInSmallPieces_data()
     QTest::addColumn<int>("changed");        // the offset of a byte that is another then
     QTest::addRow("beginning") << QVector<int>{1, 20'000} << 1000;
     QTest::addRow("last compared byte of the beginning") << QVector<int>{1, 2, 4000, 4095, 20'000} << 4095;
+    QTest::addRow("last byte of a small file") << QVector<int>{65'535} << 65'534;
+    QTest::addRow("middle of a small file") << QVector<int>{300, 60'000} << 30'000;
+    QTest::addRow("beginning of a large file") << QVector<int>{1, 65'537, 200'000} << 65'535;
     QTest::addRow("sample") << QVector<int>{sampleDistance, sampleDistance + 10, sampleDistance + 20'000}
                             << sampleDistance + 40;
 }

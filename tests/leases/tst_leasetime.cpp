@@ -5,6 +5,7 @@
 #include "leases/timeofdaytexts.h"
 
 #include <QDateTime>
+#include <QProcess>
 #include <QRandomGenerator>
 #include <QTest>
 
@@ -54,8 +55,12 @@ private slots:
     void isShownInTheDefaultLocale();
     void hasNoTextIfInvalid();
     void remembersNoWrongTexts();
-    void namesTheZoneAsItIsCalledNow();
+    void namesUtcWhateverTheLocalZone_data();
+    void namesUtcWhateverTheLocalZone();
     void knowsAllTimesOfDayInAllLocales();
+    void isShownInTheSystemsLocale();
+    void followsTheEnvironment_data();
+    void followsTheEnvironment();
 };
 
 void LeaseTimeTest::cleanup() { QLocale::setDefault(QLocale::c()); }
@@ -213,14 +218,30 @@ void LeaseTimeTest::remembersNoWrongTexts()
     QCOMPARE(texts.text(time), german);
 }
 
-void LeaseTimeTest::namesTheZoneAsItIsCalledNow()
+void LeaseTimeTest::namesUtcWhateverTheLocalZone_data()
 {
-    LeaseTimeTexts texts;
-    const LeaseTime time{parsed("2026/01/02", "13:04:05")};
-    const LocalZone winter{"CET-1"};
-    QCOMPARE(texts.text(time), QStringLiteral("13:04:05 CET 2 Jan 2026"));
-    const LocalZone summer{"CEST-2"};
-    QTRY_COMPARE(texts.text(time), QStringLiteral("13:04:05 CEST 2 Jan 2026"));
+    QTest::addColumn<QByteArray>("zone");
+    QTest::addColumn<QString>("locale");
+    QTest::addColumn<QString>("text");
+    const auto addRow = [](const char *zone, const char *locale, const char *text) {
+        QTest::addRow("%s in %s", locale, zone)
+            << QByteArray{zone} << QString::fromUtf8(locale) << QString::fromUtf8(text);
+    };
+    for (const char *zone : {"UTC", "CET-1", "CET-1CEST,0/0,J365/23", "Asia/Kolkata", "<+0330>-3:30"}) {
+        addRow(zone, "C", "13:04:05 UTC 2 Jan 2026");
+        addRow(zone, "de_DE", "13:04:05 UTC 02.01.26");
+        addRow(zone, "en_US", "1:04:05 PM UTC 1/2/26");
+    }
+}
+
+void LeaseTimeTest::namesUtcWhateverTheLocalZone()
+{
+    QFETCH(const QByteArray, zone);
+    QFETCH(const QString, locale);
+    QFETCH(const QString, text);
+    const LocalZone local{zone};
+    QLocale::setDefault(QLocale{locale});
+    QCOMPARE(LeaseTimeTexts{}.text(parsed("2026/01/02", "13:04:05")), text);
 }
 
 void LeaseTimeTest::knowsAllTimesOfDayInAllLocales()
@@ -236,6 +257,51 @@ void LeaseTimeTest::knowsAllTimesOfDayInAllLocales()
             QCOMPARE(texts.text(time), locale.toString(time, QLocale::LongFormat));
         }
     }
+}
+
+/// Whatever that is here; the next test runs this one in other environments.
+void LeaseTimeTest::isShownInTheSystemsLocale()
+{
+    const QLocale locale{QLocale::system()};
+    QLocale::setDefault(locale);
+    for (const int hour : {0, 4, 12, 23}) {
+        const QTime time{hour, 16, 38};
+        const LeaseTime leaseTime{
+            parsed("2026/01/02", QLocale::c().toString(time, QStringLiteral("hh:mm:ss")).toLatin1())};
+        QCOMPARE(LeaseTimeTexts{}.text(leaseTime), locale.toString(time, QLocale::LongFormat) + QLatin1Char{' '} +
+                                                       locale.toString(QDate{2026, 1, 2}, QLocale::NarrowFormat));
+    }
+}
+
+void LeaseTimeTest::followsTheEnvironment_data()
+{
+    QTest::addColumn<QStringList>("variables");
+    QTest::newRow("one language") << QStringList{QStringLiteral("LANG=de_DE.UTF-8")};
+    QTest::newRow("other times") << QStringList{QStringLiteral("LANG=ar_EG.UTF-8"),
+                                                QStringLiteral("LC_TIME=en_US.UTF-8")};
+    QTest::newRow("other digits of times")
+        << QStringList{QStringLiteral("LANG=en_US.UTF-8"), QStringLiteral("LC_TIME=fa_IR.UTF-8")};
+    QTest::newRow("other numbers") << QStringList{QStringLiteral("LANG=en_US.UTF-8"),
+                                                  QStringLiteral("LC_NUMERIC=fa_IR")};
+    QTest::newRow("all") << QStringList{QStringLiteral("LANG=en_US"), QStringLiteral("LC_TIME=de_DE"),
+                                        QStringLiteral("LC_ALL=fa_IR")};
+    QTest::newRow("none") << QStringList{};
+}
+
+void LeaseTimeTest::followsTheEnvironment()
+{
+    QFETCH(const QStringList, variables);
+    QProcessEnvironment environment{QProcessEnvironment::systemEnvironment()};
+    for (const char *variable : {"LC_ALL", "LC_TIME", "LC_NUMERIC", "LANG", "LANGUAGE"})
+        environment.remove(QString::fromLatin1(variable));
+    for (const QString &variable : variables)
+        environment.insert(variable.section(QLatin1Char{'='}, 0, 0), variable.section(QLatin1Char{'='}, 1));
+    QProcess itself;
+    itself.setProcessEnvironment(environment);
+    itself.start(QCoreApplication::applicationFilePath(), {QStringLiteral("isShownInTheSystemsLocale")});
+    QVERIFY(itself.waitForFinished(-1));
+    QVERIFY2(itself.exitStatus() == QProcess::NormalExit && itself.exitCode() == 0,
+             itself.readAllStandardOutput().constData());
 }
 
 QTEST_GUILESS_MAIN(LeaseTimeTest)
