@@ -303,6 +303,7 @@ void DeclarationCommands::addBind9Settings()
         return;
     DhcpdConfigModel &model{m_commands.model()};
     m_commands.addTo(
-        parent, [&] { model.addBind9(bind9::prepared(file, model.keyNames(parent)), parent); },
+        parent,
+        [&] { model.addBind9(bind9::prepared(file, model.keyNames(parent), model.keyNames()).statements, parent); },
         StatementCommands::OpenBranches::All);
 }

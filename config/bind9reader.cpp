@@ -3,6 +3,8 @@
 
 #include "common/fileio.h"
 #include "common/textencoding.h"
+#include "config/bind9contents.h"
+#include "config/bind9words.h"
 #include "config/values.h"
 
 #include <QDir>
@@ -10,18 +12,27 @@
 #include <QHash>
 #include <QRegularExpression>
 #include <QSet>
-#include <QVector>
 
 #include <algorithm>
+#include <iterator>
 #include <utility>
+
+using bind9::isDelimiter;
+using bind9::Key;
+using bind9::LeftOutZone;
+using bind9::quote;
+using bind9::Zone;
 
 namespace {
 
-// Of included files: how deep they may include each other, and how many bytes they may be together.
+// Of a file and those that it includes: how deep they may include each other, and how many files and bytes are read.
 constexpr int maximumIncludeDepth{16};
+constexpr int maximumFiles{1000};
 constexpr int maximumTotalSize{16 * 1024 * 1024};
 
-constexpr QLatin1Char quote{'"'};
+// What the DHCP server can read as one word.
+constexpr int longestWord{1499};
+
 constexpr QLatin1Char dot{'.'};
 
 const QLatin1String zoneKeyword{"zone"};
@@ -35,7 +46,49 @@ constexpr int wordsOfHeading{4}; // of a zone, with the address of the name serv
 
 bool isBlank(QChar c) { return c == QLatin1Char{' '} || c == QLatin1Char{'\t'} || c == QLatin1Char{'\n'}; }
 
-bool isDelimiter(QChar c) { return c == QLatin1Char{';'} || c == QLatin1Char{'{'} || c == QLatin1Char{'}'}; }
+/// Reads a file and those that it includes.
+class FileReader final
+{
+public:
+    /// The text of a file, without comments and with the text of other files in the place of the statements that
+    /// include them; empty when it cannot be read, or when that would be too much.
+    QString read(const QString &path);
+
+private:
+    QStringList m_openFiles;
+    int m_filesLeft{maximumFiles};
+    int m_sizeLeft{maximumTotalSize};
+};
+
+QString FileReader::read(const QString &path)
+{
+    const QFileInfo file{path};
+    const QString canonicalPath{file.canonicalFilePath()};
+    if (m_openFiles.contains(canonicalPath) || m_openFiles.size() >= maximumIncludeDepth || m_filesLeft == 0)
+        return {};
+    --m_filesLeft;
+    const std::optional<QByteArray> bytes{fileio::readFile(path)};
+    if (!bytes || bytes->size() > m_sizeLeft)
+        return {};
+    m_sizeLeft -= bytes->size();
+
+    m_openFiles += canonicalPath;
+    const QString text{bind9::withoutComments(TextEncoding::detect(*bytes).decode(*bytes))};
+    QString result;
+    int position{};
+    for (bind9::Words statement{text}; statement.next();) {
+        const QStringList &words{statement.words()};
+        const bool isInclude{words.size() == 2 && statement.delimiter() == QLatin1Char{';'} &&
+                             words.first().toLower() == QLatin1String{"include"} && words.last().startsWith(quote)};
+        if (!isInclude)
+            continue;
+        result += text.midRef(position, statement.begin() - position);
+        result += read(file.dir().absoluteFilePath(bind9::unescaped(words.last())));
+        position = statement.end();
+    }
+    m_openFiles.removeLast();
+    return result + text.midRef(position);
+}
 
 int endOfLine(const QString &text, int position)
 {
@@ -43,163 +96,10 @@ int endOfLine(const QString &text, int position)
     return end < 0 ? text.size() : end;
 }
 
-// Where the comment that starts at `position` ends; `position` when none does.
-int endOfComment(const QString &text, int position)
-{
-    const auto rest = QStringView{text}.mid(position);
-    if (rest.startsWith(QLatin1String{"//"}) || rest.startsWith(QLatin1Char{'#'}))
-        return endOfLine(text, position);
-    if (!rest.startsWith(QLatin1String{"/*"}))
-        return position;
-    const int end{text.indexOf(QLatin1String{"*/"}, position + 2)};
-    return end < 0 ? text.size() : end + 2;
-}
-
-// The text of a file, without comments and with the text of other files in the place of the statements that include
-// them. `includedBy` are the files that led here.
-QString textWithIncludes(const QString &path, QStringList includedBy, int &sizeLeft)
-{
-    static const QRegularExpression include{QStringLiteral(R"re(\binclude\s+"([^"]*)"\s*;)re"),
-                                            QRegularExpression::CaseInsensitiveOption};
-    const QFileInfo file{path};
-    const QString canonicalPath{file.canonicalFilePath()};
-    if (includedBy.contains(canonicalPath) || includedBy.size() >= maximumIncludeDepth)
-        return {};
-    const auto bytes = fileio::readFile(path);
-    if (!bytes || bytes->size() > sizeLeft)
-        return {};
-    sizeLeft -= bytes->size();
-    includedBy += canonicalPath;
-
-    const QString text{bind9::withoutComments(TextEncoding::detect(*bytes).decode(*bytes))};
-    QString result;
-    int position{};
-    for (auto it = include.globalMatch(text); it.hasNext();) {
-        const auto match = it.next();
-        result += text.midRef(position, match.capturedStart() - position);
-        result += textWithIncludes(file.dir().absoluteFilePath(match.captured(1)), includedBy, sizeLeft);
-        position = match.capturedEnd();
-    }
-    return result + text.midRef(position);
-}
-
-// Goes through a text statement by statement. Blanks and delimiters between quotes are part of a word.
-class Words final
-{
-public:
-    explicit Words(const QString &text)
-        : m_text{text}
-    {
-    }
-
-    /// Reads the words up to the next delimiter; false when there is none.
-    bool next();
-    const QStringList &words() const { return m_words; }
-    QChar delimiter() const { return m_text.at(m_position - 1); }
-
-private:
-    const QString &m_text;
-    int m_position{};
-    QStringList m_words;
-};
-
-bool Words::next()
-{
-    m_words.clear();
-    QString word;
-    bool quoted{};
-    while (m_position < m_text.size()) {
-        const QChar c{m_text.at(m_position++)};
-        if (c == quote)
-            quoted = !quoted;
-        if (quoted || !(c.isSpace() || isDelimiter(c))) {
-            word += c;
-            continue;
-        }
-        if (!word.isEmpty())
-            m_words += std::exchange(word, {});
-        if (isDelimiter(c))
-            return true;
-    }
-    return false;
-}
-
-enum class Block
-{
-    Outermost, // also a view, which holds the same
-    Zone,
-    Updaters, // who may update a zone
-    Key,
-    Other
-};
-
-bool hasHeading(Block block) { return block == Block::Zone || block == Block::Key; }
-
-QString lowerKeyword(const QStringList &words) { return words.value(0).toLower(); }
-
-Block blockWithin(Block outer, const QStringList &words)
-{
-    const QString keyword{lowerKeyword(words)};
-    if (outer == Block::Outermost) {
-        if (keyword == QLatin1String{"view"})
-            return Block::Outermost;
-        if (keyword == zoneKeyword)
-            return Block::Zone;
-        if (keyword == keyKeyword)
-            return Block::Key;
-    }
-    const bool isForUpdaters{keyword == QLatin1String{"allow-update"} || keyword == QLatin1String{"update-policy"}};
-    return outer == Block::Zone && isForUpdaters ? Block::Updaters : Block::Other;
-}
-
-// What a statement of `block` is worth in a text of zones and keys: a keyword and a word, or nothing.
-QStringList keptWords(Block block, const QStringList &words)
-{
-    const QString keyword{lowerKeyword(words)};
-    const QString value{words.value(1)};
-    if (block == Block::Updaters && (keyword == keyKeyword || keyword == QLatin1String{"grant"}))
-        return {keyKeyword, value};
-    if (block == Block::Key && (keyword == algorithmKeyword || keyword == secretKeyword))
-        return {keyword, value};
-    return {};
-}
-
-QStringList keptHeading(Block block, const QStringList &words)
-{
-    if (block == Block::Key)
-        return {keyKeyword, words.value(1)};
-    QString name{values::unquoted(words.value(1))};
-    if (name.endsWith(dot))
-        name.chop(1); // statements() appends one
-    return {zoneKeyword, name};
-}
-
 bool dropsStatement(const QString &word)
 {
     static const QStringList words{QStringLiteral("type"), QStringLiteral("file"), QStringLiteral("allow-update")};
     return words.contains(word);
-}
-
-// Whether statements() would misread a value that stands without quotes: some words mean the same to it wherever they
-// stand, and a slash starts a comment.
-bool needsQuotes(const QString &value)
-{
-    return dropsStatement(value) || value == zoneKeyword ||
-           (value.contains(QLatin1Char{'/'}) && !value.contains(quote));
-}
-
-// Appends a statement of two words; false when there is none, or when statements() would not keep it together.
-bool appendStatement(QString &text, const QStringList &words, QChar delimiter)
-{
-    QString value{words.value(1)};
-    const bool isWhole{
-        std::none_of(value.cbegin(), value.cend(), [](QChar c) { return isBlank(c) || isDelimiter(c); })};
-    if (value.isEmpty() || !isWhole)
-        return false;
-    if (needsQuotes(value))
-        value = quote + value + quote;
-    text += words.first() + QLatin1Char{' '} + value + delimiter + QLatin1Char{'\n'};
-    return true;
 }
 
 // What a statement that ends with `delimiter` adds to the statement list.
@@ -253,59 +153,156 @@ bool isZoneAt(const QStringList &statements, int position)
     return statements.value(position) == zoneKeyword && statements.value(position + 2) == primaryKeyword;
 }
 
+// Whether the DHCP server reads `text` as the name of a host or a zone.
+bool isHostName(const QString &text)
+{
+    static const QRegularExpression hostName{QStringLiteral(R"re(\A[A-Za-z0-9-][\w-]*(\.[A-Za-z0-9-][\w-]*)*\.?\z)re")};
+    return text.size() <= longestWord && hostName.match(text).hasMatch();
+}
+
+// Whether the DHCP server reads `text` as the bytes of a key: what is left of the last one must be padded, or zero.
+bool isBase64(const QString &text)
+{
+    static const QRegularExpression base64{QStringLiteral(
+        R"re(\A([A-Za-z0-9+/]{4})*(|[A-Za-z0-9+/][AQgw]=*|[A-Za-z0-9+/]{2}[AEIMQUYcgkosw048]=*|[A-Za-z0-9+/]{2}==|[A-Za-z0-9+/]{3}=)\z)re")};
+    return !text.isEmpty() && text.size() <= longestWord && base64.match(text).hasMatch();
+}
+
+// Of a word: whether it has no quotes but around the whole, and nothing that its quotes would have to protect from the
+// reader of the configuration.
+bool isPlainOrQuoted(const QString &word)
+{
+    const QString text{values::unquoted(word)};
+    return !text.isEmpty() && text.toUtf8().size() <= longestWord && (word == text || word == values::quoted(text)) &&
+           std::none_of(text.cbegin(), text.cend(), [](QChar c) {
+               return isBlank(c) || isDelimiter(c) || c == bind9::escape || c == QLatin1Char{'\0'};
+           });
+}
+
+bool isUsableSecret(const QString &word) { return isPlainOrQuoted(word) && isBase64(values::unquoted(word)); }
+
+bool isUsableAlgorithm(const QString &word) { return isPlainOrQuoted(word) && isHostName(values::unquoted(word)); }
+
+bool isUsableKey(const Key &key)
+{
+    QStringList algorithms;
+    QStringList secrets;
+    for (const auto &[keyword, word] : key.statements)
+        (keyword == algorithmKeyword ? algorithms : secrets) += word;
+    return isPlainOrQuoted(key.name) && algorithms.size() == 1 && isUsableAlgorithm(algorithms.first()) &&
+           secrets.size() == 1 && isUsableSecret(secrets.first());
+}
+
+// The name of a key as the DHCP server takes it.
+QString acceptedName(const QString &name) { return isHostName(name) ? name : values::quoted(values::unquoted(name)); }
+
+/// Chooses of what was read the keys and zones that the DHCP server accepts.
+class Choice final
+{
+public:
+    Choice(bind9::Contents contents, const QStringList &knownKeys, const QStringList &allKeys);
+
+    const bind9::Contents &chosen() const { return m_chosen; }
+    const QVector<LeftOutZone> &leftOut() const { return m_leftOut; }
+
+private:
+    enum class KeyState
+    {
+        Usable,
+        Behind, // declared in the configuration, but behind the place of adding
+        Refused
+    };
+
+    void chooseZone(Zone zone);
+    void leaveOut(const Zone &zone, LeftOutZone::Reason reason);
+
+    QHash<QString, KeyState> m_keys;
+    bind9::Contents m_chosen;
+    QVector<LeftOutZone> m_leftOut;
+};
+
+Choice::Choice(bind9::Contents contents, const QStringList &knownKeys, const QStringList &allKeys)
+{
+    for (const auto &entry : contents) {
+        const auto *key = std::get_if<Key>(&entry);
+        if (!key)
+            continue;
+        KeyState &state{
+            *m_keys.insert(comparableName(key->name), m_keys.value(comparableName(key->name), KeyState::Refused))};
+        if (isUsableKey(*key))
+            state = KeyState::Usable;
+    }
+    for (const QString &name : allKeys)
+        m_keys.insert(comparableName(name), KeyState::Behind);
+    for (const QString &name : knownKeys)
+        m_keys.insert(comparableName(name), KeyState::Usable);
+
+    for (auto &entry : contents) {
+        if (auto *zone = std::get_if<Zone>(&entry)) {
+            chooseZone(std::move(*zone));
+            continue;
+        }
+        Key &key{std::get<Key>(entry)};
+        if (isUsableKey(key) && m_keys.value(comparableName(key.name)) == KeyState::Usable) {
+            key.name = acceptedName(key.name);
+            m_chosen.emplace_back(std::move(key));
+        }
+    }
+}
+
+void Choice::chooseZone(Zone zone)
+{
+    using Reason = LeftOutZone::Reason;
+    if (!zone.isPrimary) {
+        leaveOut(zone, Reason::NotPrimary);
+        return;
+    }
+    if (zone.updaters.isEmpty()) {
+        leaveOut(zone, Reason::NoUpdateKey);
+        return;
+    }
+    if (!isHostName(zone.name) || zone.name.endsWith(dot)) {
+        leaveOut(zone, Reason::RefusedName);
+        return;
+    }
+    const auto updater = std::find_if(zone.updaters.cbegin(), zone.updaters.cend(), [this](const QString &name) {
+        return isPlainOrQuoted(name) && m_keys.value(comparableName(name), KeyState::Refused) == KeyState::Usable;
+    });
+    if (updater != zone.updaters.cend()) {
+        zone.updaters = QStringList{acceptedName(*updater)};
+        m_chosen.emplace_back(std::move(zone));
+        return;
+    }
+    const auto state = m_keys.constFind(comparableName(zone.updaters.first()));
+    if (state == m_keys.cend())
+        leaveOut(zone, Reason::UnknownKey);
+    else
+        leaveOut(zone, *state == KeyState::Behind ? Reason::KeyBehind : Reason::RefusedKey);
+}
+
+void Choice::leaveOut(const Zone &zone, LeftOutZone::Reason reason)
+{
+    m_leftOut.append({zone.name, reason, values::unquoted(zone.updaters.value(0))});
+}
+
 } // namespace
 
 namespace bind9 {
 
-QStringList prepared(const QString &path, const QStringList &knownKeys) { return usable(readFile(path), knownKeys); }
-
-QStringList readFile(const QString &path)
+Preparation prepared(const QString &path, const QStringList &knownKeys, const QStringList &allKeys)
 {
-    int sizeLeft{maximumTotalSize};
-    return statements(zonesAndKeys(textWithIncludes(path, {}, sizeLeft)));
+    return preparedText(FileReader{}.read(path), knownKeys, allKeys);
 }
 
-QString withoutComments(const QString &text)
+Preparation preparedText(const QString &text, const QStringList &knownKeys, const QStringList &allKeys)
 {
-    QString result;
-    result.reserve(text.size());
-    bool quoted{};
-    for (int i{}; i < text.size();) {
-        if (const int end{quoted ? i : endOfComment(text, i)}; end > i) {
-            result += QLatin1Char{' '};
-            i = end;
-            continue;
-        }
-        const QChar c{text.at(i++)};
-        if (c == quote)
-            quoted = !quoted;
-        result += c;
-    }
-    return result;
+    const Choice choice{readContents(text), knownKeys, allKeys};
+    QStringList acceptedKeys;
+    std::transform(knownKeys.cbegin(), knownKeys.cend(), std::back_inserter(acceptedKeys), acceptedName);
+    return {usable(bind9::statements(textOf(choice.chosen())), acceptedKeys), choice.leftOut()};
 }
 
-QString zonesAndKeys(const QString &text)
-{
-    QString result;
-    QVector<Block> blocks{Block::Outermost};
-    for (Words statement{text}; statement.next();) {
-        const QChar delimiter{statement.delimiter()};
-        const Block block{blocks.last()};
-        if (delimiter == QLatin1Char{';'}) {
-            appendStatement(result, keptWords(block, statement.words()), delimiter);
-        } else if (delimiter == QLatin1Char{'{'}) {
-            const Block inner{blockWithin(block, statement.words())};
-            const bool isKept{!hasHeading(inner) ||
-                              appendStatement(result, keptHeading(inner, statement.words()), delimiter)};
-            blocks += isKept ? inner : Block::Other;
-        } else if (blocks.size() > 1) {
-            if (hasHeading(block))
-                result += QLatin1String{"};\n"};
-            blocks.removeLast();
-        }
-    }
-    return result;
-}
+QString zonesAndKeys(const QString &text) { return textOf(readContents(text)); }
 
 QStringList statements(const QString &text)
 {

@@ -1,12 +1,18 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/bind9reader.h"
+#include "config/bind9words.h"
+#include "config/dhcpdconfigmodel.h"
 #include "config/values.h"
+#include "tests/support/realdhcpd.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QDir>
 #include <QRandomGenerator>
 #include <QTemporaryDir>
 #include <QTest>
+
+#include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -38,9 +44,31 @@ constexpr auto keyAndTwoZonesStatements = R"(key|"ddns-key"|algorithm|hmac-sha25
                                           R"(|zone|example.org.|primary|127.0.0.1|key|"ddns-key")"
                                           R"(|zone|1.168.192.in-addr.arpa.|primary|127.0.0.1|key|"ddns-key")";
 
+// Each zone that was left out with the reason and its key.
+QStringList described(const QVector<bind9::LeftOutZone> &zones)
+{
+    static const QStringList reasons{words("not primary|no key|refused name|unknown key|refused key|key behind")};
+    QStringList texts;
+    for (const bind9::LeftOutZone &zone : zones) {
+        texts +=
+            QStringLiteral("%1: %2 %3").arg(zone.name, reasons.at(static_cast<int>(zone.reason)), zone.key).trimmed();
+    }
+    return texts;
+}
+
+// The configuration of a server to which the zones and keys of a bind9 configuration were added.
+QByteArray configurationWith(const QStringList &statements, const QString &before = {})
+{
+    DhcpdConfigModel model{{QString{}, QString{}}};
+    model.parse(before);
+    if (!statements.isEmpty())
+        model.addBind9(statements, model.index(0, 0));
+    return model.fileContent();
+}
+
 QStringList preparedFrom(const QTemporaryDir &folder, const char *file, const QStringList &knownKeys = {})
 {
-    return bind9::prepared(folder.filePath(QString::fromUtf8(file)), knownKeys);
+    return bind9::prepared(folder.filePath(QString::fromUtf8(file)), knownKeys).statements;
 }
 
 } // namespace
@@ -64,8 +92,15 @@ private slots:
     void followsIncludes();
     void limitsDepthOfIncludes();
     void limitsSizeOfIncludes();
+    void limitsNumberOfFiles();
+    void comesToAnEndWhereFilesIncludeEachOther();
     void givesNothingForUnreadableFile();
     void survivesAnyText();
+    void tellsWhatIsLeftOut_data();
+    void tellsWhatIsLeftOut();
+    void leavesOutWhatTheServerRefuses_data();
+    void leavesOutWhatTheServerRefuses();
+    void givesTheServerNothingThatItRefuses();
 };
 
 void Bind9ReaderTest::scansStatements_data()
@@ -142,6 +177,9 @@ void Bind9ReaderTest::removesComments_data()
     row("hash to the end", "a #", "a  ");
     row("block to the end", "a /* b", "a  ");
     row("slash at the end", "a /", "a /");
+    row("escaped quote", R"("a\"b // c" d // e)", R"("a\"b // c" d  )");
+    row("escaped backslash", R"("a\\" // "b)", R"("a\\"  )");
+    row("backslash outside quotes", R"(a \" // " b)", R"(a \" // " b)");
     row("empty", "", "");
 }
 
@@ -201,6 +239,38 @@ void Bind9ReaderTest::keepsZonesAndKeys_data()
     row("blocks left open", "zone a { allow-update { key k; ", "zone|a.|primary|127.0.0.1|key|k");
     row("words before a closing brace", "key k { algorithm a; secret s }", "key|k|algorithm|a");
     row("unbalanced quote", "zone \"a { allow-update { key k; }; };", "");
+    row("escaped quote", R"(options { version "\"; zone x { allow-update { key k; }; }; \\"; }; zone a { };)",
+        "zone|a.|primary|127.0.0.1");
+    row("list with a name", "acl \"us\" { 10.0.0.1; key k; !key x; }; zone a { allow-update { us; }; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("list with a name in other quotes and case, behind the zone",
+        R"(zone a { allow-update { "Us"; key l; }; }; ACL us { key k; };)", "zone|a.|primary|127.0.0.1|key|k|key|l");
+    row("list within a list", "acl a { b; { key k; }; }; acl b { key l; }; zone a { allow-update { a; }; };",
+        "zone|a.|primary|127.0.0.1|key|l|key|k");
+    row("lists in a circle", "acl a { b; key k; }; acl b { a; key l; }; zone a { allow-update { a; }; };",
+        "zone|a.|primary|127.0.0.1|key|l|key|k");
+    row("denied list with a name", "acl us { key x; }; zone a { allow-update { !us; key k; }; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("no list of that name", "acl us { key x; }; zone a { allow-update { them; any; key k; }; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("updaters of the options", "zone a { type master; }; options { allow-update { key k; }; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("updaters of a view",
+        "options { allow-update { key o; }; }; view v { zone a { type primary; }; allow-update { key v; }; };"
+        "view w { zone b { type primary; }; }; zone c { type primary; };",
+        "zone|a.|primary|127.0.0.1|key|v|zone|b.|primary|127.0.0.1|key|o|zone|c.|primary|127.0.0.1|key|o");
+    row("updaters of the zone itself before those of the options",
+        "options { allow-update { key o; }; }; zone a { type master; allow-update { none; }; };"
+        "zone b { type master; update-policy local; }; zone c { type master; update-policy { grant g zonesub; }; };",
+        "zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|zone|c.|primary|127.0.0.1|key|g");
+    row("updaters of the options by a list with a name",
+        "acl us { key k; }; options { allow-update { us; }; }; zone a { type master; };",
+        "zone|a.|primary|127.0.0.1|key|k");
+    row("copies of zones have no updaters of the options",
+        "options { allow-update { key o; }; }; zone a { type slave; }; zone b { type hint; }; view v { zone c { "
+        "in-view w; "
+        "}; };",
+        "zone|a.|primary|127.0.0.1|zone|b.|primary|127.0.0.1|zone|c.|primary|127.0.0.1");
 }
 
 void Bind9ReaderTest::keepsZonesAndKeys()
@@ -287,7 +357,7 @@ void Bind9ReaderTest::preparesFile_data()
         "view b { zone \"a\" { type slave; masters { 10.0.0.1 key k; }; }; };\n"
         "key k { secret \"YQ==\"; algorithm hmac-md5; };",
         "key|k|secret|\"YQ==\"|algorithm|hmac-md5|zone|a.|primary|127.0.0.1|key|k");
-    row("Latin-1", "// \xFC\nkey k { algorithm a; secret \"s\"; };", "key|k|algorithm|a|secret|\"s\"");
+    row("Latin-1", "// \xFC\nkey k { algorithm a; secret \"YQ==\"; };", "key|k|algorithm|a|secret|\"YQ==\"");
 }
 
 void Bind9ReaderTest::preparesFile()
@@ -305,9 +375,9 @@ void Bind9ReaderTest::followsIncludes_data()
     QTest::addColumn<QByteArray>("key");   // keys/ddns.key
     QTest::addColumn<QStringList>("expected");
 
-    const QByteArray key{"key k { algorithm a; secret \"s\"; };"};
+    const QByteArray key{"key k { algorithm a; secret \"YQ==\"; };"};
     const QByteArray zone{"zone a { allow-update { key k; }; };"};
-    const QStringList keyWords{words("key|k|algorithm|a|secret|\"s\"")};
+    const QStringList keyWords{words("key|k|algorithm|a|secret|\"YQ==\"")};
     const QStringList both{keyWords + words("zone|a.|primary|127.0.0.1|key|k")};
     QTest::newRow("absolute") << "include \"@/keys/ddns.key\";\n" + zone << key << both;
     QTest::newRow("relative") << "INCLUDE \"keys/ddns.key\" ;\n" + zone << key << both;
@@ -321,6 +391,8 @@ void Bind9ReaderTest::followsIncludes_data()
     QTest::newRow("itself") << "include \"named.conf.local\";\n" + key << key << keyWords;
     QTest::newRow("each other") << "include \"keys/ddns.key\";\n" + zone
                                 << key + "include \"../keys/../named.conf.local\";" << both;
+    QTest::newRow("within quotes") << "options { version \"; include \\\"keys/ddns.key\\\"; \"; };\n" + zone << key
+                                   << QStringList{};
     QTest::newRow("same file twice") << QByteArray{"include \"keys/ddns.key\";\n"}.repeated(2) << key << keyWords;
 }
 
@@ -342,10 +414,10 @@ void Bind9ReaderTest::limitsDepthOfIncludes()
     for (int i{1}; i <= 40; ++i) {
         const QByteArray number{QByteArray::number(i)};
         writeTestFile(folder.filePath(QString::number(i)), "key k" + number +
-                                                               " { algorithm a; secret s; };\ninclude \"" +
+                                                               " { algorithm a; secret YQ; };\ninclude \"" +
                                                                QByteArray::number(i + 1) + "\";");
     }
-    const QStringList statements{bind9::readFile(folder.filePath(QStringLiteral("1")))};
+    const QStringList statements{preparedFrom(folder, "1")};
     QVERIFY(statements.contains(QStringLiteral("k16")));
     QVERIFY(!statements.contains(QStringLiteral("k17")));
 }
@@ -353,17 +425,50 @@ void Bind9ReaderTest::limitsDepthOfIncludes()
 void Bind9ReaderTest::limitsSizeOfIncludes()
 {
     const QTemporaryDir folder;
-    const QByteArray filler(3'000'000, ' ');
-    writeTestFile(folder.filePath(QStringLiteral("main")), QByteArray{"include \"filler\";"}.repeated(30));
-    writeTestFile(folder.filePath(QStringLiteral("filler")), "key k { algorithm a; secret s; };" + filler);
-    QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("main"))).count(QStringLiteral("k")), 5);
+    QByteArray main;
+    for (int i{}; i < 30; ++i) {
+        const QByteArray number{QByteArray::number(i)};
+        main += "include \"" + number + "\";";
+        writeTestFile(folder.filePath(QString::number(i)),
+                      "key k" + number + " { algorithm a; secret YQ; };" + QByteArray(3'000'000, ' '));
+    }
+    writeTestFile(folder.filePath(QStringLiteral("main")), main);
+    QCOMPARE(preparedFrom(folder, "main").count(QStringLiteral("secret")), 5);
+}
+
+// Small files that include each other would be read again and again.
+void Bind9ReaderTest::limitsNumberOfFiles()
+{
+    const QTemporaryDir folder;
+    QByteArray main;
+    for (int i{}; i < 1'200; ++i) {
+        const QByteArray number{QByteArray::number(i)};
+        main += "include \"" + number + "\";";
+        writeTestFile(folder.filePath(QString::number(i)), "key k" + number + " { algorithm a; secret YQ; };");
+    }
+    writeTestFile(folder.filePath(QStringLiteral("main")), main);
+    QCOMPARE(preparedFrom(folder, "main").count(QStringLiteral("secret")), 999);
+}
+
+// Each of 16 files includes all of them three times.
+void Bind9ReaderTest::comesToAnEndWhereFilesIncludeEachOther()
+{
+    const QTemporaryDir folder;
+    QByteArray includes;
+    for (int i{}; i < 16; ++i)
+        includes += QByteArray{"include \"" + QByteArray::number(i) + "\";\n"}.repeated(3);
+    for (int i{}; i < 16; ++i) {
+        writeTestFile(folder.filePath(QString::number(i)),
+                      "key k" + QByteArray::number(i) + " { algorithm a; secret YQ; };\n" + includes);
+    }
+    QCOMPARE(preparedFrom(folder, "0").count(QStringLiteral("secret")), 16);
 }
 
 void Bind9ReaderTest::givesNothingForUnreadableFile()
 {
     const QTemporaryDir folder;
-    QCOMPARE(bind9::readFile(folder.filePath(QStringLiteral("missing"))), QStringList{});
-    QCOMPARE(bind9::readFile(folder.path()), QStringList{});
+    QCOMPARE(preparedFrom(folder, "missing"), QStringList{});
+    QCOMPARE(preparedFrom(folder, "."), QStringList{});
     QCOMPARE(preparedFrom(folder, "missing", {QStringLiteral("k")}), QStringList{});
 }
 
@@ -400,6 +505,172 @@ void Bind9ReaderTest::survivesAnyText()
         }
     }
     QVERIFY(groups > 1'000);
+}
+
+void Bind9ReaderTest::tellsWhatIsLeftOut_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QStringList>("knownKeys");
+    QTest::addColumn<QStringList>("allKeys");
+    QTest::addColumn<QStringList>("statements");
+    QTest::addColumn<QStringList>("leftOut");
+
+    const auto row = [](const char *name, const char *text, const char *statements, const char *leftOut,
+                        const char *knownKeys = "", const char *allKeys = "") {
+        QTest::addRow("%s", name) << QString::fromUtf8(text) << words(knownKeys) << words(allKeys) << words(statements)
+                                  << words(leftOut);
+    };
+    constexpr auto both = "key|k|algorithm|a|secret|YQ|zone|a.|primary|127.0.0.1|key|k";
+    constexpr auto keyAndZone = "key k { algorithm a; secret YQ; }; zone a { allow-update { key k; }; };";
+    row("nothing", keyAndZone, both, "");
+    row("copy of a zone", "zone a { type slave; masters { 10.0.0.1; }; }; zone \".\" { type hint; };", "",
+        "a: not primary|: not primary");
+    row("no key", "zone a { type master; }; zone b { allow-update { 10.0.0.1; }; };", "", "a: no key|b: no key");
+    row("unknown key", "zone a { allow-update { key \"k\"; }; };", "", "a: unknown key k", "l", "l");
+    row("first of its keys", "zone a { allow-update { key x; key y; }; };", "", "a: unknown key x");
+    row("refused name",
+        "key k { algorithm a; secret YQ; }; zone \"0/25.1.in-addr.arpa\" { allow-update { key k; }; };"
+        "zone \"_msdcs.a.org.\" { allow-update { key k; }; };",
+        "key|k|algorithm|a|secret|YQ", "0/25.1.in-addr.arpa: refused name k|_msdcs.a.org: refused name k");
+    row("refused key", "key k { algorithm a; secret \"Y-Q=\"; }; zone a { allow-update { key k; }; };", "",
+        "a: refused key k");
+    row("refused key of the configuration", "key k { algorithm a; secret Y; }; zone a { allow-update { key k; }; };",
+        "zone|a.|primary|127.0.0.1|key|k", "", "k", "k");
+    row("usable key behind a refused one",
+        "key l { algorithm a; secret Y; }; key k { algorithm a; secret YQ; }; zone a { allow-update { key l; key k; }; "
+        "};",
+        both, "");
+    row("key behind", keyAndZone, "", "a: key behind k", "", "K");
+    row("key behind that the files do not have", "zone a { allow-update { key k; }; };", "", "a: key behind k", "l",
+        "l|k");
+    row("key before", "zone a { allow-update { key k; }; };", "zone|a.|primary|127.0.0.1|key|k", "", "k", "k|l");
+    row("key before and behind", "zone a { allow-update { key k; }; };", "zone|a.|primary|127.0.0.1|key|k", "", "k",
+        "k|k");
+    row("key before whose name needs quotes", "zone a { allow-update { key _k; }; };",
+        "zone|a.|primary|127.0.0.1|key|\"_k\"", "", "_k", "_k");
+}
+
+void Bind9ReaderTest::tellsWhatIsLeftOut()
+{
+    QFETCH(QString, text);
+    QFETCH(QStringList, knownKeys);
+    QFETCH(QStringList, allKeys);
+    QFETCH(QStringList, statements);
+    QFETCH(QStringList, leftOut);
+    const bind9::Preparation preparation{bind9::preparedText(text, knownKeys, allKeys)};
+    QCOMPARE(preparation.statements, statements);
+    QCOMPARE(described(preparation.leftOut), leftOut);
+}
+
+void Bind9ReaderTest::leavesOutWhatTheServerRefuses_data()
+{
+    QTest::addColumn<QString>("keyName");
+    QTest::addColumn<QString>("algorithm");
+    QTest::addColumn<QString>("secret");
+    QTest::addColumn<QString>("zone");
+    QTest::addColumn<bool>("isAccepted");
+
+    const auto row = [](const QString &keyName, const QString &algorithm, const QString &secret, const QString &zone,
+                        bool isAccepted) {
+        const QString name{keyName + QLatin1Char{' '} + algorithm + QLatin1Char{' '} + secret + QLatin1Char{' '} +
+                           zone};
+        QTest::addRow("%s", qPrintable(name.left(60))) << keyName << algorithm << secret << zone << isAccepted;
+    };
+    const auto texts = [](std::initializer_list<const char *> list) {
+        QStringList result;
+        std::transform(list.begin(), list.end(), std::back_inserter(result),
+                       [](auto *text) { return QString::fromUtf8(text); });
+        return result;
+    };
+    const QString key{QStringLiteral("k")};
+    const QString algorithm{QStringLiteral("hmac-md5")};
+    const QString secret{QStringLiteral("YQ==")};
+    const QString zone{QStringLiteral("a.org")};
+    const QString tooLong(1'500, QLatin1Char{'A'});
+    for (const QString &name : texts({"k", "\"k\"", "k.", "k-a.b_c", "9", "-", "if", "zone", "algorithm"}))
+        row(name, algorithm, secret, zone, true);
+    row(tooLong, algorithm, secret, zone, false);
+    for (const QString &text : texts({"hmac-md5", "\"hmac-sha256\"", "HMAC-MD5.SIG-ALG.REG.INT.", "type"}))
+        row(key, text, secret, zone, true);
+    for (const QString &text : texts({"a..b", "_a", "a/b", "\"a b\"", "\xC3\xA4"}))
+        row(key, text, secret, zone, false);
+    for (const QString &text :
+         texts({"YQ", "\"YQ==\"", "YWI=", "YWJj", "YR==", "YWF=", "+/+/", "9999", "AA=", "\"ab//\"", "zone"}))
+        row(key, algorithm, text, zone, true);
+    for (const QString &text : texts(
+             {"Y", "YR", "YWF", "99", "Y=", "YQ==YQ==", "\"YQ=\\\"\"", "Y-Q=", "\"Y_Q=\"", "if", "\xC3\xA4", "'YQ=='"}))
+        row(key, algorithm, text, zone, false);
+    row(key, algorithm, tooLong, zone, false);
+    row(key, algorithm, tooLong.left(1'499), zone, true);
+    for (const QString &name :
+         texts({"a.org", "\"a.org.\"", "1.168.192.in-addr.arpa", "0-25.1", "zone", "if.type", "-a.b-", "a_b"}))
+        row(key, algorithm, secret, name, true);
+    for (const QString &name :
+         texts({"_a.org", "a._b", "\"0/25.1\"", "a..b", "\"*.a\"", "a..", "\xC3\xA4.org", "a@b", "\"a\\b\"", "a+b"}))
+        row(key, algorithm, secret, name, false);
+}
+
+// The server itself tells what it refuses: all of it as the files have it.
+void Bind9ReaderTest::leavesOutWhatTheServerRefuses()
+{
+    QFETCH(QString, keyName);
+    QFETCH(QString, algorithm);
+    QFETCH(QString, secret);
+    QFETCH(QString, zone);
+    QFETCH(bool, isAccepted);
+    const QString text{
+        QStringLiteral("key %1 { algorithm %2; secret %3; };\nzone %4 { type master; allow-update { key %1; "
+                       "}; };\n")
+            .arg(keyName, algorithm, secret, zone)};
+    const bind9::Preparation preparation{bind9::preparedText(text, {})};
+    QCOMPARE(preparation.leftOut.isEmpty(), isAccepted);
+    QCOMPARE(preparation.statements.contains(QStringLiteral("zone")), isAccepted);
+
+    const QString dhcpd{realDhcpd()};
+    if (dhcpd.isEmpty())
+        QSKIP("no DHCP server");
+    QCOMPARE(complaintOf(dhcpd, configurationWith(preparation.statements)), QString{});
+    QString zoneName{values::unquoted(zone)};
+    if (!zoneName.endsWith(QLatin1Char{'.'}))
+        zoneName += QLatin1Char{'.'};
+    const QString literal{
+        QStringLiteral("key %1 { algorithm %2; secret %3; }\nzone %4 { primary 127.0.0.1; key %1; }\n")
+            .arg(keyName, values::unquoted(algorithm), secret, zoneName)};
+    QCOMPARE(complaintOf(dhcpd, literal.toUtf8()).isEmpty(), isAccepted);
+}
+
+// Keys and zones of any characters, hundreds in one configuration.
+void Bind9ReaderTest::givesTheServerNothingThatItRefuses()
+{
+    const QString dhcpd{realDhcpd()};
+    if (dhcpd.isEmpty())
+        QSKIP("no DHCP server");
+    QRandomGenerator random{20261121};
+    const auto anyWord = [&random](const char *characters) {
+        const QString alphabet{QString::fromUtf8(characters)};
+        QString word;
+        for (int length{random.bounded(1, 7)}; length > 0; --length)
+            word += alphabet.at(random.bounded(alphabet.size()));
+        return random.bounded(3) == 0 ? values::quoted(word) : word;
+    };
+    int keys{};
+    int zones{};
+    for (int round{}; round < 40; ++round) {
+        QString text;
+        for (int i{}; i < 200; ++i) {
+            const QString key{anyWord("abk9-_./+:\xC3\xA4*'")};
+            text += QStringLiteral("key %1 { algorithm %2; secret %3; };\n")
+                        .arg(key, anyWord("amd5-_./"), anyWord("YQa9+/==AgEw-"));
+            text += QStringLiteral("zone %1 { allow-update { key %2; }; };\n").arg(anyWord("abz19-_./*"), key);
+        }
+        const QStringList statements{bind9::preparedText(text, {}).statements};
+        keys += statements.count(QStringLiteral("secret"));
+        zones += statements.count(QStringLiteral("zone"));
+        const QString complaint{complaintOf(dhcpd, configurationWith(statements))};
+        QVERIFY2(complaint.isEmpty(), qPrintable(complaint + QString::fromUtf8(configurationWith(statements))));
+    }
+    QVERIFY(keys > 400);
+    QVERIFY(zones > 100);
 }
 
 QTEST_GUILESS_MAIN(Bind9ReaderTest)
