@@ -209,7 +209,7 @@ void ConfigReaderTest::agreesWithReference()
 void ConfigReaderTest::agreesWithReferenceOnFiles_data()
 {
     QTest::addColumn<QString>("path");
-    const QDir corpus{QFINDTESTDATA("corpus")};
+    const QDir corpus{QFINDTESTDATA("../fuzz/configreader")};
     const QFileInfoList files{corpus.entryInfoList(QDir::Files)};
     QVERIFY(!files.isEmpty());
     for (const QFileInfo &file : files)

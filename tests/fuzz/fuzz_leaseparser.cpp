@@ -3,23 +3,12 @@
 // where it continues after an end.
 #include "leases/leaseparser.h"
 #include "leases/leasetable.h"
+#include "tests/fuzz/fuzztarget.h"
 #include "tests/leases/referencereader.h"
 
 #include <QByteArray>
 
-#include <cstdint>
-#include <cstdlib>
 #include <ctime>
-
-namespace {
-
-void require(bool holds)
-{
-    if (!holds)
-        std::abort();
-}
-
-} // namespace
 
 extern "C" int LLVMFuzzerInitialize(int * /*argc*/, char *** /*argv*/)
 {

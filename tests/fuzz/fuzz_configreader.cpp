@@ -4,11 +4,9 @@
 #include "config/configreader.h"
 #include "config/configwriter.h"
 #include "tests/config/referencereader.h"
+#include "tests/fuzz/fuzztarget.h"
 
 #include <QByteArray>
-
-#include <cstdint>
-#include <cstdlib>
 
 namespace {
 
@@ -17,13 +15,9 @@ std::unique_ptr<DhcpdConfigDeclaration> read(const QByteArray &utf8, DhcpdConfig
     return readConfiguration({utf8.constData(), static_cast<std::size_t>(utf8.size())}, top);
 }
 
-void require(bool holds)
-{
-    if (!holds)
-        std::abort();
-}
-
 } // namespace
+
+extern "C" int LLVMFuzzerInitialize(int * /*argc*/, char *** /*argv*/) { return 0; }
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size)
 {
