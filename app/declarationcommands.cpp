@@ -2,10 +2,10 @@
 #include "app/declarationcommands.h"
 
 #include "app/commandguard.h"
+#include "app/plainmessagebox.h"
 #include "app/reservation.h"
 #include "app/statementcommands.h"
 #include "common/paths.h"
-#include "config/bind9reader.h"
 #include "config/dhcpdconfigdeclaration.h"
 #include "config/dhcpdconfigmodel.h"
 #include "config/staticroutes.h"
@@ -24,6 +24,8 @@
 namespace {
 
 using Statement = DhcpdConfigStatement;
+
+constexpr int mostZonesTold{20};
 
 template<bool (Statement::*isKind)() const>
 bool declarationOf(const Statement &statement)
@@ -302,8 +304,42 @@ void DeclarationCommands::addBind9Settings()
     if (file.isEmpty() || !parent.isValid())
         return;
     DhcpdConfigModel &model{m_commands.model()};
+    const bind9::Preparation found{bind9::prepared(file, model.keyNames(parent), model.keyNames())};
+    bool isAdded{};
     m_commands.addTo(
-        parent,
-        [&] { model.addBind9(bind9::prepared(file, model.keyNames(parent), model.keyNames()).statements, parent); },
-        StatementCommands::OpenBranches::All);
+        parent, [&] { isAdded = model.addBind9(found.statements, parent); }, StatementCommands::OpenBranches::All);
+    if (found.leftOut.isEmpty() || (!isAdded && !found.statements.isEmpty()))
+        return; // all is said
+    PlainMessageBox{QMessageBox::Information, tr("Information"), leftOutText(found.leftOut), QMessageBox::Ok, window}
+        .exec();
+}
+
+QString DeclarationCommands::leftOutText(const QVector<bind9::LeftOutZone> &zones)
+{
+    QStringList lines{tr("These zones were left out:")};
+    for (const bind9::LeftOutZone &zone : zones.mid(0, mostZonesTold))
+        lines += tr("%1: %2").arg(zone.name, reasonText(zone));
+    if (zones.size() > mostZonesTold)
+        lines += tr("%1 more").arg(zones.size() - mostZonesTold);
+    return lines.join(QLatin1Char{'\n'});
+}
+
+QString DeclarationCommands::reasonText(const bind9::LeftOutZone &zone)
+{
+    using Reason = bind9::LeftOutZone::Reason;
+    switch (zone.reason) {
+    case Reason::NotPrimary:
+        return tr("the name server is not its primary one");
+    case Reason::NoUpdateKey:
+        return tr("no key may update it");
+    case Reason::RefusedName:
+        return tr("the DHCP server does not accept its name");
+    case Reason::UnknownKey:
+        return tr("its key '%1' is not known").arg(zone.key);
+    case Reason::RefusedKey:
+        return tr("the DHCP server does not accept its key '%1'").arg(zone.key);
+    case Reason::KeyBehind:
+        break;
+    }
+    return tr("its key '%1' stands behind this place in the configuration").arg(zone.key);
 }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include "config/bind9reader.h"
+
 #include <QCoreApplication>
 
 class StatementCommands;
@@ -44,5 +46,9 @@ public:
     bool reserve(const Reservation &lease);
 
 private:
+    /// Which zones of bind9 were not added, and why not.
+    static QString leftOutText(const QVector<bind9::LeftOutZone> &zones);
+    static QString reasonText(const bind9::LeftOutZone &zone);
+
     StatementCommands &m_commands;
 };

@@ -698,6 +698,38 @@ Möchten Sie fortfahren?</translation>
         <source>The text would be too long, or its blocks nested too deeply, to be read again.</source>
         <translation>Der Text wäre zu lang oder seine Blöcke zu tief verschachtelt, um wieder gelesen zu werden.</translation>
     </message>
+    <message>
+        <source>These zones were left out:</source>
+        <translation>Diese Zonen wurden ausgelassen:</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>the name server is not its primary one</source>
+        <translation>der Nameserver ist nicht ihr primärer</translation>
+    </message>
+    <message>
+        <source>no key may update it</source>
+        <translation>kein Schlüssel darf sie aktualisieren</translation>
+    </message>
+    <message>
+        <source>the DHCP server does not accept its name</source>
+        <translation>der DHCP-Server nimmt ihren Namen nicht an</translation>
+    </message>
+    <message>
+        <source>its key &apos;%1&apos; is not known</source>
+        <translation>ihr Schlüssel „%1“ ist nicht bekannt</translation>
+    </message>
+    <message>
+        <source>the DHCP server does not accept its key &apos;%1&apos;</source>
+        <translation>der DHCP-Server nimmt ihren Schlüssel „%1“ nicht an</translation>
+    </message>
+    <message>
+        <source>its key &apos;%1&apos; stands behind this place in the configuration</source>
+        <translation>ihr Schlüssel „%1“ steht in der Konfiguration hinter dieser Stelle</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>

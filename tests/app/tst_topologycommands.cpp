@@ -180,6 +180,8 @@ private slots:
     void bind9IsGivenUp();
     void bind9IsRefused_data();
     void bind9IsRefused();
+    void bind9ZonesThatAreLeftOutAreNamed_data();
+    void bind9ZonesThatAreLeftOutAreNamed();
     void removeTakesTheStatementOut_data();
     void removeTakesTheStatementOut();
     void removeTakesNothingAboveTheStatements();
@@ -753,8 +755,6 @@ void TopologyCommandsTest::bind9IsRefused_data()
     QTest::addRow("empty file") << QString{} << QByteArray{} << empty;
     QTest::addRow("comments only") << QString{} << QByteArray{"// zone \"a.org\" { };\n# nothing\n/* here */\n"}
                                    << empty;
-    QTest::addRow("zone without a key") << QString{} << QByteArray{"zone \"a.org\" { type master; file \"a\"; };\n"}
-                                        << empty;
     QTest::addRow("subnet") << text("subnet 10.0") << QByteArray{bind9Configuration}
                             << text("Error adding bind9. Can not add bind9 to 'subnet'");
     QTest::addRow("shared network") << text("shared-network") << QByteArray{bind9Configuration}
@@ -781,6 +781,47 @@ void TopologyCommandsTest::bind9IsRefused()
     QCOMPARE(window.changes(), QStringList{});
     QCOMPARE(window.notices(), 0);
     QVERIFY(!window.offersSave());
+}
+
+void TopologyCommandsTest::bind9ZonesThatAreLeftOutAreNamed_data()
+{
+    QTest::addColumn<QByteArray>("file");
+    QTest::addColumn<QString>("error");
+    QTest::addColumn<QString>("told");
+    QTest::addColumn<QStringList>("changes");
+    QTest::addRow("nothing is left") << QByteArray{"zone \"a.org\" { type master; file \"a\"; };\n"}
+                                     << text("Error adding bind9. bind9 can not be empty.")
+                                     << text("These zones were left out:\na.org: no key may update it")
+                                     << QStringList{};
+    QTest::addRow("some are left")
+        << QByteArray{"zone \"a.org\" { type master; allow-update { key k; }; };\n"
+                      "zone \"<b>.org\" { type master; allow-update { key k; }; };\n"
+                      "zone \"c.org\" { type master; allow-update { key nowhere; }; };\n"
+                      "key k { algorithm hmac-sha256; secret Zm9vYmFy; };\n"}
+        << QString{}
+        << text("These zones were left out:\n<b>.org: the DHCP server does not accept its name\n"
+                "c.org: its key 'nowhere' is not known")
+        << list("+key k | +key k > algorithm hmac-sha256; | +key k > secret Zm9vYmFy; | +zone a.org. | "
+                "+zone a.org. > primary 127.0.0.1; | +zone a.org. > key k;");
+}
+
+void TopologyCommandsTest::bind9ZonesThatAreLeftOutAreNamed()
+{
+    QFETCH(QByteArray, file);
+    QFETCH(QString, error);
+    QFETCH(QString, told);
+    QFETCH(QStringList, changes);
+    const TopologyWindow window{configuration};
+    ModalBoxes boxes;
+    writeTestFile(paths::bind9LocalConfiguration(), file);
+    window.choose(boxes, {}, option("Add DHCP dynamic zone update"), [&] {
+        boxes.expectBox(bind9Box, QMessageBox::Yes);
+        boxes.expectFileDialog(paths::bind9LocalConfiguration());
+        if (!error.isEmpty())
+            boxes.expectBox(errorBox(error), QMessageBox::Ok);
+        boxes.expectBox({QMessageBox::Information, text("Information"), told}, QMessageBox::Ok);
+    });
+    QCOMPARE(window.changes(), changes);
 }
 
 void TopologyCommandsTest::removeTakesTheStatementOut_data()
