@@ -1,18 +1,55 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/dhcpservermanager.h"
 
+#include "server/servicecommand.h"
+
+#include <QRegularExpression>
+#include <QSignalBlocker>
+
+#include <utility>
+
 namespace {
 
-void startCommand(QProcess &process, const QString &verb)
+/// What the text of a status says.
+struct Status
 {
-    process.start(QStringLiteral("systemctl"), {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
+    explicit Status(const QByteArray &printed);
+
+    bool stopped{};
+    bool running{};
+    bool exited{}; ///< the init script has done its work, but no server is left
+};
+
+// The text without null bytes and without the escape sequences of colours and links, which could part a phrase.
+QString plainText(const QByteArray &printed)
+{
+    static const QRegularExpression sequence{
+        QStringLiteral("\x1b(?:\\[[0-?]*[ -/]*[@-~]|\\][^\x07\x1b]*(?:\x07|\x1b\\\\))")};
+    QString text{QString::fromUtf8(printed.constData(), printed.size())};
+    text.remove(QChar{});
+    return text.remove(sequence);
+}
+
+Status::Status(const QByteArray &printed)
+{
+    const QString text{plainText(printed)};
+    exited = text.contains(QLatin1String{"Active: active (exited)"});
+    stopped = exited || text.contains(QLatin1String{"Active: inactive (dead)"}) ||
+              text.contains(QLatin1String{"Active: failed"});
+    running = text.contains(QLatin1String{"Active: active (running)"});
+}
+
+bool wasAnswered(const ServiceCommand &query)
+{
+    return query.exitStatus() == QProcess::NormalExit || query.printedTooMuch();
 }
 
 } // namespace
 
 DhcpServerManager::DhcpServerManager(QObject *parent)
     : QObject{parent}
-    , m_process{new QProcess{this}}
+    , m_process{new ServiceCommand{this}}
+    , m_following{std::make_unique<ServiceCommand>()}
 {
     qRegisterMetaType<DhcpServerManager::ServerStates>("DhcpServerManager::ServerStates");
     connect(this, &DhcpServerManager::interfacesChanged, this, &DhcpServerManager::writeDHCPServerConfig);
@@ -21,10 +58,12 @@ DhcpServerManager::DhcpServerManager(QObject *parent)
     // Queued, because a process that could not be started is cleaned up only after its signal and cannot be reused
     // before.
     connect(m_process, &QProcess::errorOccurred, this, &DhcpServerManager::handleProcessError, Qt::QueuedConnection);
+    connect(m_following.get(), qOverload<int, QProcess::ExitStatus>(&QProcess::finished), this,
+            &DhcpServerManager::handleFollowingFinished);
     updateInterfaces();
 }
 
-DhcpServerManager::~DhcpServerManager() = default;
+DhcpServerManager::~DhcpServerManager() { abandonFollowing(); }
 
 QString DhcpServerManager::serverStateText() const { return stateText(m_state); }
 
@@ -62,28 +101,68 @@ void DhcpServerManager::checkRunning()
 {
     if (m_process->state() != QProcess::NotRunning)
         return;
-    QProcess query;
-    startCommand(query, QStringLiteral("status"));
+    abandonFollowing();
+    ServiceCommand query;
+    query.askForStatus();
     query.waitForFinished(-1);
 
-    if (query.exitStatus() != QProcess::NormalExit) {
-        emit error(
-            QObject::tr("Checking DHCP-server status failed\n%1").arg(QString::fromUtf8(query.readAllStandardError())));
+    // The exit code is deliberately not looked at: it is not 0 for a stopped service either.
+    if (!wasAnswered(query)) {
+        emit error(QObject::tr("Checking DHCP-server status failed\n%1").arg(query.complaint()));
         return;
     }
-    // The exit code is deliberately not looked at: it is not 0 for a stopped service either.
-    const QString status{QString::fromUtf8(query.readAllStandardOutput())};
-    if (status.contains(QLatin1String{"Active: inactive (dead)"}) || status.contains(QLatin1String{"Active: failed"}))
+    const Status status{query.output()};
+    if (status.stopped) {
+        m_serverHasDied = status.exited;
         setState(Stopped);
+    }
     // Deliberately no "else": of a text that has both, running is what counts.
-    if (status.contains(QLatin1String{"Active: active (running)"}))
+    if (status.running)
         setState(Running);
+}
+
+void DhcpServerManager::followState()
+{
+    if (m_process->state() != QProcess::NotRunning)
+        return;
+    if (m_following->state() != QProcess::NotRunning) {
+        m_followAgain = true;
+        return;
+    }
+    m_following->askForStatus();
+}
+
+void DhcpServerManager::handleFollowingFinished(int /*exitCode*/, QProcess::ExitStatus /*exitStatus*/)
+{
+    const bool again{std::exchange(m_followAgain, false)};
+    if (wasAnswered(*m_following)) {
+        const Status status{m_following->output()};
+        if (status.stopped && !status.running)
+            m_serverHasDied = status.exited;
+        if (status.running && m_state != Running)
+            setState(Running);
+        else if (status.stopped && !status.running && m_state != Stopped)
+            setState(Stopped);
+    }
+    if (again)
+        followState();
+}
+
+// What is asked or done from now on makes the answer old.
+void DhcpServerManager::abandonFollowing()
+{
+    m_followAgain = false;
+    if (m_following->state() == QProcess::NotRunning)
+        return;
+    const QSignalBlocker silent{m_following.get()};
+    m_following->kill();
+    m_following->waitForFinished(-1);
 }
 
 void DhcpServerManager::handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus)
 {
     if (exitCode != 0 || exitStatus == QProcess::CrashExit)
-        reportFailedOperation(QString::fromUtf8(m_process->readAllStandardError()));
+        reportFailedOperation(m_process->complaint());
     checkRunning();
 }
 
@@ -105,8 +184,10 @@ void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, cons
         instead();
         return;
     }
+    // To a service that is active although its server has died, "start" does nothing.
+    const bool needsRestart{m_state == Stopped && m_serverHasDied};
     setState(Updating);
-    startCommand(*m_process, verb);
+    m_process->send(needsRestart ? QStringLiteral("restart") : verb);
 }
 
 void DhcpServerManager::handleProcessError(QProcess::ProcessError processError)

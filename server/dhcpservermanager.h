@@ -11,6 +11,9 @@
 #include <QStringList>
 
 #include <functional>
+#include <memory>
+
+class ServiceCommand;
 
 /// The DHCP server as a service of this machine: its state, starting and stopping it, and the interfaces it serves.
 ///
@@ -42,6 +45,7 @@ public:
     /// The words for `state`; the empty text for a value that is no state.
     static QString stateText(ServerStates state);
     bool isServerRunning() const;
+    ServerStates state() const { return m_state; }
 
     /// Collects the system's interfaces and reads the defaults file again; an unsaved choice is lost.
     void updateInterfaces();
@@ -76,6 +80,9 @@ public slots:
     /// Asks for the state of the service and waits for the answer. An answer that says neither running nor stopped
     /// leaves the state as it is. Does nothing while an operation is under way, which ends with a query anyway.
     void checkRunning();
+    /// Asks like checkRunning(), but on nobody's behalf: does not wait, and reports nothing but a state that is another
+    /// one than before.
+    void followState();
     /// The end of a start, stop or restart.
     void handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus);
     /// Overwrites the file at `path` with the lines last read and the served interfaces of the map. When that fails,
@@ -87,10 +94,15 @@ private:
     void setState(ServerStates state);
     void operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead);
     void handleProcessError(QProcess::ProcessError processError);
+    void handleFollowingFinished(int exitCode, QProcess::ExitStatus exitStatus);
+    void abandonFollowing();
     void reportFailedOperation(const QString &detail);
 
-    QProcess *m_process; // of the operation under way, if any
+    ServiceCommand *m_process;                   // of the operation under way, if any
+    std::unique_ptr<ServiceCommand> m_following; // the query of followState()
+    bool m_followAgain{};                        // the service may have changed since that query began
     ServerStates m_state{Updating};
+    bool m_serverHasDied{}; // the service counts as stopped, but for the service manager it is active
     QStringList m_fileLines; // with their terminators
     QMap<QString, bool> m_interfaces;
     TextEncoding m_fileEncoding;

@@ -1,13 +1,18 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/dhcpservermanager.h"
+#include "server/servicewatch.h"
 #include "tests/server/managerevents.h"
 #include "tests/support/contexttranslator.h"
 #include "tests/support/fakesystemctl.h"
 #include "tests/support/temporaryroot.h"
 
 #include <QDir>
+#include <QFile>
 #include <QMetaMethod>
+#include <QProcess>
 #include <QRegularExpression>
+#include <QScopeGuard>
+#include <QStandardPaths>
 #include <QTest>
 
 #include <csignal>
@@ -62,6 +67,36 @@ struct Machine
 
 // The verbs given after the query with which known() begins.
 QStringList afterFirstQuery(const QStringList &verbs) { return QStringList{QStringLiteral("status")} + verbs; }
+
+// The fake's program is this shell script from now on.
+void replaceSystemctl(const QByteArray &script)
+{
+    writeTestFile(QStandardPaths::findExecutable(QStringLiteral("systemctl")), "#!/bin/sh\n" + script);
+}
+
+// The lines of a script that answers one thing at its first call and another one later.
+QByteArray answersInTurn(const QByteArray &first, const QByteArray &later)
+{
+    return "echo >>\"$0.turns\"\nif [ \"$(wc -l <\"$0.turns\")\" -eq 1 ]; then " + first + "; else " + later + "; fi\n";
+}
+
+// How often such a script has been called.
+int turns()
+{
+    QFile turns{QStandardPaths::findExecutable(QStringLiteral("systemctl")) + QStringLiteral(".turns")};
+    return turns.open(QIODevice::ReadOnly) ? turns.readAll().size() : 0;
+}
+
+constexpr int longestOutput{64 * 1024};
+
+// The most memory that this process has had at once, in KiB.
+int peakMemory()
+{
+    static const QRegularExpression peak{QStringLiteral("VmHWM:\\s*(\\d+) kB")};
+    return peak.match(QString::fromLatin1(readTestFile(QStringLiteral("/proc/self/status")))).captured(1).toInt();
+}
+
+FakeSystemctl::Reply deadServer() { return {"     Active: active (exited) since Mon\n", {}, 0, {}, 0}; }
 
 // While it lives, Qt's warnings are recorded.
 class WarningRecorder final
@@ -126,7 +161,11 @@ private slots:
     void reportsCrashedQuery_data();
     void reportsCrashedQuery();
     void saysNothingWhenQueryCannotStart();
-    void readsMuchOutputOfQuery();
+    void readsLimitedOutputOfQuery_data();
+    void readsLimitedOutputOfQuery();
+    void endsQueryThatPrintsWithoutEnd_data();
+    void endsQueryThatPrintsWithoutEnd();
+    void asksForPlainOutput();
     void waitsForSlowQuery();
     void callsSystemctlWithVerbAndUnit();
     void performsOperation_data();
@@ -134,6 +173,9 @@ private slots:
     void informsThatOperationIsNotNeeded_data();
     void informsThatOperationIsNotNeeded();
     void startsStoppedServiceOnRestart();
+    void restartsServiceWhoseServerHasDied_data();
+    void restartsServiceWhoseServerHasDied();
+    void startsAgainOnceServiceWasStopped();
     void refusesOperationBeforeFirstQuery_data() { addOperationRows(); }
     void refusesOperationBeforeFirstQuery();
     void refusesOperationDuringAnother_data() { addOperationRows(); }
@@ -150,11 +192,19 @@ private slots:
     void reportsOperationThatCannotStart();
     void staysUpdatingWithoutSystemctl();
     void leavesNothingBehindAfterFailures();
-    void readsMuchOutputOfOperation();
+    void readsLimitedOutputOfOperation_data();
+    void readsLimitedOutputOfOperation();
+    void endsOperationThatPrintsWithoutEnd();
     void doesNotTakeOutputOfOperationForStatus();
     void reportsEachOfManyOperationsOnce();
     void doesNotQueryDuringOperation();
     void endsQuietlyDuringOperation();
+    void followsTheState_data();
+    void followsTheState();
+    void followsWithoutWaiting();
+    void followsWhatChangesDuringQuery();
+    void followsNothingDuringOperation();
+    void watchesWithoutBus();
 };
 
 void DhcpServerManagerTest::hasTheInterfaceThatQueuedSignalsNeed_data()
@@ -265,7 +315,24 @@ void DhcpServerManagerTest::readsStateFromStatus_data()
     QTest::addRow("inside a line") << saying("log: \"Active: active (running)\" it said") << QStringList{running};
     QTest::addRow("beside other bytes") << saying("\xff\xfe Active: failed \xc3") << QStringList{stopped};
     QTest::addRow("other letter case") << saying("active: active (running)\nACTIVE: FAILED\n") << QStringList{};
-    QTest::addRow("active but exited") << saying("Active: active (exited)") << QStringList{};
+    QTest::addRow("active but exited") << saying("Active: active (exited)") << QStringList{stopped};
+    QTest::addRow("exited before running")
+        << saying("Active: active (exited)\nActive: active (running)\n") << QStringList{stopped, running};
+    QTest::addRow("in colours")
+        << saying("\x1b[0;1;32m\u25cf\x1b[0m x\n  Active: \x1b[0;1;32mactive (running)\x1b[0m since")
+        << QStringList{running};
+    QTest::addRow("in parts of several colours")
+        << saying("Active: \x1b[38;5;185minactive\x1b[0m \x1b[1m(dead)\x1b[m") << QStringList{stopped};
+    QTest::addRow("in a link") << saying("Active: \x1b]8;;file:///x\x07"
+                                         "failed\x1b]8;;\x07 (Result)")
+                               << QStringList{stopped};
+    QTest::addRow("in a link of the other kind") << saying("Active: \x1b]8;;file:///x\x1b\\"
+                                                           "failed\x1b]8;;\x1b\\")
+                                                 << QStringList{stopped};
+    QTest::addRow("behind a null byte") << FakeSystemctl::Reply{QByteArray{"x\0y\nActive: failed", 18}, {}, 0, {}, 0}
+                                        << QStringList{stopped};
+    QTest::addRow("parted by a null byte")
+        << FakeSystemctl::Reply{QByteArray{"Active: \0failed", 15}, {}, 0, {}, 0} << QStringList{stopped};
     QTest::addRow("inactive, not dead") << saying("Active: inactive") << QStringList{};
     QTest::addRow("on the other channel")
         << FakeSystemctl::Reply{{}, "Active: active (running)", 0, {}, 0} << QStringList{};
@@ -352,11 +419,65 @@ void DhcpServerManagerTest::saysNothingWhenQueryCannotStart()
     QCOMPARE(machine->events, QStringList{stopped});
 }
 
-void DhcpServerManagerTest::readsMuchOutputOfQuery()
+void DhcpServerManagerTest::readsLimitedOutputOfQuery_data()
 {
+    QTest::addColumn<QByteArray>("output");
+    QTest::addColumn<QStringList>("events");
+    const QByteArray phrase{"Active: active (running)"};
+    QTest::addRow("at the limit") << QByteArray(longestOutput - phrase.size(), '.') + phrase << QStringList{running};
+    QTest::addRow("beyond it") << QByteArray(longestOutput, '.') + phrase << QStringList{};
+    QTest::addRow("at the beginning of much") << phrase + QByteArray(300 * 1024, '.') << QStringList{running};
+}
+
+void DhcpServerManagerTest::readsLimitedOutputOfQuery()
+{
+    QFETCH(const QByteArray, output);
+    QFETCH(const QStringList, events);
     Machine machine{FakeSystemctl::Stopped};
-    const QByteArray much(300 * 1024, '.');
-    machine.systemctl.setReply(QStringLiteral("status"), {much + "Active: active (running)", much, 0, {}, 0});
+    machine.systemctl.setReply(QStringLiteral("status"), {output, "less\n", 0, {}, 0});
+    machine.manager->checkRunning();
+    QCOMPARE(machine.events, events);
+}
+
+void DhcpServerManagerTest::endsQueryThatPrintsWithoutEnd_data()
+{
+    QTest::addColumn<QByteArray>("channel");
+    QTest::addRow("output") << QByteArray{};
+    QTest::addRow("errors") << QByteArray{" >&2"};
+}
+
+void DhcpServerManagerTest::endsQueryThatPrintsWithoutEnd()
+{
+    QFETCH(const QByteArray, channel);
+    const Machine machine{FakeSystemctl::Stopped};
+    replaceSystemctl("echo 'Active: active (running)'; echo $$ >\"$0.pid\"; exec yes" + channel + '\n');
+    const QString pid{QStandardPaths::findExecutable(QStringLiteral("systemctl")) + QStringLiteral(".pid")};
+    const int before{peakMemory()};
+    machine.manager->checkRunning();
+    QCOMPARE(machine.events, QStringList{running});
+    QVERIFY(peakMemory() - before < 4 * 1024);
+    QVERIFY(!QFile::exists(QStringLiteral("/proc/") + QString::fromLatin1(readTestFile(pid)).trimmed()));
+}
+
+void DhcpServerManagerTest::asksForPlainOutput()
+{
+    const QVector<QByteArray> names{"LC_ALL", "SYSTEMD_COLORS", "SYSTEMD_PAGER", "SYSTEMD_URLIFY"};
+    QVector<QByteArray> before;
+    for (const QByteArray &name : names) {
+        before.append(qgetenv(name));
+        qputenv(name, "1");
+    }
+    const auto restore = qScopeGuard([&] {
+        for (int i{0}; i < names.size(); ++i) {
+            if (before.at(i).isNull())
+                qunsetenv(names.at(i));
+            else
+                qputenv(names.at(i), before.at(i));
+        }
+    });
+    const Machine machine{FakeSystemctl::Stopped};
+    replaceSystemctl("[ \"$LC_ALL,$SYSTEMD_COLORS,${SYSTEMD_PAGER-x},$SYSTEMD_URLIFY\" = C,0,,0 ] && "
+                     "echo 'Active: active (running)'\n");
     machine.manager->checkRunning();
     QCOMPARE(machine.events, QStringList{running});
 }
@@ -458,6 +579,43 @@ void DhcpServerManagerTest::startsStoppedServiceOnRestart()
     QTRY_COMPARE(machine->events, (QStringList{stopped, stopped, updating, running}));
     QCOMPARE(machine->systemctl.verbs(), afterFirstQuery({QStringLiteral("status"), QStringLiteral("status"),
                                                           QStringLiteral("start"), QStringLiteral("status")}));
+}
+
+void DhcpServerManagerTest::restartsServiceWhoseServerHasDied_data()
+{
+    QTest::addColumn<Slot>("operation");
+    QTest::addColumn<FakeSystemctl::State>("before");
+    QTest::addColumn<QStringList>("events");
+    const Slot start{&DhcpServerManager::runServer};
+    const Slot restart{&DhcpServerManager::restartServer};
+    QTest::addRow("start") << start << FakeSystemctl::Stopped << QStringList{stopped, updating, running};
+    QTest::addRow("start of what ran") << start << FakeSystemctl::Running << QStringList{stopped, updating, running};
+    QTest::addRow("restart") << restart << FakeSystemctl::Running << QStringList{stopped, stopped, updating, running};
+}
+
+void DhcpServerManagerTest::restartsServiceWhoseServerHasDied()
+{
+    QFETCH(const Slot, operation);
+    QFETCH(const FakeSystemctl::State, before);
+    QFETCH(const QStringList, events);
+    const auto machine = Machine::known(before);
+    machine->systemctl.setReply(QStringLiteral("status"), deadServer());
+    machine->call(operation);
+    QTRY_COMPARE(machine->events, events);
+    QStringList verbs{machine->systemctl.verbs()};
+    verbs.removeAll(QStringLiteral("status"));
+    QCOMPARE(verbs, QStringList{QStringLiteral("restart")});
+}
+
+void DhcpServerManagerTest::startsAgainOnceServiceWasStopped()
+{
+    const auto machine = Machine::known(FakeSystemctl::Running);
+    machine->systemctl.setReply(QStringLiteral("status"), deadServer());
+    machine->manager->checkRunning();
+    machine->systemctl.setState(FakeSystemctl::Stopped);
+    machine->manager->runServer();
+    QTRY_COMPARE(machine->events, (QStringList{stopped, stopped, updating, running}));
+    QCOMPARE(machine->systemctl.verbs().at(3), QStringLiteral("start"));
 }
 
 void DhcpServerManagerTest::refusesOperationBeforeFirstQuery()
@@ -660,13 +818,31 @@ void DhcpServerManagerTest::leavesNothingBehindAfterFailures()
     QCOMPARE(warnings.recorded(), QStringList{}); // such as one about a closed descriptor
 }
 
-void DhcpServerManagerTest::readsMuchOutputOfOperation()
+void DhcpServerManagerTest::readsLimitedOutputOfOperation_data()
+{
+    QTest::addColumn<int>("size");
+    QTest::addRow("at the limit") << longestOutput;
+    QTest::addRow("beyond it") << longestOutput + 1;
+    QTest::addRow("far beyond it") << 300 * 1024;
+}
+
+void DhcpServerManagerTest::readsLimitedOutputOfOperation()
+{
+    QFETCH(const int, size);
+    const auto machine = Machine::known(FakeSystemctl::Stopped);
+    const QByteArray much(size, 'x');
+    machine->systemctl.setReply(QStringLiteral("start"), {{}, much, 1, {}, 0});
+    machine->manager->runServer();
+    const QByteArray read{much.left(longestOutput)};
+    QTRY_COMPARE(machine->events, (QStringList{stopped, updating, failedOperation(read.constData()), stopped}));
+}
+
+void DhcpServerManagerTest::endsOperationThatPrintsWithoutEnd()
 {
     const auto machine = Machine::known(FakeSystemctl::Stopped);
-    const QByteArray much(300 * 1024, 'x');
-    machine->systemctl.setReply(QStringLiteral("start"), {much, much, 1, {}, 0});
+    replaceSystemctl("[ $1 = start ] || { echo 'Active: failed'; exit 3; }\nexec yes\n");
     machine->manager->runServer();
-    QTRY_COMPARE(machine->events, (QStringList{stopped, updating, failedOperation(much.constData()), stopped}));
+    QTRY_COMPARE(machine->events, (QStringList{stopped, updating, failedOperation(""), stopped}));
 }
 
 void DhcpServerManagerTest::doesNotTakeOutputOfOperationForStatus()
@@ -723,6 +899,97 @@ void DhcpServerManagerTest::endsQuietlyDuringOperation()
     QCoreApplication::processEvents();
     QCOMPARE(machine->events, (QStringList{stopped, updating}));
     QCOMPARE(machine->systemctl.verbs(), begun);
+}
+
+void DhcpServerManagerTest::followsTheState_data()
+{
+    QTest::addColumn<FakeSystemctl::Reply>("reply");
+    QTest::addColumn<QStringList>("events");
+    const auto status = [](FakeSystemctl::State state) { return FakeSystemctl::statusReply(state); };
+    QTest::addRow("as before") << status(FakeSystemctl::Running) << QStringList{};
+    QTest::addRow("stopped") << status(FakeSystemctl::Stopped) << QStringList{stopped};
+    QTest::addRow("failed") << status(FakeSystemctl::Failed) << QStringList{stopped};
+    QTest::addRow("server died") << deadServer() << QStringList{stopped};
+    QTest::addRow("unclear") << status(FakeSystemctl::Activating) << QStringList{};
+    QTest::addRow("crashed") << FakeSystemctl::Reply{"Active: failed\n", "lost\n", 0, {}, SIGKILL} << QStringList{};
+    QTest::addRow("failed before running")
+        << FakeSystemctl::Reply{"Active: failed\nActive: active (running)\n", {}, 0, {}, 0} << QStringList{};
+}
+
+void DhcpServerManagerTest::followsTheState()
+{
+    QFETCH(const FakeSystemctl::Reply, reply);
+    QFETCH(const QStringList, events);
+    const auto machine = Machine::known(FakeSystemctl::Running);
+    machine->systemctl.setReply(QStringLiteral("status"), reply);
+    machine->manager->followState();
+    QCOMPARE(machine->events, QStringList{});
+    QTRY_COMPARE(machine->systemctl.verbs().size(), 2);
+    QTRY_COMPARE(machine->events, events);
+    // That nothing else comes is seen when the answer to a later query has come.
+    machine->systemctl.setState(events.isEmpty() ? FakeSystemctl::Stopped : FakeSystemctl::Running);
+    machine->manager->followState();
+    QTRY_COMPARE(machine->events.size(), events.size() + 1);
+    QCOMPARE(machine->events.constLast(), events.isEmpty() ? stopped : running);
+}
+
+void DhcpServerManagerTest::followsWithoutWaiting()
+{
+    const auto machine = Machine::known(FakeSystemctl::Running);
+    replaceSystemctl(answersInTurn("sleep 1; echo 'Active: failed'", "echo 'Active: active (running)'"));
+    machine->manager->followState();
+    QTRY_COMPARE(turns(), 1);
+
+    // What is asked meanwhile is newer, and the late answer no news.
+    machine->manager->checkRunning();
+    QTest::qWait(1500);
+    QCOMPARE(machine->events, QStringList{running});
+    QVERIFY(machine->manager->isServerRunning());
+}
+
+void DhcpServerManagerTest::followsWhatChangesDuringQuery()
+{
+    const auto machine = Machine::known(FakeSystemctl::Running);
+    replaceSystemctl(answersInTurn("sleep 1; echo 'Active: active (running)'", "echo 'Active: failed'"));
+    machine->manager->followState();
+    QTRY_COMPARE(turns(), 1);
+    for (int i{0}; i < 5; ++i)
+        machine->manager->followState();
+    QTRY_COMPARE(machine->events, QStringList{stopped});
+    QTest::qWait(500);
+    QCOMPARE(turns(), 2);
+}
+
+void DhcpServerManagerTest::followsNothingDuringOperation()
+{
+    const auto machine = Machine::known(FakeSystemctl::Stopped);
+    machine->systemctl.hold(QStringLiteral("start"));
+    machine->manager->runServer();
+    machine->manager->followState();
+    QCOMPARE(machine->events, (QStringList{stopped, updating}));
+    machine->systemctl.release(QStringLiteral("start"));
+    QTRY_COMPARE(machine->events, (QStringList{stopped, updating, running}));
+    QCOMPARE(machine->systemctl.verbs(),
+             afterFirstQuery({QStringLiteral("status"), QStringLiteral("start"), QStringLiteral("status")}));
+}
+
+// The timer is left, and nothing is said about what is missing.
+void DhcpServerManagerTest::watchesWithoutBus()
+{
+    qputenv("DBUS_SYSTEM_BUS_ADDRESS", "unix:path=/no/such/socket");
+    const WarningRecorder warnings;
+    Machine machine{FakeSystemctl::Activating};
+    const ServiceWatch watch{machine.manager.get()};
+    machine.manager->checkRunning();
+    QTRY_VERIFY_WITH_TIMEOUT(machine.systemctl.verbs().size() > 1, 30000);
+    QCOMPARE(machine.events, QStringList{});
+    machine.systemctl.setState(FakeSystemctl::Running);
+    QTRY_COMPARE_WITH_TIMEOUT(machine.events, QStringList{running}, 30000);
+
+    const int queries{machine.systemctl.verbs().size()};
+    QTest::qWait(6000); // a state that is known is not asked for again
+    QCOMPARE(machine.systemctl.verbs().size(), queries);
+    QCOMPARE(warnings.recorded(), QStringList{});
 }
 
 QTEST_GUILESS_MAIN(DhcpServerManagerTest)
