@@ -108,7 +108,7 @@ void DhcpServerManager::checkRunning()
 
     // The exit code is deliberately not looked at: it is not 0 for a stopped service either.
     if (!wasAnswered(query)) {
-        emit error(QObject::tr("Checking DHCP-server status failed\n%1").arg(query.complaint()));
+        report(QObject::tr("Checking DHCP-server status failed\n%1").arg(query.complaint()));
         return;
     }
     const Status status{query.output()};
@@ -176,7 +176,7 @@ void DhcpServerManager::setState(ServerStates state)
 void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead)
 {
     if (m_state == Updating) {
-        emit error(QObject::tr("Some operation with DHCP-server already executes"));
+        report(QObject::tr("Some operation with DHCP-server already executes"));
         return;
     }
     checkRunning();
@@ -201,5 +201,11 @@ void DhcpServerManager::handleProcessError(QProcess::ProcessError processError)
 
 void DhcpServerManager::reportFailedOperation(const QString &detail)
 {
-    emit error(QObject::tr("Operation with DHCP-server failed\n%1").arg(detail));
+    report(QObject::tr("Operation with DHCP-server failed\n%1").arg(detail));
+}
+
+void DhcpServerManager::report(const QString &message, const QString &reason)
+{
+    m_errorReason = reason;
+    emit error(message);
 }

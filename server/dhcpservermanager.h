@@ -47,6 +47,9 @@ public:
     bool isServerRunning() const;
     ServerStates state() const { return m_state; }
 
+    /// While an error() is reported: the system's reason for it; empty where there is none.
+    const QString &errorReason() const { return m_errorReason; }
+
     /// Collects the system's interfaces and reads the defaults file again; an unsaved choice is lost.
     void updateInterfaces();
     /// Fills the map with the system's interfaces that have an IPv4 address, except loopback, none of them served. The
@@ -85,9 +88,10 @@ public slots:
     void followState();
     /// The end of a start, stop or restart.
     void handleProcessFinished(int exitCode, QProcess::ExitStatus exitStatus);
-    /// Overwrites the file at `path` with the lines last read and the served interfaces of the map. When that fails,
-    /// the choice is discarded for what the system and the file say, and an error() is reported. A file that exists but
-    /// could not be read is never overwritten.
+    /// Puts the served interfaces of the map into the lines of the file at `path`: those that it has by now when it is
+    /// the file read last, else those read last. When that fails, the choice is discarded for what the system and the
+    /// file say, and an error() is reported; also where the file read last has no line for the choice, which is then
+    /// not stored. A file that exists but could not be read is never overwritten.
     void writeDHCPServerConfig(const QString &path = paths::serverDefaults());
 
 private:
@@ -97,12 +101,16 @@ private:
     void handleFollowingFinished(int exitCode, QProcess::ExitStatus exitStatus);
     void abandonFollowing();
     void reportFailedOperation(const QString &detail);
+    void report(const QString &message, const QString &reason = {});
+    QStringList adoptFile(const QByteArray &content);
 
     ServiceCommand *m_process;                   // of the operation under way, if any
     std::unique_ptr<ServiceCommand> m_following; // the query of followState()
     bool m_followAgain{};                        // the service may have changed since that query began
     ServerStates m_state{Updating};
     bool m_serverHasDied{}; // the service counts as stopped, but for the service manager it is active
+    QString m_errorReason;
+    QString m_filePath;      // of the defaults file read last
     QStringList m_fileLines; // with their terminators
     QMap<QString, bool> m_interfaces;
     TextEncoding m_fileEncoding;

@@ -90,25 +90,34 @@ void DhcpServerManager::collectSystemInterfaces()
 
 void DhcpServerManager::readInterfacesFile(const QString &path)
 {
+    m_filePath = path;
     m_fileLines.clear();
-    const std::optional<QByteArray> content{fileio::readFile(path)};
+    QString reason;
+    const std::optional<QByteArray> content{fileio::readFile(path, &reason)};
     m_fileWasRead = content.has_value();
     if (!content) {
-        emit error(QObject::tr("Unable to open file '%1' for read").arg(path));
+        report(QObject::tr("Unable to open file '%1' for read").arg(path), reason);
         return;
     }
-    m_fileEncoding = TextEncoding::detect(*content);
+    const QStringList served{adoptFile(*content)};
+    for (const QString &name : served)
+        m_interfaces.insert(name, true);
+}
 
+// Takes over the lines of the defaults file, and returns the names that it serves.
+QStringList DhcpServerManager::adoptFile(const QByteArray &content)
+{
+    m_fileEncoding = TextEncoding::detect(content);
+    m_fileLines.clear();
     // Deliberately one list for all lines: the last line with the key decides, even one that cannot be taken apart.
     // Such a line is dropped, so that the next write leaves it out, but its pieces count as names.
     QStringList served;
-    const QStringList lines{linesOf(m_fileEncoding.decode(*content))};
+    const QStringList lines{linesOf(m_fileEncoding.decode(content))};
     for (const QString &line : lines) {
         if (!line.contains(interfacesKey) || splitInterfacesLine(line, served))
             m_fileLines.append(line);
     }
-    for (const QString &name : qAsConst(served))
-        m_interfaces.insert(name, true);
+    return served;
 }
 
 const QMap<QString, bool> &DhcpServerManager::interfaces() const { return m_interfaces; }
@@ -123,14 +132,29 @@ void DhcpServerManager::setInterfaces(const QMap<QString, bool> &interfaces)
 
 void DhcpServerManager::writeDHCPServerConfig(const QString &path)
 {
-    // Deliberately replaces commented lines with the key too.
-    for (QString &line : m_fileLines) {
-        if (line.contains(interfacesKey))
-            line = interfacesLine(m_interfaces) + terminatorOf(line);
+    QString reason;
+    const bool isFileRead{path == m_filePath};
+    bool mayReplace{true};
+    if (QFileInfo::exists(path) && (isFileRead || !m_fileWasRead)) {
+        // What others have changed since, while the choice was made, stays.
+        const std::optional<QByteArray> content{fileio::readFile(path, &reason)};
+        mayReplace = m_fileWasRead && content;
+        if (mayReplace)
+            adoptFile(*content);
     }
-    const bool wouldLoseFile{!m_fileWasRead && QFileInfo::exists(path)};
-    if (wouldLoseFile || !fileio::replaceFile(path, m_fileEncoding.encode(m_fileLines.join(QString{})))) {
+    // Deliberately replaces commented lines with the key too.
+    bool isStored{false};
+    for (QString &line : m_fileLines) {
+        if (!line.contains(interfacesKey))
+            continue;
+        line = interfacesLine(m_interfaces) + terminatorOf(line);
+        isStored = true;
+    }
+    if (!mayReplace || !fileio::replaceFile(path, m_fileEncoding.encode(m_fileLines.join(QString{})), &reason)) {
         updateInterfaces();
-        emit error(QObject::tr("Unable to open file '%1' for write").arg(path));
+        report(QObject::tr("Unable to open file '%1' for write").arg(path), reason);
+    } else if (isFileRead && !isStored) {
+        report(QObject::tr("The choice of interfaces is not stored, since file '%1' has no line with '%2'")
+                   .arg(path, interfacesKey));
     }
 }

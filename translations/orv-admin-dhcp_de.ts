@@ -906,6 +906,10 @@ Möchten Sie fortfahren?</translation>
         <source>Unable to open file &apos;%1&apos; for write</source>
         <translation>Die Datei „%1“ kann nicht zum Schreiben geöffnet werden</translation>
     </message>
+    <message>
+        <source>The choice of interfaces is not stored, since file &apos;%1&apos; has no line with &apos;%2&apos;</source>
+        <translation>Die Auswahl der Schnittstellen ist nicht gespeichert, da die Datei „%1“ keine Zeile mit „%2“ hat</translation>
+    </message>
 </context>
 <context>
     <name>RangeInputDialog</name>

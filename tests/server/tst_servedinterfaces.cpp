@@ -18,6 +18,11 @@ namespace {
 using Choice = QMap<QString, bool>;
 
 QString couldNotRead(const QString &path) { return QStringLiteral("Unable to open file '%1' for read").arg(path); }
+QString notStored(const QString &path)
+{
+    return QStringLiteral("The choice of interfaces is not stored, since file '%1' has no line with 'INTERFACESv4'")
+        .arg(path);
+}
 QString couldNotWrite(const QString &path) { return QStringLiteral("Unable to open file '%1' for write").arg(path); }
 
 // The texts of the errors that `spy` has seen.
@@ -27,6 +32,12 @@ QStringList errorsOf(const QSignalSpy &spy)
     for (const QList<QVariant> &arguments : spy)
         errors.append(arguments.constFirst().toString());
     return errors;
+}
+
+// From now on the reasons of errors are appended to `reasons`, each while it is reported.
+void recordReasons(const DhcpServerManager &manager, QStringList &reasons)
+{
+    QObject::connect(&manager, &DhcpServerManager::error, &manager, [&] { reasons.append(manager.errorReason()); });
 }
 
 // The map to expect: the interfaces of this machine, and those of `served` with the flag set.
@@ -77,6 +88,9 @@ private slots:
     void reportsUnreadableFile();
     void writesChoice_data();
     void writesChoice();
+    void keepsWhatOthersChangeMeanwhile_data();
+    void keepsWhatOthersChangeMeanwhile();
+    void makesFileAgainThatWasRemovedMeanwhile();
     void writesLinesThatItRead_data();
     void writesLinesThatItRead();
     void writesToAnotherPath();
@@ -183,21 +197,30 @@ void ServedInterfacesTest::forgetsNamesThatTheFileNoLongerHas()
 void ServedInterfacesTest::reportsUnreadableFile_data()
 {
     QTest::addColumn<QString>("path");
-    QTest::addRow("missing") << QStringLiteral("/etc/default/absent");
-    QTest::addRow("missing folder") << QStringLiteral("/absent/isc-dhcp-server");
-    QTest::addRow("directory") << QStringLiteral("/etc/default");
+    QTest::addColumn<QString>("reason");
+    const QString missing{QStringLiteral("No such file or directory")};
+    QTest::addRow("missing") << QStringLiteral("/etc/default/absent") << missing;
+    QTest::addRow("missing folder") << QStringLiteral("/absent/isc-dhcp-server") << missing;
+    QTest::addRow("directory") << QStringLiteral("/etc/default") << QStringLiteral("Is a directory");
 }
 
 void ServedInterfacesTest::reportsUnreadableFile()
 {
     QFETCH(const QString, path);
+    QFETCH(const QString, reason);
     const Choice expected{machineInterfacesAnd({QStringLiteral("srv0")})};
     const TemporaryRoot root;
     writeTestFile(paths::serverDefaults(), "INTERFACESv4=\"srv0\"\n");
     DhcpServerManager manager;
     const QSignalSpy errors{&manager, &DhcpServerManager::error};
+    QStringList reasons;
+    recordReasons(manager, reasons);
     manager.readInterfacesFile(root.path(path));
     QCOMPARE(errorsOf(errors), QStringList{couldNotRead(root.path(path))});
+    QCOMPARE(reasons, QStringList{reason});
+    manager.runServer(); // refused, which has no reason of the system's
+    QCOMPARE(reasons.size(), 2);
+    QCOMPARE(reasons.constLast(), QString{});
     QCOMPARE(manager.interfaces(), expected);
 }
 
@@ -258,6 +281,51 @@ void ServedInterfacesTest::writesChoice()
     manager.setInterfaces(choice);
     QCOMPARE(readTestFile(paths::serverDefaults()), after);
     QCOMPARE(manager.interfaces(), choice);
+    const bool isStored{after.contains("INTERFACESv4")};
+    QCOMPARE(errorsOf(errors), isStored ? QStringList{} : QStringList{notStored(paths::serverDefaults())});
+    QCOMPARE(manager.errorReason(), QString{});
+}
+
+void ServedInterfacesTest::keepsWhatOthersChangeMeanwhile_data()
+{
+    QTest::addColumn<QByteArray>("meanwhile");
+    QTest::addColumn<QByteArray>("after");
+    const auto row = [](const char *name, const QByteArray &meanwhile, const QByteArray &after) {
+        QTest::addRow("%s", name) << meanwhile << after;
+    };
+    row("line added", "X=1\nINTERFACESv4=\"srv0\"\nADDED=1\n", "X=1\nINTERFACESv4=\"srv1\"\nADDED=1\n");
+    row("line removed", "INTERFACESv4=\"srv0\"\n", "INTERFACESv4=\"srv1\"\n");
+    row("another choice", "X=1\nINTERFACESv4=\"srv2\"\n", "X=1\nINTERFACESv4=\"srv1\"\n");
+    row("line of the key moved", "INTERFACESv4=\"srv0\"\r\nX=1\n", "INTERFACESv4=\"srv1\"\r\nX=1\n");
+    row("another encoding", "X=\xfc\nINTERFACESv4=\"srv0\"\n", "X=\xfc\nINTERFACESv4=\"srv1\"\n");
+    row("line of the key removed", "X=1\nADDED=1\n", "X=1\nADDED=1\n");
+}
+
+void ServedInterfacesTest::keepsWhatOthersChangeMeanwhile()
+{
+    QFETCH(const QByteArray, meanwhile);
+    QFETCH(const QByteArray, after);
+    const TemporaryRoot root;
+    writeTestFile(paths::serverDefaults(), "X=1\nINTERFACESv4=\"srv0\"\n");
+    DhcpServerManager manager;
+    const QSignalSpy errors{&manager, &DhcpServerManager::error};
+    writeTestFile(paths::serverDefaults(), meanwhile);
+    const Choice choice{{QStringLiteral("srv0"), false}, {QStringLiteral("srv1"), true}};
+    manager.setInterfaces(choice);
+    QCOMPARE(readTestFile(paths::serverDefaults()), after);
+    QCOMPARE(manager.interfaces(), choice);
+    QCOMPARE(errors.size(), after.contains("INTERFACESv4") ? 0 : 1);
+}
+
+void ServedInterfacesTest::makesFileAgainThatWasRemovedMeanwhile()
+{
+    const TemporaryRoot root;
+    writeTestFile(paths::serverDefaults(), "X=1\nINTERFACESv4=\"srv0\"\n");
+    DhcpServerManager manager;
+    const QSignalSpy errors{&manager, &DhcpServerManager::error};
+    QVERIFY(QFile::remove(paths::serverDefaults()));
+    manager.setInterfaces({{QStringLiteral("srv1"), true}});
+    QCOMPARE(readTestFile(paths::serverDefaults()), QByteArray{"X=1\nINTERFACESv4=\"srv1\"\n"});
     QCOMPARE(errorsOf(errors), QStringList{});
 }
 
@@ -347,7 +415,7 @@ void ServedInterfacesTest::createsMissingFileWithoutTheChoice()
     const QSignalSpy errors{&manager, &DhcpServerManager::error};
     const Choice choice{{QStringLiteral("srv0"), true}};
     manager.setInterfaces(choice);
-    QCOMPARE(errorsOf(errors), QStringList{});
+    QCOMPARE(errorsOf(errors), QStringList{notStored(paths::serverDefaults())});
     QCOMPARE(readTestFile(paths::serverDefaults()), QByteArray{});
     QCOMPARE(manager.interfaces(), choice);
 }
@@ -366,8 +434,12 @@ void ServedInterfacesTest::neverOverwritesFileThatItCouldNotRead()
         DhcpServerManager manager;
         const Choice before{manager.interfaces()};
         const QSignalSpy errors{&manager, &DhcpServerManager::error};
+        QStringList reasons;
+        recordReasons(manager, reasons);
         manager.setInterfaces({{QStringLiteral("srv1"), true}});
         QCOMPARE(errorsOf(errors), (QStringList{couldNotRead(path), couldNotWrite(path)}));
+        const QString reason{QStringLiteral("Permission denied")};
+        QCOMPARE(reasons, (QStringList{reason, reason}));
         QCOMPARE(manager.interfaces(), before);
     }
     QVERIFY(QFile::setPermissions(path, everyoneMayRead));
@@ -406,6 +478,8 @@ void ServedInterfacesTest::givesChoiceUpWhenWriteFails()
     {
         const WithoutPrivileges withoutPrivileges;
         QStringList errors;
+        QStringList reasons;
+        recordReasons(manager, reasons);
         Choice whenReported;
         connect(&manager, &DhcpServerManager::error, &manager, [&](const QString &message) {
             errors.append(message);
@@ -414,6 +488,7 @@ void ServedInterfacesTest::givesChoiceUpWhenWriteFails()
         manager.setInterfaces({{QStringLiteral("srv1"), true}});
         QCOMPARE(errors, QStringList{couldNotWrite(path)});
         QCOMPARE(whenReported, before);
+        QCOMPARE(reasons, QStringList{QStringLiteral("Permission denied")});
     }
     QCOMPARE(readTestFile(path), content);
     QCOMPARE(QDir{defaultsFolder()}.entryList(QDir::Files), QStringList{QFileInfo{path}.fileName()});
@@ -432,6 +507,7 @@ void ServedInterfacesTest::doesNotWriteOverDirectory()
     const QSignalSpy errors{&manager, &DhcpServerManager::error};
     manager.writeDHCPServerConfig(defaultsFolder());
     QCOMPARE(errorsOf(errors), QStringList{couldNotWrite(defaultsFolder())});
+    QCOMPARE(manager.errorReason(), QStringLiteral("Is a directory"));
     QVERIFY(QFileInfo{defaultsFolder()}.isDir());
 }
 
