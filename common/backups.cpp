@@ -45,6 +45,13 @@ qint64 microsecondsOf(const QByteArray &stamp)
     return time.toMSecsSinceEpoch() * microsecondsPerMillisecond + stamp.mid(millisecondsLength, 3).toLongLong();
 }
 
+// Whether there is such a time, and one after it that can be written in the same way.
+bool isStamp(const QByteArray &stamp)
+{
+    const qint64 time{microsecondsOf(stamp)};
+    return stampOf(time) == stamp && stampOf(time + 1).size() == stampLength;
+}
+
 qint64 now()
 {
     using namespace std::chrono;
@@ -87,7 +94,7 @@ public:
     {
         const QVector<QByteArray> entries{posix::entries(folder)};
         for (const QByteArray &entry : entries) {
-            if (entry.size() == m_prefix.size() + stampLength && entry.startsWith(m_prefix))
+            if (entry.startsWith(m_prefix) && isStamp(entry.mid(m_prefix.size())))
                 m_versions.append(entry);
         }
         std::sort(m_versions.begin(), m_versions.end());
@@ -106,8 +113,11 @@ public:
             return {};
         posix::syncDirectory(m_folder);
         m_versions.append(version);
+        m_hasAdded = true;
         return version;
     }
+
+    bool hasAdded() const { return m_hasAdded; }
 
     void removeAllButFirstAndNewest()
     {
@@ -137,13 +147,14 @@ private:
     QByteArray m_name;
     QByteArray m_prefix;
     QVector<QByteArray> m_versions; // oldest first
+    bool m_hasAdded{};
 };
 
 } // namespace
 
 namespace backups {
 
-QString keep(const QString &path, const QByteArray &content)
+QString keep(const QString &path, const QByteArray &content, bool *isNew)
 {
     const FileDescriptor folder{openBackupFolder()};
     if (!folder.isOpen())
@@ -151,7 +162,16 @@ QString keep(const QString &path, const QByteArray &content)
     Series series{folder.get(), baseName(path), QByteArrayLiteral(".")};
     const QByteArray version{series.add(content)};
     series.removeAllButFirstAndNewest();
+    if (isNew)
+        *isNew = series.hasAdded();
     return version.isEmpty() ? QString{} : QDir{paths::backupDirectory()}.filePath(QFile::decodeName(version));
+}
+
+bool giveUp(const QString &version)
+{
+    const FileDescriptor folder{openBackupFolder()};
+    const QByteArray name{QFile::encodeName(QFileInfo{version}.fileName())};
+    return folder.isOpen() && unlinkat(folder.get(), name.constData(), 0) == 0;
 }
 
 QByteArray keepBeside(int directory, const QByteArray &name, const QByteArray &content)

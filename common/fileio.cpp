@@ -140,6 +140,8 @@ Attempt refusedByDirectory(std::error_code error)
     return {error, false};
 }
 
+bool isLackOfRoom(std::error_code error) { return error.value() == ENOSPC || error.value() == EDQUOT; }
+
 Attempt replaceByRename(int directory, const QByteArray &name, const FileDescriptor &old, const QByteArray &content)
 {
     TemporaryFile file{directory, name};
@@ -236,14 +238,20 @@ QString replace(const QString &path, const QByteArray &content)
     QByteArray oldContent;
     std::error_code unread;
     QString keptAs;
+    bool isKeptNow{};
     if (old.isOpen()) {
         const FileDescriptor readable{posix::openAt(directory.get(), location.name, O_RDONLY | O_NOFOLLOW)};
         unread = readable.isOpen() ? posix::readAll(readable.get(), oldContent) : posix::lastError();
         if (!unread)
-            keptAs = backups::keep(location.path(), oldContent);
+            keptAs = backups::keep(location.path(), oldContent, &isKeptNow);
     }
     if (!old.isOpen() || (status.st_nlink == 1 && !isMountPoint(old.get()))) {
-        const Attempt attempt{replaceByRename(directory.get(), location.name, old, content)};
+        Attempt attempt{replaceByRename(directory.get(), location.name, old, content)};
+        // The save comes first where there is room for one of the two only.
+        if (isKeptNow && isLackOfRoom(attempt.error) && backups::giveUp(keptAs)) {
+            keptAs.clear();
+            attempt = replaceByRename(directory.get(), location.name, old, content);
+        }
         if (!attempt.error)
             return {};
         if (!old.isOpen() || !attempt.mayWriteInPlace)

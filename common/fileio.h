@@ -16,8 +16,8 @@ std::optional<QByteArray> readFile(const QString &path, QString *reason = nullpt
 
 /// Replaces the content of the file at `path`, or creates it: afterwards it holds wholly the old or wholly the new
 /// content, under the owner, group, mode, ACL and extended attributes that it had. A symbolic link is followed. The old
-/// content is kept among the backups where that can be done. Returns false when the new content is not in place, with
-/// the system's reason in `reason` if given.
+/// content is kept among the backups where that can be done and leaves room for the new one. Returns false when the new
+/// content is not in place, with the system's reason in `reason` if given.
 ///
 /// The file is renamed over. Where that cannot serve (it is bind-mounted, has several names, or its attributes cannot
 /// be given to a new one) it is written in place, but only after a synced copy of the old content was kept; on an error

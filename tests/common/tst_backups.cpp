@@ -63,6 +63,9 @@ private slots:
     void keepsFilesOfDifferentPathsApart();
     void takesALinkForItsTarget();
     void keepsOrderAfterTheClockWasSetBack();
+    void keepsEveryVersionBesideNamesWithoutATime_data();
+    void keepsEveryVersionBesideNamesWithoutATime();
+    void givesUpOnlyWhatIsThere();
     void keepsFilesWithLongPaths();
     void cleansWhatAKilledSaveLeft();
     void makesTheFoldersAbove();
@@ -192,6 +195,46 @@ void BackupsTest::keepsOrderAfterTheClockWasSetBack()
         QVERIFY(!backups::keep(QStringLiteral("/f"), numbered(i)).isEmpty());
     QCOMPARE(contents(), (QVector<QByteArray>{numbered(0), numbered(1), numbered(2), numbered(3)}));
     QCOMPARE(versions().last(), QStringLiteral("f.21000101T000000.000002Z"));
+}
+
+void BackupsTest::keepsEveryVersionBesideNamesWithoutATime_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addRow("no such month") << QStringLiteral("f.20259921T014800.123456Z");
+    QTest::addRow("digits only") << QStringLiteral("f.99999999T999999.999999Z");
+    QTest::addRow("no digits") << QStringLiteral("f.zzzzzzzzTzzzzzz.zzzzzzZ");
+    QTest::addRow("no microseconds") << QStringLiteral("f.20251121T014800.123xyzZ");
+    QTest::addRow("the last time there is") << QStringLiteral("f.99991231T235959.999999Z");
+}
+
+void BackupsTest::keepsEveryVersionBesideNamesWithoutATime()
+{
+    QFETCH(const QString, name);
+    QVERIFY(!backups::keep(QStringLiteral("/f"), numbered(0)).isEmpty());
+    writeTestFile(folder() + QLatin1Char{'/'} + name, "not ours\n");
+    constexpr int count{newestKept + 5};
+    for (int i{1}; i <= count; ++i)
+        QVERIFY(!backups::keep(QStringLiteral("/f"), numbered(i)).isEmpty());
+
+    QCOMPARE(readTestFile(folder() + QLatin1Char{'/'} + name), QByteArray{"not ours\n"});
+    QVector<QByteArray> expected{numbered(0)};
+    for (int i{count - newestKept + 1}; i <= count; ++i)
+        expected.append(numbered(i));
+    QVector<QByteArray> kept{contents()};
+    QVERIFY(kept.removeOne("not ours\n"));
+    QCOMPARE(kept, expected);
+}
+
+void BackupsTest::givesUpOnlyWhatIsThere()
+{
+    bool isNew{false};
+    const QString version{backups::keep(QStringLiteral("/f"), "one\n", &isNew)};
+    QVERIFY(isNew);
+    backups::keep(QStringLiteral("/f"), "one\n", &isNew);
+    QVERIFY(!isNew);
+    QVERIFY(backups::giveUp(version));
+    QVERIFY(!backups::giveUp(version));
+    QVERIFY(versions().isEmpty());
 }
 
 void BackupsTest::keepsFilesWithLongPaths()

@@ -240,6 +240,8 @@ private slots:
 
     void failsWhenFull_data();
     void failsWhenFull();
+    void savesWhereThereIsRoomForOneCopyOnly_data();
+    void savesWhereThereIsRoomForOneCopyOnly();
     void overwritesNothingWhenThereIsNoRoom();
     void failsInPlaceWhenFullAndRoomCannotBeReserved();
     void failsBeyondTheSizeLimit_data();
@@ -736,6 +738,36 @@ void FileIoTest::failsWhenFull()
             return QStringLiteral("cannot link");
         const QString problem{problemOfSaving(paths::configuration(), newContent, false, small)};
         return problem + problemOfSaving(paths::configuration(), laterContent, true, small);
+    }));
+}
+
+void FileIoTest::savesWhereThereIsRoomForOneCopyOnly_data()
+{
+    QTest::addColumn<int>("size");
+    QTest::addColumn<QByteArray>("kept");
+    // Of 64 KiB, with a file of 24 KiB.
+    QTest::addRow("room for both") << 12 * 1024 << QByteArray(24 * 1024, 'o');
+    QTest::addRow("room for one") << 24 * 1024 << QByteArray{};
+    QTest::addRow("room for one, and all of it") << 40 * 1024 << QByteArray{};
+}
+
+void FileIoTest::savesWhereThereIsRoomForOneCopyOnly()
+{
+    QFETCH(int, size);
+    QFETCH(QByteArray, kept);
+    QVERIFY_NO_PROBLEM(inMountNamespace([&]() -> QString {
+        if (mount("none", local(m_root->path({})).constData(), "tmpfs", 0, "size=64k") < 0)
+            return QStringLiteral("skip: no tmpfs");
+        QDir{}.mkpath(directory());
+        QDir{}.mkpath(QFileInfo{QDir::cleanPath(paths::backupDirectory())}.path());
+        const QByteArray before(24 * 1024, 'o');
+        if (!put(paths::configuration(), before))
+            return QStringLiteral("cannot write");
+        const QString problem{problemOfSaving(paths::configuration(), QByteArray(size, 'n'), true, before)};
+        const QStringList versions{namesIn(paths::backupDirectory())};
+        const QString version{paths::backupDirectory() + versions.value(0)};
+        return problem + difference("versions", versions.size(), kept.isEmpty() ? 0 : 1) +
+               difference("kept", versions.isEmpty() ? QByteArray{} : contentOf(version), kept);
     }));
 }
 
