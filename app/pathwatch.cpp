@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/pathwatch.h"
 
+#include <QDir>
 #include <QFile>
-#include <QFileSystemWatcher>
+#include <QFileInfo>
+
+#include <sys/stat.h>
 
 namespace {
 
@@ -21,6 +24,28 @@ void watch(QFileSystemWatcher *watcher, const QString &path)
         watcher->addPath(path);
 }
 
+// Tells the directory at `path` from every other one that there is at the time; empty where there is none.
+QByteArray identityOf(const QString &path)
+{
+    struct stat status
+    {
+    };
+    if (stat(QFile::encodeName(path).constData(), &status) < 0)
+        return {};
+    return QByteArray::number(static_cast<qulonglong>(status.st_dev)) + ':' +
+           QByteArray::number(static_cast<qulonglong>(status.st_ino));
+}
+
+QString parentOf(const QString &path) { return QFileInfo{QDir::cleanPath(path)}.path(); }
+
+QString nearestAbove(const QString &path)
+{
+    QString above{parentOf(path)};
+    while (!QFile::exists(above) && above != parentOf(above))
+        above = parentOf(above);
+    return above;
+}
+
 } // namespace
 
 PathWatch::PathWatch(const QString &file, const QString &directory, QObject *parent)
@@ -34,26 +59,50 @@ PathWatch::PathWatch(const QString &file, const QString &directory, QObject *par
     m_burst.setInterval(burstMilliseconds);
     connect(&m_burst, &QTimer::timeout, this, &PathWatch::notify);
 
-    // A running timer is not restarted: a file written to all the time is noticed ten times a second, not never.
-    const auto startBurst = [this] {
-        if (!m_burst.isActive())
-            m_burst.start();
-    };
-    connect(m_directoryWatcher, &QFileSystemWatcher::directoryChanged, this, startBurst);
-    connect(m_fileWatcher, &QFileSystemWatcher::fileChanged, this, startBurst);
+    connect(m_directoryWatcher, &QFileSystemWatcher::directoryChanged, this, &PathWatch::startBurst);
+    connect(m_fileWatcher, &QFileSystemWatcher::fileChanged, this, &PathWatch::startBurst);
+    connect(&m_aboveWatcher, &QFileSystemWatcher::directoryChanged, this, &PathWatch::noteAbove);
     resume();
 }
 
 void PathWatch::pause()
 {
+    unwatch(&m_aboveWatcher);
     unwatch(m_directoryWatcher);
     unwatch(m_fileWatcher);
 }
 
 void PathWatch::resume()
 {
+    watchAbove();
+    m_identity = identityOf(m_directory);
     watch(m_directoryWatcher, m_directory);
     watch(m_fileWatcher, m_file);
+}
+
+void PathWatch::watchAbove()
+{
+    // A folder that is made before the one above it is watched is not announced by that one.
+    for (QString above; above != nearestAbove(m_directory);) {
+        above = nearestAbove(m_directory);
+        unwatch(&m_aboveWatcher);
+        watch(&m_aboveWatcher, above);
+    }
+}
+
+// Most changes above have nothing to do with the directory: files come and go beside it.
+void PathWatch::noteAbove()
+{
+    watchAbove();
+    if (identityOf(m_directory) != m_identity)
+        startBurst();
+}
+
+// A running timer is not restarted: a file written to all the time is noticed ten times a second, not never.
+void PathWatch::startBurst()
+{
+    if (!m_burst.isActive())
+        m_burst.start();
 }
 
 void PathWatch::notify()

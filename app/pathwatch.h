@@ -1,13 +1,15 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include <QByteArray>
+#include <QFileSystemWatcher>
 #include <QObject>
 #include <QString>
 #include <QTimer>
 
-class QFileSystemWatcher;
-
 /// Notices when a file is changed, replaced, removed or made, through a watcher of the file and one of its directory.
+/// The directory may be removed, replaced and made again; a third watcher, of the nearest folder above that exists,
+/// tells.
 ///
 /// Notifications that arrive within 100 ms of the first one count as one. Both paths are watched anew after every
 /// notice: a path whose file was replaced while somebody holds the old one open stays on the dead file otherwise.
@@ -32,11 +34,16 @@ signals:
     void changed();
 
 private:
+    void watchAbove();
+    void noteAbove();
+    void startBurst();
     void notify();
 
     QString m_file;
     QString m_directory;
     QFileSystemWatcher *m_fileWatcher{};
     QFileSystemWatcher *m_directoryWatcher{};
+    QFileSystemWatcher m_aboveWatcher;
+    QByteArray m_identity; // of the directory that is watched, empty while there is none
     QTimer m_burst;
 };
