@@ -7,6 +7,7 @@
 #include "tests/support/fakesystemctl.h"
 #include "tests/support/temporaryroot.h"
 
+#include <QElapsedTimer>
 #include <QTest>
 
 #include <memory>
@@ -51,6 +52,7 @@ private slots:
 
     void asksWhenTheUnitChanges();
     void asksOnceForABurst();
+    void asksSeldomWhileTheUnitKeepsChanging();
     void asksNothingForOtherUnits();
     void noticesWhatChangedBeforeItSubscribed();
     void repeatsNothingAfterAnOperation();
@@ -85,6 +87,22 @@ void ServiceWatchTest::asksOnceForABurst()
     QTest::qWait(1000);
     QCOMPARE(service.systemctl.verbs().size(), 3);
     QCOMPARE(service.events, QStringList{});
+}
+
+void ServiceWatchTest::asksSeldomWhileTheUnitKeepsChanging()
+{
+    const Watched service{*m_bus, FakeSystemctl::Stopped};
+    QElapsedTimer time;
+    time.start();
+    while (time.elapsed() < 1000) {
+        m_bus->announce();
+        QTest::qWait(10);
+    }
+    const qint64 bursts{time.elapsed() / 200 + 1};
+    QTest::qWait(500);
+    const int queries{service.systemctl.verbs().size() - 2};
+    QVERIFY(queries > 1);
+    QVERIFY2(queries <= bursts, qPrintable(QString::number(queries)));
 }
 
 void ServiceWatchTest::asksNothingForOtherUnits()
