@@ -32,15 +32,16 @@ int main(int argc, char *argv[])
     // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
     QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
     QtSingleApplication application{argc, argv};
-    if (application.isRunning()) {
-        application.sendMessage(QStringLiteral("raise"), raiseMilliseconds);
-        return EXIT_FAILURE;
-    }
 
     QTranslator qtTranslator;
     QTranslator translator;
     installTranslator(&qtTranslator, QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
     installTranslator(&translator, QStringLiteral("orv-admin-dhcp"), QStringLiteral(":/i18n"));
+
+    if (application.isRunning()) {
+        application.sendMessage(QStringLiteral("raise"), raiseMilliseconds);
+        return EXIT_FAILURE;
+    }
 
     orvInit(version, description);
     if (getuid() != 0) {

@@ -4,17 +4,30 @@
 #include "platform/runtimedirectory.h"
 
 #include <QFileInfo>
+#include <QMessageBox>
 #include <QWidget>
+
+#include <unistd.h>
 
 QtSingleApplication::QtSingleApplication(int &argc, char **argv, bool /*guiEnabled*/)
     : QApplication{argc, argv}
     , m_id{QFileInfo{applicationFilePath()}.fileName()}
-    , m_instance{runtimeDirectory(), m_id}
+    , m_directory{runtimeDirectory()}
+    , m_instance{m_directory, m_id}
 {
     connect(&m_instance, &SingleInstance::messageReceived, this, &QtSingleApplication::messageReceived);
 }
 
-bool QtSingleApplication::isRunning() { return m_instance.isOtherRunning(); }
+bool QtSingleApplication::isRunning()
+{
+    if (!m_directory.isEmpty() || geteuid() != 0)
+        return m_instance.isOtherRunning();
+    QMessageBox::critical(nullptr, tr("Error"),
+                          tr("The program does not start, since it cannot tell whether it is running already: there is "
+                             "no folder '%1' that only the superuser can enter.")
+                              .arg(ownRuntimeDirectory()));
+    return true;
+}
 
 QString QtSingleApplication::id() const { return m_id; }
 

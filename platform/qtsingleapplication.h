@@ -22,7 +22,8 @@ public:
     QtSingleApplication(int &argc, char **argv, bool guiEnabled = true);
     Q_DISABLE_COPY_MOVE(QtSingleApplication)
 
-    /// Whether another instance runs; otherwise this one is the first from now on.
+    /// Whether another instance runs; otherwise this one is the first from now on. Where the superuser has no folder
+    /// for the lock, nobody can tell: a message says so, and another one counts as running.
     bool isRunning();
     QString id() const;
 
@@ -40,6 +41,7 @@ signals:
 
 private:
     QString m_id;
+    QString m_directory; // of lock and socket, empty where there is none
     SingleInstance m_instance;
     QPointer<QWidget> m_activationWindow;
 };

@@ -9,6 +9,13 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+OwnersUmask::OwnersUmask()
+    : m_before{umask(S_IRWXG | S_IRWXO)}
+{
+}
+
+OwnersUmask::~OwnersUmask() { umask(m_before); }
+
 bool isPrivateDirectory(const QString &path)
 {
     struct stat status
@@ -22,6 +29,7 @@ bool isPrivateDirectory(const QString &path)
 bool makePrivateDirectory(const QString &path)
 {
     if (!QFileInfo::exists(path)) {
+        const OwnersUmask mask;
         QDir{}.mkpath(QFileInfo{path}.path());
         mkdir(QFile::encodeName(path).constData(), S_IRWXU);
     }
@@ -37,6 +45,9 @@ QString ownRuntimeDirectory()
 
 QString runtimeDirectory(const QString &own)
 {
+    // A superuser has a session in one place and none in another, by "sudo" or at a console.
+    if (geteuid() == 0)
+        return makePrivateDirectory(own) ? own : QString{};
     for (const QString &session :
          {qEnvironmentVariable("XDG_RUNTIME_DIR"), QStringLiteral("/run/user/") + QString::number(geteuid())}) {
         if (isPrivateDirectory(session))

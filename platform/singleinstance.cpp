@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "platform/singleinstance.h"
 
+#include "platform/runtimedirectory.h"
+
 #include <QDeadlineTimer>
 #include <QLocalSocket>
 #include <QThread>
@@ -43,7 +45,10 @@ SingleInstance::SingleInstance(const QString &directory, const QString &id)
 
 bool SingleInstance::isOtherRunning()
 {
-    if (m_socketPath.isEmpty() || m_lockFile.isOpen() || !m_lockFile.open(QIODevice::ReadWrite))
+    if (m_socketPath.isEmpty() || m_lockFile.isOpen())
+        return false;
+    const OwnersUmask mask;
+    if (!m_lockFile.open(QIODevice::ReadWrite))
         return false;
     if (flock(m_lockFile.handle(), LOCK_EX | LOCK_NB) != 0) {
         const bool otherHoldsIt{errno == EWOULDBLOCK};

@@ -912,6 +912,17 @@ Möchten Sie fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>QtSingleApplication</name>
+    <message>
+        <source>Error</source>
+        <translation>Fehler</translation>
+    </message>
+    <message>
+        <source>The program does not start, since it cannot tell whether it is running already: there is no folder &apos;%1&apos; that only the superuser can enter.</source>
+        <translation>Das Programm startet nicht, da es nicht feststellen kann, ob es bereits läuft: Es gibt keinen Ordner „%1“, den nur der Superuser betreten kann.</translation>
+    </message>
+</context>
+<context>
     <name>RangeInputDialog</name>
     <message>
         <source>Dialog</source>

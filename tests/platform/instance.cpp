@@ -3,7 +3,9 @@
 #include "platform/qtsingleapplication.h"
 
 #include <QEvent>
+#include <QMessageBox>
 #include <QThread>
+#include <QTimer>
 #include <QWidget>
 #include <QWindow>
 
@@ -36,6 +38,16 @@ private:
     bool m_watched{false};
 };
 
+// Tells what a message box says, and closes it.
+void answerBox()
+{
+    auto *box = qobject_cast<QMessageBox *>(QtSingleApplication::activeModalWidget());
+    if (!box)
+        return;
+    tell("box: " + box->text().toUtf8());
+    box->accept();
+}
+
 } // namespace
 
 // Arguments: for how many milliseconds a later instance waits for the receipt, and for how many the first one is busy
@@ -44,13 +56,18 @@ int main(int argc, char *argv[])
 {
     QtSingleApplication application{argc, argv};
     const QStringList arguments{QtSingleApplication::arguments()};
+    QTimer boxes;
+    QObject::connect(&boxes, &QTimer::timeout, &boxes, answerBox);
+    boxes.start(10);
     if (application.isRunning()) {
+        boxes.stop();
         const bool sent{application.sendMessage(QStringLiteral("raise"), arguments.value(1).toInt())};
         tell(sent ? "sent" : "not sent");
         tell("windows: " + QByteArray::number(QGuiApplication::topLevelWindows().size()));
         return EXIT_FAILURE;
     }
 
+    boxes.stop();
     MainWindow window;
     QWidget cover;
     window.showMinimized();

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "platform/singleinstance.h"
 
+#include <QDir>
+#include <QFileInfo>
 #include <QLocalSocket>
 #include <QProcess>
 #include <QSignalSpy>
@@ -10,7 +12,9 @@
 
 #include <memory>
 
+#include <sched.h>
 #include <sys/file.h>
+#include <sys/mount.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/un.h>
@@ -20,6 +24,7 @@
 namespace {
 
 const QString instanceName{QStringLiteral("orv_test_instance")};
+const QString superusersFolder{QStringLiteral("/run/orv-admin-dhcp")};
 constexpr uid_t otherUser{65534};
 
 enum StrangersFate
@@ -78,10 +83,17 @@ class QtSingleApplicationTest final : public QObject
     Q_OBJECT
 
 private slots:
+    void initTestCase();
     void init();
     void cleanup();
 
     void laterInstanceRaisesTheFirstAndEnds();
+    void superuserHasOneInstanceWhereverItLogsIn_data();
+    void superuserHasOneInstanceWhereverItLogsIn();
+    void instanceMadeUnderAnyUmaskIsFound_data();
+    void instanceMadeUnderAnyUmaskIsFound();
+    void superuserWithoutAFolderIsToldSo_data();
+    void superuserWithoutAFolderIsToldSo();
     void lockAndSocketOfAKilledInstanceDoNotBlock();
     void leftOverFilesOfAnyContentDoNotBlock();
     void oneOfTwoStartedTogetherWins();
@@ -101,9 +113,14 @@ private:
     Instance start(int timeout = 30000, int busy = 0) const;
     Instance startFirst(int busy = 0) const;
     static QStringList outputAtEnd(QProcess &process);
-    QString path(const char *suffix) const { return m_folder->filePath(instanceName + QLatin1String{suffix}); }
+    QString folder() const { return geteuid() == 0 ? superusersFolder : m_session->path(); }
+    QString path(const char *suffix) const
+    {
+        return folder() + QLatin1Char{'/'} + instanceName + QLatin1String{suffix};
+    }
 
-    std::unique_ptr<QTemporaryDir> m_folder;
+    std::unique_ptr<QTemporaryDir> m_session; // the runtime directory of the session
+    QString m_sessionPath;                    // what instances are told that it is
 };
 
 // Returns the next line, once all of it is there.
@@ -113,19 +130,43 @@ private:
         QCOMPARE((PROCESS)->readLine().trimmed(), QByteArray{LINE});                                                   \
     } while (false)
 
-void QtSingleApplicationTest::init()
+// The superuser's instances meet in /run: here in one of the test's own, and where the machine does not allow that, an
+// ordinary user's are tested.
+void QtSingleApplicationTest::initTestCase()
 {
-    m_folder = std::make_unique<QTemporaryDir>();
-    QVERIFY(m_folder->isValid());
+    if (geteuid() != 0)
+        return;
+    if (unshare(CLONE_NEWNS) == 0 && mount("none", "/", nullptr, MS_REC | MS_PRIVATE, nullptr) == 0 &&
+        mount("none", "/run", "tmpfs", 0, "mode=0755") == 0)
+        return;
+    QCOMPARE(setresgid(otherUser, otherUser, otherUser), 0);
+    QCOMPARE(setresuid(otherUser, otherUser, otherUser), 0);
+    if (!QFileInfo{QStringLiteral(ORV_TEST_INSTANCE)}.isExecutable())
+        QSKIP("an ordinary user cannot start the program that was built here");
 }
 
-void QtSingleApplicationTest::cleanup() { m_folder.reset(); }
+void QtSingleApplicationTest::init()
+{
+    m_session = std::make_unique<QTemporaryDir>();
+    QVERIFY(m_session->isValid());
+    m_sessionPath = m_session->path();
+    if (geteuid() == 0)
+        QVERIFY(QDir{}.mkdir(superusersFolder));
+    QCOMPARE(chmod(QFile::encodeName(folder()).constData(), 0700), 0);
+}
+
+void QtSingleApplicationTest::cleanup()
+{
+    m_session.reset();
+    if (geteuid() == 0)
+        QDir{superusersFolder}.removeRecursively();
+}
 
 Instance QtSingleApplicationTest::start(int timeout, int busy) const
 {
     Instance process{new QProcess};
     QProcessEnvironment environment{QProcessEnvironment::systemEnvironment()};
-    environment.insert(QStringLiteral("XDG_RUNTIME_DIR"), m_folder->path());
+    environment.insert(QStringLiteral("XDG_RUNTIME_DIR"), m_sessionPath);
     process->setProcessEnvironment(environment);
     process->setProcessChannelMode(QProcess::ForwardedErrorChannel);
     process->start(QStringLiteral(ORV_TEST_INSTANCE), {QString::number(timeout), QString::number(busy)});
@@ -153,6 +194,85 @@ void QtSingleApplicationTest::laterInstanceRaisesTheFirstAndEnds()
     QCOMPARE(later->exitCode(), 1);
     EXPECT_LINE(first, "message: raise");
     EXPECT_LINE(first, "in front");
+}
+
+void QtSingleApplicationTest::superuserHasOneInstanceWhereverItLogsIn_data()
+{
+    QTest::addColumn<bool>("isFirstInSession");
+    QTest::addColumn<bool>("isLaterInSession");
+    QTest::addRow("with a session, then without") << true << false;
+    QTest::addRow("without a session, then with") << false << true;
+    QTest::addRow("with two sessions") << true << true;
+}
+
+void QtSingleApplicationTest::superuserHasOneInstanceWhereverItLogsIn()
+{
+    if (geteuid() != 0)
+        QSKIP("only for the superuser, in a mount namespace");
+    QFETCH(const bool, isFirstInSession);
+    QFETCH(const bool, isLaterInSession);
+    const QTemporaryDir otherSession;
+    m_sessionPath = isFirstInSession ? m_session->path() : QString{};
+    const auto first = startFirst();
+    m_sessionPath = isLaterInSession ? otherSession.path() : QString{};
+    const auto later = start();
+    QCOMPARE(outputAtEnd(*later), QStringList({QStringLiteral("sent"), QStringLiteral("windows: 0")}));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void QtSingleApplicationTest::instanceMadeUnderAnyUmaskIsFound_data()
+{
+    QTest::addColumn<uint>("mask");
+    for (const uint mask : {0U, 077U, 0277U, 0777U})
+        QTest::addRow("umask %04o", mask) << mask;
+}
+
+void QtSingleApplicationTest::instanceMadeUnderAnyUmaskIsFound()
+{
+    QFETCH(const uint, mask);
+    if (geteuid() == 0)
+        QVERIFY(QDir{}.rmdir(superusersFolder));
+    const mode_t before{umask(mask)};
+    const auto first = startFirst();
+    umask(before);
+    for (const char *suffix : {".lock", ".socket"})
+        QVERIFY2(QFile::permissions(path(suffix)) & QFile::WriteOwner, suffix);
+    const auto later = start();
+    QCOMPARE(outputAtEnd(*later).value(0), QStringLiteral("sent"));
+    EXPECT_LINE(first, "message: raise");
+}
+
+void QtSingleApplicationTest::superuserWithoutAFolderIsToldSo_data()
+{
+    QTest::addColumn<QString>("trap");
+    QTest::addRow("open to others") << QStringLiteral("open");
+    QTest::addRow("of another user") << QStringLiteral("owner");
+    QTest::addRow("a file") << QStringLiteral("file");
+}
+
+void QtSingleApplicationTest::superuserWithoutAFolderIsToldSo()
+{
+    if (geteuid() != 0)
+        QSKIP("only for the superuser, in a mount namespace");
+    QFETCH(const QString, trap);
+    const QByteArray name{QFile::encodeName(superusersFolder)};
+    if (trap == QLatin1String{"open"})
+        QCOMPARE(chmod(name.constData(), 0755), 0);
+    if (trap == QLatin1String{"owner"})
+        QCOMPARE(chown(name.constData(), otherUser, otherUser), 0);
+    if (trap == QLatin1String{"file"}) {
+        QVERIFY(QDir{}.rmdir(superusersFolder));
+        QFile file{superusersFolder};
+        QVERIFY(file.open(QIODevice::WriteOnly));
+    }
+    const auto refused = start();
+    const QStringList output{outputAtEnd(*refused)};
+    QVERIFY2(output.value(0).startsWith(QLatin1String{"box: The program does not start, "}),
+             qPrintable(output.join(QLatin1Char{'\n'})));
+    QVERIFY(output.constFirst().contains(superusersFolder));
+    QCOMPARE(output.value(1), QStringLiteral("not sent"));
+    QCOMPARE(refused->exitCode(), 1);
+    QFile::remove(superusersFolder);
 }
 
 void QtSingleApplicationTest::lockAndSocketOfAKilledInstanceDoNotBlock()
@@ -243,7 +363,7 @@ void QtSingleApplicationTest::busyInstanceIsGivenUpSilently()
 void QtSingleApplicationTest::longestMessageArrivesAndALongerOneIsRefused()
 {
     const auto first = startFirst();
-    SingleInstance later{m_folder->path(), instanceName};
+    SingleInstance later{folder(), instanceName};
     QVERIFY(later.isOtherRunning());
     QVERIFY(later.send(QString{64 * 1024, QLatin1Char{'x'}}, 30000));
     EXPECT_LINE(first, "message: 65536");
@@ -275,7 +395,7 @@ void QtSingleApplicationTest::nonsenseIsDropped()
     QTRY_COMPARE_WITH_TIMEOUT(disconnected.count(), 1, 30000);
     QCOMPARE(client.readAll(), QByteArray{});
 
-    SingleInstance later{m_folder->path(), instanceName};
+    SingleInstance later{folder(), instanceName};
     QVERIFY(later.send(QStringLiteral("raise"), 30000));
     EXPECT_LINE(first, "message: raise");
 }
@@ -293,7 +413,7 @@ void QtSingleApplicationTest::silentClientIsDroppedAndKeepsNobodyWaiting()
     QVERIFY(halfway.waitForConnected(30000));
     halfway.write(framed("ra", 5));
 
-    SingleInstance later{m_folder->path(), instanceName};
+    SingleInstance later{folder(), instanceName};
     QVERIFY(later.send(QStringLiteral("raise"), 30000));
     EXPECT_LINE(first, "message: raise");
     EXPECT_LINE(first, "in front");
@@ -315,7 +435,7 @@ void QtSingleApplicationTest::clientThatLeavesEarlyDoesNoHarm()
     }
     EXPECT_LINE(first, "message: left");
     EXPECT_LINE(first, "in front");
-    SingleInstance later{m_folder->path(), instanceName};
+    SingleInstance later{folder(), instanceName};
     QVERIFY(later.send(QStringLiteral("raise"), 30000));
     EXPECT_LINE(first, "message: raise");
 }
@@ -328,11 +448,11 @@ void QtSingleApplicationTest::otherUsersAreKeptOut()
     QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Refused);
 
     // With the folder and the socket open to everybody, the server itself has to tell users apart.
-    QCOMPARE(chmod(QFile::encodeName(m_folder->path()).constData(), 0755), 0);
+    QCOMPARE(chmod(QFile::encodeName(folder()).constData(), 0755), 0);
     QCOMPARE(chmod(QFile::encodeName(path(".socket")).constData(), 0777), 0);
     QCOMPARE(sendAsOtherUser(path(".socket"), framed("intruder")), Dropped);
 
-    SingleInstance later{m_folder->path(), instanceName};
+    SingleInstance later{folder(), instanceName};
     QVERIFY(later.send(QStringLiteral("raise"), 30000));
     EXPECT_LINE(first, "message: raise");
 }

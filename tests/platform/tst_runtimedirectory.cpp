@@ -3,6 +3,7 @@
 
 #include <QDir>
 #include <QFile>
+#include <QScopeGuard>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -26,9 +27,11 @@ private slots:
     void cleanup();
 
     void sessionsDirectoryIsUsedWhenPrivate();
+    void superusersFolderIsTheSameWithoutASession();
     void othersAreNot_data();
     void othersAreNot();
     void folderOfAnotherUserIsNotPrivate();
+    void ownFolderIsMadePrivate_data();
     void ownFolderIsMadePrivate();
     void ownFolderMustBePrivate_data();
     void ownFolderMustBePrivate();
@@ -36,8 +39,8 @@ private slots:
 
 private:
     QString folder(const QString &name, mode_t mode) const;
-    // The machine may have one for this user, which then comes before the program's own.
-    QString expectedFallback() const { return isPrivateDirectory(m_ofUser) ? m_ofUser : own(); }
+    // The machine may have one for this user, which then comes before the program's own, but not for the superuser.
+    QString expectedFallback() const { return geteuid() != 0 && isPrivateDirectory(m_ofUser) ? m_ofUser : own(); }
     QString own() const { return m_folder->filePath(QStringLiteral("made/own")); }
 
     const QString m_ofUser{QStringLiteral("/run/user/") + QString::number(geteuid())};
@@ -66,10 +69,26 @@ QString RuntimeDirectoryTest::folder(const QString &name, mode_t mode) const
 
 void RuntimeDirectoryTest::sessionsDirectoryIsUsedWhenPrivate()
 {
-    const QString session{folder(QStringLiteral("session"), 0700)};
+    if (geteuid() == 0)
+        QCOMPARE(seteuid(otherUser), 0);
+    const auto become = qScopeGuard([] { QCOMPARE(seteuid(getuid()), 0); });
+    const QTemporaryDir here;
+    const QString session{here.filePath(QStringLiteral("session"))};
+    QCOMPARE(mkdir(QFile::encodeName(session).constData(), 0700), 0);
     qputenv("XDG_RUNTIME_DIR", QFile::encodeName(session));
     QCOMPARE(runtimeDirectory(own()), session);
     QVERIFY(!QFile::exists(own()));
+}
+
+void RuntimeDirectoryTest::superusersFolderIsTheSameWithoutASession()
+{
+    if (geteuid() != 0)
+        QSKIP("only the superuser has one");
+    QCOMPARE(runtimeDirectory(own()), own());
+    for (const QString &name : {QStringLiteral("session"), QStringLiteral("other")}) {
+        qputenv("XDG_RUNTIME_DIR", QFile::encodeName(folder(name, 0700)));
+        QCOMPARE(runtimeDirectory(own()), own());
+    }
 }
 
 void RuntimeDirectoryTest::othersAreNot_data()
@@ -118,9 +137,21 @@ void RuntimeDirectoryTest::folderOfAnotherUserIsNotPrivate()
     QCOMPARE(runtimeDirectory(own()), expectedFallback());
 }
 
+void RuntimeDirectoryTest::ownFolderIsMadePrivate_data()
+{
+    QTest::addColumn<uint>("mask");
+    for (const uint mask : {0U, 022U, 077U, 0277U, 0777U})
+        QTest::addRow("umask %04o", mask) << mask;
+}
+
 void RuntimeDirectoryTest::ownFolderIsMadePrivate()
 {
-    QVERIFY(makePrivateDirectory(own()));
+    QFETCH(const uint, mask);
+    const mode_t before{umask(mask)};
+    const bool isMade{makePrivateDirectory(own())};
+    const mode_t after{umask(before)};
+    QVERIFY(isMade);
+    QCOMPARE(after, mode_t{mask});
     struct stat status
     {
     };
@@ -150,7 +181,7 @@ void RuntimeDirectoryTest::ownFolderMustBePrivate()
 
     QVERIFY(!makePrivateDirectory(m_folder->filePath(name)));
     QVERIFY(!QFile::exists(m_folder->filePath(QStringLiteral("nothing"))));
-    if (!isPrivateDirectory(m_ofUser))
+    if (geteuid() == 0 || !isPrivateDirectory(m_ofUser))
         QCOMPARE(runtimeDirectory(m_folder->filePath(name)), QString{});
 }
 
