@@ -67,7 +67,10 @@ public:
     }
 
     void seeComment() { ++m_comments; }
-    void seeQuote(std::size_t place);
+    /// Returns whether a quoted text is open from there on.
+    bool seeQuote(std::size_t place);
+    /// A blank, delimiter or comment sign within a quoted text.
+    void seeInQuotes(std::size_t place);
     /// A statement that the server does not take for a block becomes one because of the word at `place`.
     void seeStrayKeyword(std::size_t place, bool isQuoted) { note(isQuoted ? m_quotedTexts : m_statements, place); }
     /// Whether a quoted text is open.
@@ -84,25 +87,33 @@ private:
 
     std::string_view m_text;
     std::size_t m_opening{std::string_view::npos}; // of the quoted text that is open
+    bool m_isChanged{};                            // whether the reader changes that
     int m_comments{};
     Places m_quotedTexts;
     Places m_statements;
 };
 
-void LossWatcher::seeQuote(std::size_t place)
+bool LossWatcher::seeQuote(std::size_t place)
 {
     if (!isQuoted()) {
         m_opening = place;
-        return;
+        m_isChanged = false;
+        return true;
     }
-    if (isEscaped(place)) {
-        note(m_quotedTexts, m_opening); // the reader takes it for the end
-        return;
+    if (m_text[place - 1] == '\\' && isEscaped(place)) {
+        m_isChanged = true; // the reader takes it for the end
+        return true;
     }
-    const std::string_view quoted{m_text.substr(m_opening, place - m_opening)};
-    if (quoted.find_first_of(";{}\t\n") != std::string_view::npos || quoted.find("  ") != std::string_view::npos)
+    if (m_isChanged)
         note(m_quotedTexts, m_opening);
     m_opening = std::string_view::npos;
+    return false;
+}
+
+void LossWatcher::seeInQuotes(std::size_t place)
+{
+    const char c{m_text[place]};
+    m_isChanged = m_isChanged || (c != '#' && (c != ' ' || m_text[place - 1] == ' '));
 }
 
 ReadingLosses LossWatcher::losses() const
@@ -187,6 +198,7 @@ Reader::Reader(std::string_view text, DhcpdConfigDeclaration &top)
 bool Reader::read()
 {
     bool quoted{};
+    bool isQuotedToServer{};
     std::size_t wordStart{};
     for (std::size_t i{}; i < m_text.size(); ++i) {
         const Kind kind{kindOf(m_text[i])};
@@ -194,9 +206,11 @@ bool Reader::read()
             continue;
         if (kind == Kind::Quote) {
             quoted = !quoted;
-            m_losses.seeQuote(i);
+            isQuotedToServer = m_losses.seeQuote(i);
             continue;
         }
+        if (isQuotedToServer)
+            m_losses.seeInQuotes(i);
         if (kind == Kind::Hash && quoted)
             continue;
 
@@ -230,19 +244,18 @@ void Reader::endWord(std::size_t begin, std::size_t end)
 bool Reader::endStatement(Kind delimiter)
 {
     const bool isDeclaration{m_hasDeclarationKeyword || delimiter == Kind::OpeningBrace};
-    const auto strayKeyword = m_strayKeyword;
     if (delimiter == Kind::ClosingBrace) {
         clearWords(); // they make no statement before a closing brace, deliberately
         closeBlock();
     } else if (m_wordCount == 0) {
         return true;
     } else if (isDeclaration) {
+        if (m_strayKeyword && delimiter == Kind::Semicolon)
+            m_losses.seeStrayKeyword(m_strayKeyword->place, m_strayKeyword->isQuoted);
         auto *declaration = m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
         if (delimiter == Kind::OpeningBrace) {
             declaration->setBraced();
             m_current = declaration;
-        } else if (strayKeyword) {
-            m_losses.seeStrayKeyword(strayKeyword->place, strayKeyword->isQuoted);
         }
     } else {
         m_current->addParam(std::make_unique<DhcpdConfigParam>(takeWords(), m_current));
@@ -262,8 +275,9 @@ void Reader::clearWords()
 {
     m_words.clear();
     m_wordCount = 0;
+    if (m_hasDeclarationKeyword)
+        m_strayKeyword.reset();
     m_hasDeclarationKeyword = false;
-    m_strayKeyword.reset();
 }
 
 void Reader::closeBlock()
