@@ -85,7 +85,8 @@ void FMain::setUpService()
 {
     m_service = std::make_unique<ServiceControls>(*m_ui, this);
     DhcpServerManager *manager{&m_service->manager()};
-    connect(manager, &DhcpServerManager::error, this, [this](const QString &message) { showError(message); });
+    connect(manager, &DhcpServerManager::error, this,
+            [this, manager](const QString &message) { showError(message, manager->errorReason()); });
     connect(manager, &DhcpServerManager::information, this, &FMain::showInformation);
     connect(manager, &DhcpServerManager::serverStateChanged, this, &FMain::handleServerStateChanged);
     manager->checkRunning();

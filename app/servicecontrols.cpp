@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/servicecontrols.h"
 
+#include "app/commandguard.h"
 #include "app/windowtext.h"
 #include "server/interfacesdialog.h"
 #include "ui_fmain.h"
@@ -23,7 +24,10 @@ ServiceControls::ServiceControls(const Ui::FMain &ui, QWidget *window)
     m_stateLabel->setIndent(stateIndent);
     m_stateLabel->setText(m_manager->serverStateText());
     ui.statusBar->addWidget(m_stateLabel);
-    connect(ui.actionRestart, &QAction::triggered, m_manager.get(), &DhcpServerManager::restartServer);
+    connect(ui.actionRestart, &QAction::triggered, this, [this] {
+        if (mayStartCommand())
+            m_manager->restartServer();
+    });
 }
 
 ServiceControls::~ServiceControls() = default;

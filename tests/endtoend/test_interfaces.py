@@ -120,7 +120,9 @@ class Interfaces(InterfacesTest):
     def test_are_not_known_without_the_file(self):
         machine.DEFAULTS.unlink()
         self.main.choose("Server", "Select interfaces")
-        self.message("Error", "Unable to open file '/etc/default/isc-dhcp-server' for read").answer("OK")
+        reason = "No such file or directory"
+        text = "Unable to open file '/etc/default/isc-dhcp-server' for read"
+        self.message("Error", text, informative_text=reason).answer("OK")
         dialog = self.program.window("Select interfaces")
         self.assertEqual(self.offered(dialog), dict.fromkeys(INTERFACES, False))
         dialog.press("Escape")
