@@ -4,6 +4,7 @@
 #include "app/commandguard.h"
 #include "app/windowtext.h"
 #include "server/interfacesdialog.h"
+#include "server/servicewatch.h"
 #include "ui_fmain.h"
 
 #include <QLabel>
@@ -20,6 +21,7 @@ ServiceControls::ServiceControls(const Ui::FMain &ui, QWidget *window)
     , m_window{window}
     , m_stateLabel{new QLabel{window}}
     , m_manager{std::make_unique<DhcpServerManager>(nullptr)}
+    , m_watch{std::make_unique<ServiceWatch>(m_manager.get())}
 {
     m_stateLabel->setIndent(stateIndent);
     m_stateLabel->setText(m_manager->serverStateText());

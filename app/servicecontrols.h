@@ -8,6 +8,7 @@
 #include <memory>
 
 class QLabel;
+class ServiceWatch;
 
 namespace Ui {
 class FMain;
@@ -35,4 +36,5 @@ private:
     QWidget *m_window;
     QLabel *m_stateLabel; // the status bar's
     std::unique_ptr<DhcpServerManager> m_manager;
+    std::unique_ptr<ServiceWatch> m_watch;
 };
