@@ -6,6 +6,7 @@
 #include <QDBusConnection>
 #include <QDBusMessage>
 #include <QDBusPendingCallWatcher>
+#include <QDBusServiceWatcher>
 #include <QUuid>
 
 namespace {
@@ -48,12 +49,12 @@ ServiceWatch::ServiceWatch(DhcpServerManager *manager, QObject *parent)
     };
     connect(manager, &DhcpServerManager::serverStateChanged, this, retryWhileUpdating);
     retryWhileUpdating(manager->state());
-    QTimer::singleShot(0, this, &ServiceWatch::subscribe);
+    QTimer::singleShot(0, this, &ServiceWatch::connectToBus);
 }
 
 ServiceWatch::~ServiceWatch() { QDBusConnection::disconnectFromBus(m_connectionName); }
 
-void ServiceWatch::subscribe()
+void ServiceWatch::connectToBus()
 {
     QDBusConnection bus{QDBusConnection::connectToBus(QDBusConnection::SystemBus, m_connectionName)};
     if (!bus.isConnected())
@@ -61,6 +62,15 @@ void ServiceWatch::subscribe()
     // Qt knows signals of the bus by their names only.
     bus.connect(serviceManager(), unitPath(), QStringLiteral("org.freedesktop.DBus.Properties"),
                 QStringLiteral("PropertiesChanged"), this, SLOT(noteChange()));
+    // Where the first to use the bus starts it, the service manager joins it later.
+    auto *joining = new QDBusServiceWatcher{serviceManager(), bus, QDBusServiceWatcher::WatchForRegistration, this};
+    connect(joining, &QDBusServiceWatcher::serviceRegistered, this, &ServiceWatch::subscribe);
+    subscribe();
+}
+
+void ServiceWatch::subscribe()
+{
+    const QDBusConnection bus{m_connectionName};
     auto *subscribed = new QDBusPendingCallWatcher{bus.asyncCall(subscription()), this};
     connect(subscribed, &QDBusPendingCallWatcher::finished, this, [this, subscribed] {
         subscribed->deleteLater();

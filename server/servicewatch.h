@@ -26,6 +26,7 @@ private slots:
     void noteChange();
 
 private:
+    void connectToBus();
     void subscribe();
 
     QString m_connectionName; // the connection is its own, and closed with it

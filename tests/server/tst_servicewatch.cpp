@@ -55,6 +55,7 @@ private slots:
     void asksSeldomWhileTheUnitKeepsChanging();
     void asksNothingForOtherUnits();
     void noticesWhatChangedBeforeItSubscribed();
+    void subscribesToServiceManagerThatJoinsLater();
     void repeatsNothingAfterAnOperation();
 
 private:
@@ -124,6 +125,27 @@ void ServiceWatchTest::noticesWhatChangedBeforeItSubscribed()
     said::record(manager, events);
     systemctl.setState(FakeSystemctl::Running);
     QTRY_COMPARE(events, QStringList{running});
+}
+
+void ServiceWatchTest::subscribesToServiceManagerThatJoinsLater()
+{
+    m_bus->leave();
+    QStringList events;
+    const TemporaryRoot root;
+    FakeSystemctl systemctl{FakeSystemctl::Stopped};
+    DhcpServerManager manager;
+    const ServiceWatch watch{&manager};
+    manager.checkRunning();
+    said::record(manager, events);
+    QTest::qWait(500);
+    QCOMPARE(m_bus->subscribers(), 0);
+    systemctl.setState(FakeSystemctl::Running);
+    m_bus->join();
+    QTRY_COMPARE(m_bus->subscribers(), 1);
+    QTRY_COMPARE(events, QStringList{running});
+    systemctl.setState(FakeSystemctl::Stopped);
+    m_bus->announce();
+    QTRY_COMPARE(events, (QStringList{running, stopped}));
 }
 
 // The service manager announces several changes while it does what was asked for.

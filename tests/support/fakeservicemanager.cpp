@@ -8,6 +8,7 @@
 
 namespace {
 
+QString serviceName() { return QStringLiteral("org.freedesktop.systemd1"); }
 QString connectionName() { return QStringLiteral("FakeServiceManager"); }
 
 } // namespace
@@ -30,7 +31,7 @@ FakeServiceManager::FakeServiceManager(const QString &address)
         return;
     m_bus = std::make_unique<QDBusConnection>(QDBusConnection::connectToBus(address, connectionName()));
     m_bus->registerObject(QStringLiteral("/org/freedesktop/systemd1"), this, QDBusConnection::ExportScriptableSlots);
-    m_bus->registerService(QStringLiteral("org.freedesktop.systemd1"));
+    join();
 }
 
 FakeServiceManager::~FakeServiceManager()
@@ -40,6 +41,14 @@ FakeServiceManager::~FakeServiceManager()
     m_daemon.kill();
     m_daemon.waitForFinished();
 }
+
+void FakeServiceManager::leave()
+{
+    m_bus->unregisterService(serviceName());
+    m_subscribers = 0;
+}
+
+void FakeServiceManager::join() { m_bus->registerService(serviceName()); }
 
 void FakeServiceManager::announce(const QString &unit)
 {

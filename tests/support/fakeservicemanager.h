@@ -25,6 +25,9 @@ public:
 
     /// Whether the bus and the stand-in are there; where not, dbus-daemon is not installed.
     bool isRunning() const { return m_bus && m_bus->isConnected(); }
+    /// Leaves the bus and forgets who has subscribed, and joins it again.
+    void leave();
+    void join();
     /// How many have subscribed so far.
     int subscribers() const { return m_subscribers; }
     /// Announces that properties of the unit at the end of an object's path changed, if anybody has subscribed.
