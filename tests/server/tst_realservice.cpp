@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "server/dhcpservermanager.h"
+#include "server/servicewatch.h"
 #include "tests/server/managerevents.h"
 #include "tests/support/fakesystemctl.h"
 #include "tests/support/temporaryroot.h"
@@ -37,6 +38,8 @@ const QString initScriptAside{QStringLiteral("/root/isc-dhcp-server")};
 const QString jobFailed{QStringLiteral(
     "Job for isc-dhcp-server.service failed because the control process exited with error code.\n"
     "See \"systemctl status isc-dhcp-server.service\" and \"journalctl -xeu isc-dhcp-server.service\" for details.\n")};
+
+using Slot = void (DhcpServerManager::*)();
 
 struct Answer
 {
@@ -93,6 +96,11 @@ void stop()
 {
     QCOMPARE(systemctl(QStringLiteral("stop")).errors, QString{});
     QTRY_COMPARE_WITH_TIMEOUT(servers(), QStringList{}, patience);
+}
+
+void killServer()
+{
+    run(QStringLiteral("pkill"), {QStringLiteral("-KILL"), QStringLiteral("-x"), QStringLiteral("dhcpd")});
 }
 
 // What a status says about the unit, without what varies with the time and the machine.
@@ -157,6 +165,8 @@ struct Manager
 
 } // namespace
 
+Q_DECLARE_METATYPE(Slot)
+
 // The real systemctl, init script and server, in the container of scripts/service-container.
 class RealServiceTest final : public QObject
 {
@@ -175,7 +185,11 @@ private slots:
     void startsStoppedServiceOnRestart();
     void reportsFailedStart();
     void reportsFailedRestart();
+    void restartsServiceWhoseServerDied_data();
     void restartsServiceWhoseServerDied();
+    void followsServerThatDies();
+    void followsCommandsOfOthers();
+    void followsServiceThatIsJustStarting();
     void reportsMaskedService();
     void reportsServiceThatIsNotInstalled();
 
@@ -362,17 +376,82 @@ void RealServiceTest::reportsFailedRestart()
     compareWithRecording(FakeSystemctl::Failed);
 }
 
+void RealServiceTest::restartsServiceWhoseServerDied_data()
+{
+    QTest::addColumn<Slot>("operation");
+    QTest::addColumn<QStringList>("events");
+    QTest::addRow("start") << Slot{&DhcpServerManager::runServer} << QStringList{stopped, updating, running};
+    QTest::addRow("restart") << Slot{&DhcpServerManager::restartServer}
+                             << QStringList{stopped, stopped, updating, running};
+}
+
 void RealServiceTest::restartsServiceWhoseServerDied()
+{
+    QFETCH(const Slot, operation);
+    QFETCH(const QStringList, events);
+    start();
+    Manager manager;
+    killServer();
+    QTRY_VERIFY_WITH_TIMEOUT(status().contains(QLatin1String{"Active: active (exited)"}), patience);
+    manager.service.checkRunning();
+    QCOMPARE(manager.events, QStringList{stopped});
+    manager.events.clear();
+    (manager.service.*operation)();
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, events, patience);
+    QCOMPARE(servers().size(), 1);
+}
+
+void RealServiceTest::followsServerThatDies()
 {
     start();
     Manager manager;
-    run(QStringLiteral("pkill"), {QStringLiteral("-KILL"), QStringLiteral("-x"), QStringLiteral("dhcpd")});
-    QTRY_VERIFY_WITH_TIMEOUT(status().contains(QLatin1String{"Active: active (exited)"}), patience);
-    manager.service.checkRunning();
+    const ServiceWatch watch{&manager.service};
+    QTest::qWait(1000); // for its subscription and the query that follows
     QCOMPARE(manager.events, QStringList{});
-    manager.service.restartServer();
-    QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{updating, running}), patience);
+    killServer();
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, QStringList{stopped}, patience);
+    manager.service.runServer();
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{stopped, stopped, updating, running}), patience);
     QCOMPARE(servers().size(), 1);
+}
+
+void RealServiceTest::followsCommandsOfOthers()
+{
+    stop();
+    Manager manager;
+    const ServiceWatch watch{&manager.service};
+    QTest::qWait(1000);
+    QCOMPARE(systemctl(QStringLiteral("start")).exitCode, 0);
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, QStringList{running}, patience);
+    QCOMPARE(systemctl(QStringLiteral("stop")).exitCode, 0);
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{running, stopped}), patience);
+    QCOMPARE(systemctl(QStringLiteral("restart")).exitCode, 0);
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{running, stopped, running}), patience);
+
+    // Between its two halves the service may be seen stopped, but it is never left so, and nothing is told twice.
+    QCOMPARE(systemctl(QStringLiteral("restart")).exitCode, 0);
+    QTest::qWait(2000);
+    QVERIFY(manager.service.isServerRunning());
+    for (int i{1}; i < manager.events.size(); ++i)
+        QVERIFY(manager.events.at(i) != manager.events.at(i - 1));
+}
+
+void RealServiceTest::followsServiceThatIsJustStarting()
+{
+    stop();
+    hold("start");
+    run(QStringLiteral("systemctl"),
+        {QStringLiteral("start"), QStringLiteral("--no-block"), QStringLiteral("isc-dhcp-server")});
+    awaitHold();
+    Manager manager;
+    const ServiceWatch watch{&manager.service};
+    manager.service.runServer();
+    QCOMPARE(manager.events, QStringList{busy});
+    manager.events.clear();
+    release();
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, QStringList{running}, patience);
+    manager.service.stopServer();
+    QTRY_COMPARE_WITH_TIMEOUT(manager.events, (QStringList{running, running, updating, stopped}), patience);
 }
 
 void RealServiceTest::reportsMaskedService()
