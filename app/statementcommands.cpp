@@ -62,9 +62,10 @@ void StatementCommands::add(const QString &title, QDialog &dialog,
     if (!parent.isValid() || !mayStartCommand())
         return;
     dialog.setWindowTitle(title);
-    if (dialog.exec() == QDialog::Accepted && parent.isValid())
+    if (dialog.exec() == QDialog::Accepted && parent.isValid()) {
         addTo(
             parent, [&] { change(parent); }, open);
+    }
 }
 
 void StatementCommands::edit(const QString &title, QDialog &dialog, const KindTest &isKind, const Fields &fields,

@@ -9,9 +9,10 @@ bool DhcpdConfigModel::setParamValue(DhcpdConfigParam *param, const QString &tex
 {
     const ParameterKind &kind{ParameterKind::of(*param)};
     // A time is told apart here: the message lacks the closing quote, deliberately.
-    if (!values::isValid(kind.type, text))
+    if (!values::isValid(kind.type, text)) {
         return refuse(kind.type == ValueType::Seconds ? tr("Invalid time in seconds '%1").arg(text)
                                                       : invalidValue(kind.type, text));
+    }
     return param->setWordsFrom(kind.valuePosition(), {text});
 }
 
@@ -67,9 +68,10 @@ bool DhcpdConfigModel::setRangeValue(DhcpdConfigDeclaration *range, const QStrin
     const DhcpdConfigDeclaration *holder{range->parent()};
     if (!holder->isSubnet())
         holder = holder->parent();
-    if (!holder || !holder->isSubnet())
+    if (!holder || !holder->isSubnet()) {
         return refuse(
             tr("Error editing range. Can not edit range in '%1'").arg(holder ? holder->keyword() : QString{}));
+    }
 
     const QStringList pieces{text.split(QLatin1Char{' '})};
     const QString start{pieces.value(0)};

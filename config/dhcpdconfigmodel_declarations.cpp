@@ -54,13 +54,14 @@ void DhcpdConfigModel::addSubnet(const QString &address, const QString &mask, co
     const QString text{values::subnetText(address, mask)};
     const auto subnet = values::parseSubnet(text);
     auto *holder = declarationFor(parent);
-    if (!subnet)
+    if (!subnet) {
         refuse(tr("Error adding subnet. Invalid subnet '%1'").arg(text));
-    else if (!takesTopBlocks(holder) && !(holder && holder->isSharedNetwork() && holder->takesBlocks()))
+    } else if (!takesTopBlocks(holder) && !(holder && holder->isSharedNetwork() && holder->takesBlocks())) {
         refuse(tr("Error adding subnet. Can not add subnet to '%1'").arg(keywordFor(parent)));
-    else
+    } else {
         addTo(holder,
               [&] { holder->addDeclaration(QStringList{QStringLiteral("subnet")} + values::subnetWords(*subnet)); });
+    }
 }
 
 QStringList DhcpdConfigModel::defaultRange(const QString &subnet)
@@ -79,19 +80,20 @@ void DhcpdConfigModel::addRange(const QString &start, const QString &end, const 
     }
     const auto words = values::rangeWords(*holder, start, end);
     const auto *problem = std::get_if<RangeProblem>(&words);
-    if (problem && *problem == RangeProblem::IncompleteSubnet) // before the kind of the declaration, deliberately
+    if (problem && *problem == RangeProblem::IncompleteSubnet) { // before the kind of the declaration, deliberately
         refuse(tr("Error adding range. Invalid attributes of parent subnet"));
-    else if (!holder->isSubnet())
+    } else if (!holder->isSubnet()) {
         refuse(tr("Error adding range. Can not add range to '%1'").arg(keywordFor(parent)));
-    else if (!problem)
+    } else if (!problem) {
         addTo(holder,
               [&] { holder->addDeclaration(QStringList{QStringLiteral("range")} + std::get<QStringList>(words)); });
-    else if (*problem == RangeProblem::InvalidSubnet)
+    } else if (*problem == RangeProblem::InvalidSubnet) {
         refuse(tr("Error adding range. Invalid parent subnet"));
-    else if (*problem == RangeProblem::InvalidStart)
+    } else if (*problem == RangeProblem::InvalidStart) {
         refuse(tr("Error adding range. Invalid start IP '%1'").arg(start));
-    else
+    } else {
         refuse(tr("Error adding range. Invalid end IP '%1'").arg(end));
+    }
 }
 
 void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QString &address,
@@ -111,9 +113,10 @@ void DhcpdConfigModel::addHost(const QString &name, const QString &mac, const QS
     addTo(holder, [&] {
         auto *host =
             holder->addDeclaration({QStringLiteral("host"), name.contains(blank) ? values::quoted(name) : name});
-        if (!mac.isEmpty())
+        if (!mac.isEmpty()) {
             host->addParam(
                 {QStringLiteral("hardware"), QStringLiteral("ethernet"), isMac ? mac : values::noMacAddress()});
+        }
         if (fixedAddress)
             host->addDeclaration(fixedAddressWords(*fixedAddress));
     });

@@ -14,39 +14,40 @@ constexpr auto routeRefusal =
     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding static route. Can not add static rout to '%1'");
 
 constexpr ParameterKind kinds[]{
-    {optionKeyword, "routers", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Gateways"), ValueType::AddressList,
-     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding gateways. Can not add to '%1'")},
+    {optionKeyword, "routers", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Gateways"),
+     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding gateways. Can not add to '%1'"), ValueType::AddressList},
     {optionKeyword, "domain-name-servers", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "DNS servers"),
-     ValueType::AddressList, QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding DNS servers. Can not add to '%1'")},
-    {optionKeyword, "ntp-servers", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "NTP servers"), ValueType::AddressList,
-     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding NTP servers address. Can not add to '%1'")},
+     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding DNS servers. Can not add to '%1'"), ValueType::AddressList},
+    {optionKeyword, "ntp-servers", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "NTP servers"),
+     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding NTP servers address. Can not add to '%1'"),
+     ValueType::AddressList},
     // A new name gets an empty word behind it, deliberately.
-    {optionKeyword, "domain-name", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Domain name"), ValueType::DomainName,
-     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding domain name. Can not add to '%1'"), 2},
+    {optionKeyword, "domain-name", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Domain name"),
+     QT_TRANSLATE_NOOP("DhcpdConfigModel", "Error adding domain name. Can not add to '%1'"), ValueType::DomainName, 2},
     {optionKeyword, "ms-classless-static-routes", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Static route MS"),
-     ValueType::Routes, routeRefusal},
-    {optionKeyword, "classless-static-routes", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Static route"),
-     ValueType::Routes, routeRefusal},
-    {"hardware", "ethernet", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "MAC address"), ValueType::MacAddress},
+     routeRefusal, ValueType::Routes},
+    {optionKeyword, "classless-static-routes", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Static route"), routeRefusal,
+     ValueType::Routes},
+    {"hardware", "ethernet", QT_TRANSLATE_NOOP("DhcpdConfigStatement", "MAC address"), nullptr, ValueType::MacAddress},
     {"max-lease-time",
      {},
      QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Max lease time"),
-     ValueType::Seconds,
-     leaseTimeRefusal},
+     leaseTimeRefusal,
+     ValueType::Seconds},
     {"default-lease-time",
      {},
      QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Default lease time"),
-     ValueType::Seconds,
-     leaseTimeRefusal},
-    {"key", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key"), ValueType::Text},
-    {"algorithm", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key generation algorithm"), ValueType::Text},
-    {"secret", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Generated secret"), ValueType::Text},
-    {"primary", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Master DNS Server"), ValueType::Text},
+     leaseTimeRefusal,
+     ValueType::Seconds},
+    {"key", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key"), nullptr, ValueType::Text},
+    {"algorithm", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Key generation algorithm"), nullptr, ValueType::Text},
+    {"secret", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Generated secret"), nullptr, ValueType::Text},
+    {"primary", {}, QT_TRANSLATE_NOOP("DhcpdConfigStatement", "Master DNS Server"), nullptr, ValueType::Text},
 };
 
-constexpr ParameterKind otherOption{optionKeyword, {}, nullptr, ValueType::Text};
-constexpr ParameterKind otherLeaseTime{{}, {}, nullptr, ValueType::Seconds, leaseTimeRefusal};
-constexpr ParameterKind otherParameter{{}, {}, nullptr, ValueType::Text};
+constexpr ParameterKind otherOption{optionKeyword, {}, nullptr, nullptr, ValueType::Text};
+constexpr ParameterKind otherLeaseTime{{}, {}, nullptr, leaseTimeRefusal, ValueType::Seconds};
+constexpr ParameterKind otherParameter{{}, {}, nullptr, nullptr, ValueType::Text};
 
 QString text(std::string_view word) { return QString::fromUtf8(word.data(), static_cast<int>(word.size())); }
 

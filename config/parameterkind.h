@@ -40,7 +40,7 @@ struct ParameterKind final
     std::string_view keyword;
     std::string_view name; ///< the word behind the keyword, for options and hardware addresses
     const char *label;     ///< in the context DhcpdConfigStatement; null: the word before the value
+    const char *refusal;   ///< of a statement that cannot hold it, in the context DhcpdConfigModel; null: never added
     ValueType type;
-    const char *refusal{};  ///< of a statement that cannot hold it, in the context DhcpdConfigModel
     int wordsOfNewValue{1}; ///< when it replaces another
 };

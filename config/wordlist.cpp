@@ -98,9 +98,10 @@ bool equalsIgnoringCase(std::string_view word, std::string_view literal)
     const std::size_t common{std::min(word.size(), literal.size())};
     for (std::size_t i{}; i < common; ++i) {
         // Letters beyond ASCII may be case variants of ASCII ones (the Kelvin sign, the long s).
-        if (!isAscii(word[i]))
+        if (!isAscii(word[i])) {
             return decodedWord(word).compare(QLatin1String{literal.data(), static_cast<int>(literal.size())},
                                              Qt::CaseInsensitive) == 0;
+        }
         if (asciiLower(word[i]) != asciiLower(literal[i]))
             return false;
     }

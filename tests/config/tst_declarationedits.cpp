@@ -136,9 +136,10 @@ void DeclarationEditsTest::adds_data()
         "host|pc {\n hardware|ethernet|x 0011.2233.4455\n");
     row("host: normalised address", "", "", addHost("pc", "", "10.5"), "host|pc {\n fixed-address|10.0.0.5 {\n");
     row("host: null address", "", "", addHost("pc", "", "0.0.0.0"), "host|pc {\n fixed-address|0.0.0.0 {\n");
-    for (const char *address : {"127.0.0.1", "255.255.255.255", "10.0.0.256", "a name"})
+    for (const char *address : {"127.0.0.1", "255.255.255.255", "10.0.0.256", "a name"}) {
         row(qPrintable(QStringLiteral("host: address %1").arg(text(address))), "", "", addHost("pc", "", address),
             "host|pc {\n");
+    }
     row("host: there already", "host pc { }", "", addHost("pc", "", ""), "host|pc {\nhost|pc {\n");
 
     row("fixed address", "host a { }", "host", addFixedAddress("10.0.0.5"), "host|a {\n fixed-address|10.0.0.5 {\n");
@@ -227,40 +228,47 @@ void DeclarationEditsTest::refuses_data()
                 {"host a b { }", "host"},
                 {"pool a b c { }", "pool"}},
                addRange("10.0.0.1", "10.0.0.2"), "Error adding range. Can not add range to '%1'");
-    for (const char *target : {"", "top", "shared-network", "pool", "subnet"})
+    for (const char *target : {"", "top", "shared-network", "pool", "subnet"}) {
         row("shared-network a { pool { } } subnet a { }", target, addRange("", ""),
             "Error adding range. Invalid attributes of parent subnet");
+    }
     for (const char *words : {"a netmask 255.0.0.0", "10.0.0.0 netmask a", "10.0.0.0 netmask 255.0.255.0",
-                              "10.0.0.0 netmask", "10.0.0.0 255.0.0.0 netmask"})
+                              "10.0.0.0 netmask", "10.0.0.0 255.0.0.0 netmask"}) {
         row(qPrintable(QStringLiteral("subnet %1 { }").arg(text(words))), "subnet", addRange("", ""),
             "Error adding range. Invalid parent subnet");
-    for (const char *start : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "::1"})
+    }
+    for (const char *start : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "::1"}) {
         row(subnet, "subnet", addRange(start, "bad"),
             qPrintable(QStringLiteral("Error adding range. Invalid start IP '%1'").arg(text(start))));
-    for (const char *end : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "10.0.0.4"})
+    }
+    for (const char *end : {"", "abc", "10.0.1.1", "127.0.0.1", "255.255.255.255", "10.0.0.4"}) {
         row(subnet, "subnet", addRange("10.0.0.5", end),
             qPrintable(QStringLiteral("Error adding range. Invalid end IP '%1'").arg(text(end))));
+    }
     row("subnet 0.0.0.0 netmask 0.0.0.0 { }", "subnet", addRange("127.0.0.1", "128.0.0.1"),
         "Error adding range. Invalid start IP '127.0.0.1'");
     row("subnet 0.0.0.0 netmask 0.0.0.0 { }", "subnet", addRange("10.0.0.1", "255.255.255.255"),
         "Error adding range. Invalid end IP '255.255.255.255'");
 
-    for (const char *name : {"pc", ""})
+    for (const char *name : {"pc", ""}) {
         holderRows({{"subnet a { }", "subnet"},
                     {"shared-network a { }", "shared-network"},
                     {"host a { }", "host"},
                     {"group;", "group"}},
                    addHost(name, "", ""), "Error adding host. Can not add host to '%1'");
+    }
     row("", "", addHost("", "zz", "10.0.0.1"), "Error adding host. Host name can not be empty.");
 
-    for (const char *address : {"10.0.0.1", "abc"})
+    for (const char *address : {"10.0.0.1", "abc"}) {
         holderRows({{"subnet a { }", "subnet"}, {"host a;", "host"}, {"group { }", "group"}}, addFixedAddress(address),
                    "Error adding fixed address. Can not add to '%1'");
+    }
     row("", "", addFixedAddress("10.0.0.1"), "Error adding fixed address. Can not add to 'All network'");
     row("", "top", addFixedAddress("10.0.0.1"), "Error adding fixed address. Can not add to 'Topology'");
-    for (const char *address : {"", "abc", "127.0.0.1", "255.255.255.255"})
+    for (const char *address : {"", "abc", "127.0.0.1", "255.255.255.255"}) {
         row("host a { fixed-address b; }", "host", addFixedAddress(address),
             qPrintable(QStringLiteral("Error adding fixed address. Invalid IP '%1'").arg(text(address))));
+    }
 
     for (const auto &[before, target] : {std::pair{"range a b;", "range"}, std::pair{"SubClass a b { }", "SubClass"},
                                          std::pair{"option a b;", "option"}}) {
@@ -270,13 +278,15 @@ void DeclarationEditsTest::refuses_data()
             qPrintable(QStringLiteral("Error adding parameter. Can not add parameter to '%1'").arg(text(target))));
     }
 
-    for (const QStringList &statements : {QStringList{}, split("zone|a")})
+    for (const QStringList &statements : {QStringList{}, split("zone|a")}) {
         holderRows({{"subnet a { }", "subnet"}, {"shared-network a { }", "shared-network"}, {"group;", "group"}},
                    addWords(&DhcpdConfigModel::addBind9, statements, false),
                    "Error adding bind9. Can not add bind9 to '%1'");
-    for (const char *target : {"", "top"})
+    }
+    for (const char *target : {"", "top"}) {
         row("", target, addWords(&DhcpdConfigModel::addBind9, {}, false),
             "Error adding bind9. bind9 can not be empty.");
+    }
 }
 
 void DeclarationEditsTest::refuses()

@@ -46,10 +46,11 @@ void DhcpdConfigChecksTest::addRows(const std::vector<Row> &rows)
     QTest::addColumn<QString>("value");
     QTest::addColumn<QString>("words");
     QTest::addColumn<QString>("message");
-    for (const Row &row : rows)
+    for (const Row &row : rows) {
         QTest::addRow("%s: %s", row.statement, row.value)
             << QString::fromUtf8(row.statement) << QString::fromUtf8(row.value) << QString::fromUtf8(row.words)
             << QString::fromUtf8(row.error);
+    }
 }
 
 // Sets the value of the current row of the table, and compares the statement and the error that come of it.

@@ -455,9 +455,10 @@ void DhcpdConfigModelTest::readsFileThatChangesMeanwhile()
     std::atomic<bool> stop{false};
     std::thread other{[&] {
         const QByteArray name{QFile::encodeName(path)};
-        for (off_t size{}; !stop; size = (size + 300'007) % (off_t{2} * content.size()))
+        for (off_t size{}; !stop; size = (size + 300'007) % (off_t{2} * content.size())) {
             if (::truncate(name.constData(), size) != 0)
                 return;
+        }
     }};
     for (int i{}; i < 10; ++i) {
         m_model->reload(path);

@@ -489,9 +489,10 @@ void DhcpdConfigStatementTest::paramShows_data()
         {"routers|10.0.0.1", "routers", "10.0.0.1"},
         {"subnet|10.0.0.0", "subnet", "10.0.0.0"},
     };
-    for (const auto &row : rows)
+    for (const auto &row : rows) {
         QTest::addRow("%s", row.words) << split(row.words) << QString::fromLatin1(row.label)
                                        << QString::fromLatin1(row.value);
+    }
     QTest::addRow("no words") << QStringList{} << QString{} << QString{};
 }
 
@@ -535,9 +536,10 @@ void DhcpdConfigStatementTest::declarationShows_data()
         {"option|routers|10.0.0.1", "option", "routers 10.0.0.1"},
         {"max-lease-time|60", "max-lease-time", "60"},
     };
-    for (const auto &row : rows)
+    for (const auto &row : rows) {
         QTest::addRow("%s", row.words) << split(row.words) << QString::fromLatin1(row.label)
                                        << QString::fromLatin1(row.value);
+    }
     QTest::addRow("no words") << QStringList{} << QString{} << QString{};
 }
 

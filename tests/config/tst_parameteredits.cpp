@@ -223,9 +223,10 @@ void ParameterEditsTest::refuses_data()
     };
 
     // The kind of the parent is checked before the value.
-    for (const char *seconds : {"5", "0"})
+    for (const char *seconds : {"5", "0"}) {
         row(text("lease time in a parameter: ") + text(seconds), "a", addDefaultLeaseTime(seconds, false),
             text("Error adding lease time. Can not add to 'a'"));
+    }
     for (const char *seconds : {"0", "-5", "", "abc", "600 s", "1.5", "0x10", "99999999999999999999"}) {
         const QString error{QStringLiteral("Invalid time in seconds '%1'").arg(text(seconds))};
         row(text("default lease time: ") + text(seconds), "", addDefaultLeaseTime(seconds, false), error);
@@ -233,26 +234,31 @@ void ParameterEditsTest::refuses_data()
     }
 
     for (const auto &[name, add, refusal] : addressListOptions) {
-        for (const char *list : {"10.0.0.1", "abc"})
+        for (const char *list : {"10.0.0.1", "abc"}) {
             row(text(name) + text(" in a parameter: ") + text(list), "a", addValue(add, list),
                 text(refusal).arg(QLatin1Char{'a'}));
+        }
         for (const char *list : {"", "abc", "10.0.0.1,", "10.0.0.1,,10.0.0.2", "10.0.0.1;10.0.0.2", "127.0.0.1",
-                                 "10.0.0.1, 255.255.255.255", "10.0.0.256"})
+                                 "10.0.0.1, 255.255.255.255", "10.0.0.256"}) {
             row(text(name) + text(": ") + text(list), "", addValue(add, list),
                 QStringLiteral("Invalid one or more IP in list '%1'").arg(text(list)));
+        }
     }
 
-    for (const char *name : {"\"a.org\"", "abc"})
+    for (const char *name : {"\"a.org\"", "abc"}) {
         row(text("domain name in a parameter: ") + text(name), "a", addValue(&DhcpdConfigModel::addDomainName, name),
             text("Error adding domain name. Can not add to 'a'"));
-    for (const char *name : {"", "a.org", "\"a\"", "\"a.abcdefg\"", "\"a.org", "\"-a.org\"", "\"a.org\" "})
+    }
+    for (const char *name : {"", "a.org", "\"a\"", "\"a.abcdefg\"", "\"a.org", "\"-a.org\"", "\"a.org\" "}) {
         row(text("domain name: ") + text(name), "", addValue(&DhcpdConfigModel::addDomainName, name),
             QStringLiteral("Invalid domain name '%1'").arg(text(name)));
+    }
 
     for (const bool ms : {false, true}) {
-        for (const QStringList &routes : {oneRoute, QStringList{}})
+        for (const QStringList &routes : {oneRoute, QStringList{}}) {
             row(QStringLiteral("static routes in a parameter: %1 %2").arg(ms).arg(routes.size()), "a",
                 addStaticRoutes(routes, ms), text("Error adding static route. Can not add static rout to 'a'"));
+        }
         row(QStringLiteral("no static routes: %1").arg(ms), "", addStaticRoutes({}, ms),
             text("Error adding static route. Static route parametrs can not be empty."));
     }

@@ -415,9 +415,10 @@ void DialogFormsTest::statementEditor()
 {
     StatementInputDialog dialog;
     QVERIFY(!dialog.isSizeGripEnabled());
-    for (const char *layout : {"verticalLayout", "verticalLayout_2"})
+    for (const char *layout : {"verticalLayout", "verticalLayout_2"}) {
         QCOMPARE(dialog.findChild<QLayout *>(QString::fromLatin1(layout))->sizeConstraint(),
                  QLayout::SetDefaultConstraint);
+    }
     QVERIFY(!driver::find<QTextEdit>(dialog, QStringLiteral("attributes"))->acceptRichText());
 }
 

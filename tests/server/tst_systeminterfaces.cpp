@@ -18,9 +18,10 @@ using Interfaces = QMap<QString, bool>;
 QString enterOwnNetwork()
 {
     const uid_t user{getuid()};
-    if (unshare(user == 0 ? CLONE_NEWNET : CLONE_NEWUSER | CLONE_NEWNET) == -1)
+    if (unshare(user == 0 ? CLONE_NEWNET : CLONE_NEWUSER | CLONE_NEWNET) == -1) {
         return QStringLiteral("no network namespace: %1")
             .arg(QString::fromStdString(std::system_category().message(errno)));
+    }
     if (user != 0)
         writeTestFile(QStringLiteral("/proc/self/uid_map"), "0 " + QByteArray::number(user) + " 1\n");
     return {};

@@ -216,9 +216,10 @@ void ModalBoxes::answerNext(const QPointer<QWidget> &window)
 void ModalBoxes::compare(const Box &expected, const QMessageBox &box) const
 {
     const auto check = [&](const char *what, const QString &actual, const QString &wanted) {
-        if (actual != wanted)
+        if (actual != wanted) {
             m_report(QStringLiteral("%1: the %2 is %3, expected %4")
                          .arg(described(box), QLatin1String{what}, actual, wanted));
+        }
     };
     check("icon", shown(box.icon()), shown(expected.icon));
     check("title", shown(box.windowTitle()), shown(expected.title));
