@@ -52,7 +52,7 @@ class InterfacesTest(ProgramTest):
         """Saves the choice of a dialog up to the question."""
         dialog.button("Save").click()
         dialog.wait_closed()
-        return self.save_question()
+        return self.rewrite_question()
 
     def choose(self, *names):
         """Changes whether these are served."""

@@ -111,6 +111,9 @@ class ProgramTest(DesktopTest):
     def save_question(self, text=SAVE_QUESTION):
         """Asks before a save, and tells of the comments that it drops, unless the file is another than was read."""
         lost = told_comments(machine.CONFIGURATION.read_text()) if text == SAVE_QUESTION else ""
+        return self.rewrite_question(text, lost)
+
+    def rewrite_question(self, text=SAVE_QUESTION, lost=""):
         return self.message("Information", text, informative_text=lost, buttons=["Save", "Cancel"], default="Save")
 
     def save(self, text=SAVE_QUESTION):
