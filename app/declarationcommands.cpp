@@ -317,7 +317,8 @@ void DeclarationCommands::addBind9Settings()
 QString DeclarationCommands::leftOutText(const QVector<bind9::LeftOutZone> &zones)
 {
     QStringList lines{tr("These zones were left out:")};
-    for (const bind9::LeftOutZone &zone : zones.mid(0, mostZonesTold))
+    const QVector<bind9::LeftOutZone> told{zones.mid(0, mostZonesTold)};
+    for (const bind9::LeftOutZone &zone : told)
         lines += tr("%1: %2").arg(zone.name, reasonText(zone));
     if (zones.size() > mostZonesTold)
         lines += tr("%1 more").arg(zones.size() - mostZonesTold);

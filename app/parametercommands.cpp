@@ -73,10 +73,9 @@ ParameterCommands::ParameterCommands(StatementCommands &commands)
     for (const Row &row : rows) {
         if (!row.action)
             continue;
-        const ParameterKind &kind{ParameterKind::named(row.kind)};
         QAction *action{makeAction(row, commands.window())};
-        QObject::connect(action, &QAction::triggered, action, [this, &kind] { add(kind); });
-        (kind.isOption() ? m_optionActions : m_otherActions) += action;
+        QObject::connect(action, &QAction::triggered, action, [this, name = row.kind] { add(name); });
+        (ParameterKind::named(row.kind).isOption() ? m_optionActions : m_otherActions) += action;
     }
 }
 

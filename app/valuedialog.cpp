@@ -47,7 +47,7 @@ ValueDialog ValueDialog::make(ValueType type, const QString &label, QWidget *par
     case ValueType::Seconds: {
         auto owner = std::make_unique<TimeInputDialog>(parent);
         TimeInputDialog *dialog{owner.get()};
-        return {std::move(owner), [dialog](const QString &value) { dialog->setSeconds(secondsOf(value)); },
+        return {std::move(owner), [dialog](const QString &text) { dialog->setSeconds(secondsOf(text)); },
                 [dialog] { return dialog->seconds(); }};
     }
     case ValueType::Routes:
