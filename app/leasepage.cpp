@@ -90,7 +90,7 @@ void LeasePage::search(const QString &text)
 {
     m_matchPosition = 0;
     QTableView &table{*m_ui.dhcpdLeaseTable};
-    const LeaseViewState viewState{table};
+    const auto viewState = text.isEmpty() ? std::make_optional<LeaseViewState>(table) : std::nullopt;
     // The filter respects letter case, the search among the rows that it left does not, deliberately.
     m_proxy.setFilterFixedString(text);
 
@@ -101,8 +101,8 @@ void LeasePage::search(const QString &text)
     m_ui.searchNextLease->setEnabled(isFound);
     if (isFound) {
         showMatch(first.first());
-    } else if (text.isEmpty()) {
-        viewState.restoreIn(table); // the lease that was found stays current among all others
+    } else if (viewState) {
+        viewState->restoreIn(table); // the lease that was found stays current among all others
         table.scrollTo(table.currentIndex());
     }
 }
