@@ -9,6 +9,7 @@
 #include <QFile>
 #include <QPointer>
 #include <QProcess>
+#include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -49,6 +50,7 @@ private slots:
     void asksTheServerInPathFirst_data();
     void asksTheServerInPathFirst();
     void passesTheTextToNoOtherProcess();
+    void outputWithoutEndIsCutAndEnded();
     void abandonedProcessGoesWhenItHasEnded();
     void abandonedProcessGoesWithTheParent();
 
@@ -113,6 +115,21 @@ QProcess *ConfigCheckTest::abandonCheck(QObject *parent)
     ConfigCheck check{parent};
     check.start({});
     return parent->findChild<QProcess *>();
+}
+
+void ConfigCheckTest::outputWithoutEndIsCutAndEnded()
+{
+    const FakePrograms programs;
+    programs.install(QStringLiteral("dhcpd"), "exec yes \"$3 line 2: no such thing\"\n");
+    ConfigCheck check{this};
+    QSignalSpy refusals{&check, &ConfigCheck::refused};
+    check.start("authoritative;\n");
+    const QPointer<QProcess> process{findChild<QProcess *>()};
+    QVERIFY(process);
+    QVERIFY(refusals.wait());
+    QCOMPARE(refusals.constFirst().at(0).toString(), QStringLiteral("line 2: no such thing"));
+    QCOMPARE(refusals.constFirst().at(1).toString().size(), 64 * 1024);
+    QCOMPARE(process->state(), QProcess::NotRunning);
 }
 
 void ConfigCheckTest::abandonedProcessGoesWhenItHasEnded()

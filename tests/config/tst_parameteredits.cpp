@@ -80,6 +80,7 @@ private slots:
     void addsToEveryDeclaration();
     void refuses_data();
     void refuses();
+    void writesWhatIsPutIntoAFixedAddress();
 };
 
 void ParameterEditsTest::changes_data()
@@ -268,6 +269,17 @@ void ParameterEditsTest::refuses()
 {
     QFETCH(Refusal, refusal);
     verifyRefusal(refusal);
+}
+
+void ParameterEditsTest::writesWhatIsPutIntoAFixedAddress()
+{
+    DhcpdConfigModel model{QStringList{text("Topology"), text("Value")}};
+    QVERIFY(model.parse(text("host a {\nfixed-address 10.0.0.5;\n}\n")));
+    const QModelIndex address{model.index(0, 0, model.index(0, 0, model.index(0, 0)))};
+    QCOMPARE(model.statementFor(address)->keyword(), text("fixed-address"));
+    model.addNtpServers(text("10.0.0.4"), address);
+    QCOMPARE(model.fileContent(), QByteArray{"host a {\n    fixed-address 10.0.0.5 {\n"
+                                             "        option ntp-servers 10.0.0.4;\n    }\n}\n"});
 }
 
 QTEST_GUILESS_MAIN(ParameterEditsTest)
