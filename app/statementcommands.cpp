@@ -30,7 +30,7 @@ const DhcpdConfigStatement &StatementCommands::currentStatement() const
     return *m_model.statementFor(m_tree->currentIndex());
 }
 
-bool StatementCommands::isCurrent(const KindTest &isKind) const
+bool StatementCommands::isCurrent(const StatementTest &isKind) const
 {
     return !currentStatement().isRoot() && isKind(currentStatement());
 }
@@ -68,7 +68,7 @@ void StatementCommands::add(const QString &title, QDialog &dialog,
     }
 }
 
-void StatementCommands::edit(const QString &title, QDialog &dialog, const KindTest &isKind, const Fields &fields,
+void StatementCommands::edit(const QString &title, QDialog &dialog, const StatementTest &isKind, const Fields &fields,
                              const Store &store)
 {
     if (!isCurrent(isKind) || !mayStartCommand())
@@ -88,8 +88,8 @@ void StatementCommands::edit(const QString &title, QDialog &dialog, const KindTe
         store(index, values, shown);
 }
 
-void StatementCommands::editValue(const QString &title, QDialog &dialog, const KindTest &isKind, const Fill &fill,
-                                  const std::function<QString()> &value, const ShowsAll &showsAll)
+void StatementCommands::editValue(const QString &title, QDialog &dialog, const StatementTest &isKind, const Fill &fill,
+                                  const std::function<QString()> &value, const StatementTest &showsAll)
 {
     edit(title, dialog, isKind, {fill, [&value] { return QStringList{value()}; }, showsAll},
          [this](const QModelIndex &index, const QStringList &values, const QStringList & /*shown*/) {
@@ -110,7 +110,7 @@ void StatementCommands::addAsText(const QString &title, const QString &label,
         OpenBranches::All);
 }
 
-void StatementCommands::editAsText(const QString &title, const KindTest &isKind)
+void StatementCommands::editAsText(const QString &title, const StatementTest &isKind)
 {
     if (!isCurrent(isKind) || !mayStartCommand() || !askForAdvancedEditing())
         return;

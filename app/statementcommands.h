@@ -22,7 +22,8 @@ class StatementCommands final
     Q_DECLARE_TR_FUNCTIONS(FMain)
 
 public:
-    using KindTest = std::function<bool(const DhcpdConfigStatement &statement)>;
+    /// A test of a statement.
+    using StatementTest = std::function<bool(const DhcpdConfigStatement &statement)>;
 
     /// The view state, model and dialogs' parent are used for as long as this lives.
     StatementCommands(QTreeView *tree, DhcpdConfigModel *model, TreeViewState *viewState, QWidget *window);
@@ -52,14 +53,13 @@ public:
              OpenBranches open = OpenBranches::AsBefore);
 
     using Fill = std::function<void(const DhcpdConfigStatement &statement)>;
-    using ShowsAll = std::function<bool(const DhcpdConfigStatement &statement)>;
     /// How a dialog is made to show a statement, the values that it shows then, and whether those are all that the
     /// statement says.
     struct Fields
     {
         Fill fill;
         std::function<QStringList()> values;
-        ShowsAll showsAll;
+        StatementTest showsAll;
     };
     /// Stores the values of an accepted dialog in the statement at an index of column 1; those it showed at first are
     /// given too.
@@ -68,19 +68,20 @@ public:
     /// Asks with `dialog` about the current statement, if that is of the kind, and when it is accepted with other
     /// values than it showed at first, has them stored. A statement that the dialog cannot show all of is edited as
     /// text.
-    void edit(const QString &title, QDialog &dialog, const KindTest &isKind, const Fields &fields, const Store &store);
+    void edit(const QString &title, QDialog &dialog, const StatementTest &isKind, const Fields &fields,
+              const Store &store);
     /// The same for a single value, which goes to the model's setData().
-    void editValue(const QString &title, QDialog &dialog, const KindTest &isKind, const Fill &fill,
-                   const std::function<QString()> &value, const ShowsAll &showsAll);
+    void editValue(const QString &title, QDialog &dialog, const StatementTest &isKind, const Fill &fill,
+                   const std::function<QString()> &value, const StatementTest &showsAll);
 
     /// Adds a statement of any words to the current declaration, after a warning.
     void addAsText(const QString &title, const QString &label,
                    bool (DhcpdConfigModel::*operation)(const QStringList &words, const QModelIndex &parent));
     /// Edits all words of the current statement, if that is of the kind, after a warning.
-    void editAsText(const QString &title, const KindTest &isKind);
+    void editAsText(const QString &title, const StatementTest &isKind);
 
 private:
-    bool isCurrent(const KindTest &isKind) const;
+    bool isCurrent(const StatementTest &isKind) const;
     bool askForAdvancedEditing();
 
     QTreeView *m_tree;
