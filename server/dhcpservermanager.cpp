@@ -2,42 +2,13 @@
 #include "server/dhcpservermanager.h"
 
 #include "server/servicecommand.h"
+#include "server/servicestatus.h"
 
-#include <QRegularExpression>
 #include <QSignalBlocker>
 
 #include <utility>
 
 namespace {
-
-/// What the text of a status says.
-struct Status
-{
-    explicit Status(const QByteArray &printed);
-
-    bool stopped{};
-    bool running{};
-    bool exited{}; ///< the init script has done its work, but no server is left
-};
-
-// The text without null bytes and without the escape sequences of colours and links, which could part a phrase.
-QString plainText(const QByteArray &printed)
-{
-    static const QRegularExpression sequence{
-        QStringLiteral("\x1b(?:\\[[0-?]*[ -/]*[@-~]|\\][^\x07\x1b]*(?:\x07|\x1b\\\\))")};
-    QString text{QString::fromUtf8(printed.constData(), printed.size())};
-    text.remove(QChar{});
-    return text.remove(sequence);
-}
-
-Status::Status(const QByteArray &printed)
-{
-    const QString text{plainText(printed)};
-    exited = text.contains(QLatin1String{"Active: active (exited)"});
-    stopped = exited || text.contains(QLatin1String{"Active: inactive (dead)"}) ||
-              text.contains(QLatin1String{"Active: failed"});
-    running = text.contains(QLatin1String{"Active: active (running)"});
-}
 
 bool wasAnswered(const ServiceCommand &query)
 {
@@ -111,7 +82,7 @@ void DhcpServerManager::checkRunning()
         report(QObject::tr("Checking DHCP-server status failed\n%1").arg(query.complaint()));
         return;
     }
-    const Status status{query.output()};
+    const ServiceStatus status{query.output()};
     if (status.stopped) {
         m_serverHasDied = status.exited;
         setState(Stopped);
@@ -136,7 +107,7 @@ void DhcpServerManager::handleFollowingFinished(int /*exitCode*/, QProcess::Exit
 {
     const bool again{std::exchange(m_followAgain, false)};
     if (wasAnswered(*m_following)) {
-        const Status status{m_following->output()};
+        const ServiceStatus status{m_following->output()};
         if (status.stopped && !status.running)
             m_serverHasDied = status.exited;
         if (status.running && m_state != Running)
