@@ -57,13 +57,6 @@ void append(Text &text, const DhcpdConfigParam &param)
         appendLine(text, param, ";\n");
 }
 
-/// Whether a declaration is written without its children, deliberately, unless those have their braces.
-bool isOneLine(const DhcpdConfigDeclaration &declaration)
-{
-    return (declaration.isRange() || declaration.isSubclass() || declaration.isFixedAddress()) &&
-           !(declaration.isBraced() && declaration.childCount() > 0);
-}
-
 void append(Text &text, const DhcpdConfigDeclaration &declaration);
 
 void appendBody(Text &text, const DhcpdConfigDeclaration &declaration)
@@ -80,9 +73,9 @@ void append(Text &text, const DhcpdConfigDeclaration &declaration)
         appendBody(text, declaration);
     } else if (declaration.words().at(0).empty()) {
         return; // its children go with it, deliberately: they would end up in the block around it
-    } else if (isOneLine(declaration)) {
+    } else if (declaration.isOneLine()) {
         appendLine(text, declaration, ";\n");
-    } else if (declaration.depth() >= maximumBlockDepth) {
+    } else if (!declaration.takesStatements()) {
         text = {};
     } else {
         appendLine(text, declaration, " {\n");

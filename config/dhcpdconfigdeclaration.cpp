@@ -53,6 +53,11 @@ DhcpdConfigDeclaration *DhcpdConfigDeclaration::addDeclaration(const QStringList
     return addDeclaration(std::make_unique<DhcpdConfigDeclaration>(words, this));
 }
 
+bool DhcpdConfigDeclaration::isOneLine() const
+{
+    return (isRange() || isSubclass() || isFixedAddress()) && !(isBraced() && childCount() > 0);
+}
+
 void DhcpdConfigDeclaration::removeChild(DhcpdConfigStatement *statement)
 {
     const bool found{m_children && (eraseFound(m_children->parameters, statement) ||

@@ -33,7 +33,11 @@ public:
     /// put statements there.
     bool isBraced() const { return m_isBraced; }
     void setBraced() { m_isBraced = true; }
-    /// Whether a block in this one would not be nested too deep.
+    /// Whether the declaration is written without its children, deliberately, unless those have their braces.
+    bool isOneLine() const;
+    /// Whether the block that the declaration is with statements in it would not be nested too deep.
+    bool takesStatements() const { return depth() < maximumBlockDepth; }
+    /// Whether a block in this one would not be.
     bool takesBlocks() const { return depth() + 1 < maximumBlockDepth; }
 
     void removeChild(DhcpdConfigStatement *statement) override;

@@ -96,7 +96,8 @@ public:
     void addRoutes(const QStringList &routes, bool ms, const QModelIndex &parent);
 
     /// Puts `words` in the place of all words of a statement, without a reset; nothing is modified when it has them
-    /// already. False for the nodes above the file's statements.
+    /// already. False for the nodes above the file's statements, and, with an error(), where a line would become a block
+    /// that is nested too deep.
     bool replaceWords(const QModelIndex &index, const QStringList &words);
     /// Takes a statement with everything under it out of the tree.
     void removeStatement(const QModelIndex &index);
@@ -129,6 +130,8 @@ private:
     void addTo(DhcpdConfigDeclaration *holder, Change change);
     /// The declaration of `index`; null when its statement is a parameter.
     DhcpdConfigDeclaration *declarationFor(const QModelIndex &index) const;
+    /// The same, and null also when a block there would be nested too deep.
+    DhcpdConfigDeclaration *holderFor(const QModelIndex &index) const;
     QString keywordFor(const QModelIndex &index) const { return statementFor(index)->keyword(); }
     QIcon themeIcon(const QString &name) const;
 

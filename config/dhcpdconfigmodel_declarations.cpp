@@ -176,7 +176,7 @@ bool DhcpdConfigModel::addDeclaration(const QStringList &words, const QModelInde
 
 bool DhcpdConfigModel::addParameter(const QStringList &words, const QModelIndex &parent)
 {
-    auto *holder = declarationFor(parent);
+    auto *holder = holderFor(parent);
     if (!takesAnything(holder))
         return refuse(tr("Error adding parameter. Can not add parameter to '%1'").arg(keywordFor(parent)));
     addTo(holder, [&] { holder->addParam(words); });

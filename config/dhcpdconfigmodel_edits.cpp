@@ -30,13 +30,26 @@ bool DhcpdConfigModel::replaceWords(const QModelIndex &index, const QStringList 
     DhcpdConfigStatement *statement{statementFor(index)};
     if (statement->isRoot())
         return false;
-    if (words != statement->wordsFrom(0)) {
-        if (statement->isDeclaration() && statement->childCount() > 0)
-            static_cast<DhcpdConfigDeclaration *>(statement)->setBraced(); // whatever its keyword becomes
-        statement->setWordsFrom(0, words);
-        setModified();
+    const QStringList oldWords{statement->wordsFrom(0)};
+    if (words == oldWords)
+        return true;
+    statement->setWordsFrom(0, words);
+    if (auto *declaration = declarationFor(index)) {
+        if (!declaration->takesStatements() && !declaration->isOneLine()) {
+            statement->setWordsFrom(0, oldWords);
+            return refuse(tr("Error editing '%1'. The block would be nested too deeply.").arg(oldWords.value(0)));
+        }
+        if (declaration->childCount() > 0)
+            declaration->setBraced(); // whatever its keyword has become
     }
+    setModified();
     return true;
+}
+
+DhcpdConfigDeclaration *DhcpdConfigModel::holderFor(const QModelIndex &index) const
+{
+    DhcpdConfigDeclaration *declaration{declarationFor(index)};
+    return declaration && declaration->takesStatements() ? declaration : nullptr;
 }
 
 DhcpdConfigDeclaration *DhcpdConfigModel::declarationFor(const QModelIndex &index) const

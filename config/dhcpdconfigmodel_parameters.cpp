@@ -29,7 +29,7 @@ const ParameterKind &routeKind(bool ms)
 
 bool DhcpdConfigModel::setParameter(const ParameterKind &kind, const QString &value, const QModelIndex &parent)
 {
-    auto *holder = declarationFor(parent);
+    auto *holder = holderFor(parent);
     if (!holder)
         return refuse(tr(kind.refusal).arg(keywordFor(parent)));
     if (!values::isValid(kind.type, value))
@@ -84,7 +84,7 @@ void DhcpdConfigModel::addDomainName(const QString &name, const QModelIndex &par
 
 void DhcpdConfigModel::addRoutes(const QStringList &routes, bool ms, const QModelIndex &parent)
 {
-    auto *holder = declarationFor(parent);
+    auto *holder = holderFor(parent);
     if (!holder || holder->depth() < 1 || routes.isEmpty()) {
         addStaticRoutes(routes, ms, parent);
         return;
@@ -104,7 +104,7 @@ void DhcpdConfigModel::addStaticRoutes(const QStringList &routes, bool ms, const
 {
     const ParameterKind &kind{routeKind(ms)};
     const QString option{kind.start().constLast()};
-    auto *holder = declarationFor(parent);
+    auto *holder = holderFor(parent);
     if (!holder) {
         refuse(tr(kind.refusal).arg(keywordFor(parent)));
         return;

@@ -162,6 +162,10 @@
         <source>The blocks of the file are nested too deeply.</source>
         <translation>Die Blöcke der Datei sind zu tief verschachtelt.</translation>
     </message>
+    <message>
+        <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
+        <translation>Fehler beim Bearbeiten von „%1“. Der Block wäre zu tief verschachtelt.</translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>

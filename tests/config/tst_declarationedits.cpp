@@ -67,6 +67,8 @@ private slots:
     void addsNoBlocksThatCouldNotBeRead();
     void addsLinesToTheDeepestBlock_data();
     void addsLinesToTheDeepestBlock();
+    void makesNoBlockOfADeepestLine_data();
+    void makesNoBlockOfADeepestLine();
     void computesDefaultRange_data();
     void computesDefaultRange();
     void removesStatement();
@@ -354,6 +356,41 @@ void DeclarationEditsTest::addsLinesToTheDeepestBlock()
     EditedModel edited{nestedBlocks(maximumBlockDepth, qPrintable(holder))};
     edit(edited.model(), innermost(edited.model()));
     edited.verifyChange(1);
+    verifyIsReadAgain(edited);
+}
+
+void DeclarationEditsTest::makesNoBlockOfADeepestLine_data()
+{
+    QTest::addColumn<EditCase::Edit>("edit");
+    QTest::addColumn<QString>("error");
+
+    const auto row = [](const Edit &edit, const char *error) { QTest::addRow("%s", error) << edit << text(error); };
+    row([](DhcpdConfigModel &model, const QModelIndex &line) { QVERIFY(!model.replaceWords(line, split("group|a"))); },
+        "Error editing 'fixed-address'. The block would be nested too deeply.");
+    row(addWords(&DhcpdConfigModel::addParameter, split("a|b"), false),
+        "Error adding parameter. Can not add parameter to 'fixed-address'");
+    row([](DhcpdConfigModel &model, const QModelIndex &line) { model.addRouters(text("10.0.0.1"), line); },
+        "Error adding gateways. Can not add to 'fixed-address'");
+    const auto routes = [&row](void (DhcpdConfigModel::*add)(const QStringList &, bool, const QModelIndex &), bool ms) {
+        row([=](DhcpdConfigModel &model,
+                const QModelIndex &line) { (model.*add)(split("24|10,0,0|10.0.0.1"), ms, line); },
+            "Error adding static route. Can not add static rout to 'fixed-address'");
+    };
+    routes(&DhcpdConfigModel::addStaticRoutes, false);
+    routes(&DhcpdConfigModel::addRoutes, true);
+}
+
+void DeclarationEditsTest::makesNoBlockOfADeepestLine()
+{
+    QFETCH(EditCase::Edit, edit);
+    QFETCH(QString, error);
+    const QString deepest{nestedBlocks(maximumBlockDepth, "host a")
+                              .replace(QLatin1String{"host a {"}, QLatin1String{"host a { fixed-address 10.0.0.1;"})};
+    EditedModel edited{deepest};
+    QVERIFY(edited.model().replaceWords(edited.find(text("fixed-address")), split("fixed-address|10.0.0.1")));
+    edit(edited.model(), edited.find(text("fixed-address")));
+    edited.verifyRefusal(error);
+    QCOMPARE(edited.outline(), EditedModel{deepest}.outline());
     verifyIsReadAgain(edited);
 }
 
