@@ -2,6 +2,7 @@
 #include "app/leasepage.h"
 
 #include "app/busycursor.h"
+#include "app/leasecolumns.h"
 #include "app/leaseviewstate.h"
 #include "app/pathwatch.h"
 #include "app/windowtext.h"
@@ -13,7 +14,6 @@
 
 namespace {
 
-constexpr int measuredRows{50}; // for the widths of the columns
 constexpr auto foundStyle = "QLineEdit { color: black; }";
 constexpr auto notFoundStyle = "QLineEdit { color: red; }";
 
@@ -47,10 +47,9 @@ void LeasePage::setUpTable()
     table->setSelectionMode(QAbstractItemView::SingleSelection);
     table->setSelectionBehavior(QAbstractItemView::SelectRows);
     table->setContextMenuPolicy(Qt::CustomContextMenu);
-    table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
-    table->horizontalHeader()->setResizeContentsPrecision(measuredRows);
     table->verticalHeader()->setDefaultSectionSize(table->verticalHeader()->minimumSectionSize());
     table->setModel(&m_proxy);
+    new LeaseColumns{table};
 }
 
 void LeasePage::setUpSearch()

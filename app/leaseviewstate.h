@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
-#include <QtGlobal>
+#include <QItemSelectionModel>
 
 #include <optional>
 
@@ -20,7 +20,7 @@ public:
 private:
     std::optional<quint32> m_current;
     int m_column{};
-    bool m_cellSelected{}; // the current cell alone, not its row
+    QItemSelectionModel::SelectionFlags m_selection;
     std::optional<quint32> m_top;
     int m_left{};
 };

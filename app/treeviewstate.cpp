@@ -24,7 +24,8 @@ void TreeViewState::expandAll()
 void TreeViewState::remember()
 {
     m_open.clear();
-    m_scroll = m_tree->verticalScrollBar()->value();
+    m_top = m_tree->verticalScrollBar()->value();
+    m_left = m_tree->horizontalScrollBar()->value();
     forEachBranch({}, [this](const QModelIndex &index) {
         if (m_tree->isExpanded(index))
             m_open.insert(index.internalPointer());
@@ -39,7 +40,8 @@ void TreeViewState::restore()
             m_tree->expand(index);
     });
     m_tree->doItemsLayout();
-    m_tree->verticalScrollBar()->setValue(m_scroll);
+    m_tree->verticalScrollBar()->setValue(m_top);
+    m_tree->horizontalScrollBar()->setValue(m_left);
 }
 
 template<typename Visit>

@@ -34,5 +34,6 @@ private:
 
     QTreeView *m_tree;
     std::unordered_set<const void *> m_open;
-    int m_scroll{};
+    int m_top{};
+    int m_left{};
 };

@@ -14,13 +14,17 @@
 #include <QContextMenuEvent>
 #include <QDialogButtonBox>
 #include <QFile>
+#include <QHeaderView>
+#include <QHelpEvent>
 #include <QLineEdit>
 #include <QMenu>
 #include <QPushButton>
 #include <QScrollBar>
 #include <QTableView>
 #include <QTest>
+#include <QTextDocumentFragment>
 #include <QToolButton>
+#include <QToolTip>
 #include <QTreeView>
 
 namespace {
@@ -33,6 +37,28 @@ QByteArray lease(const QByteArray &address, const QByteArray &name, const QByteA
 {
     return "lease " + address + " {\n  starts 1 2026/03/02 08:00:00;\n  ends 1 " + end + ";\n  binding state " + state +
            ";\n  hardware ethernet " + mac + ";\n  client-hostname \"" + name + "\";\n}\n";
+}
+
+const QByteArray longName{"a-name-that-is-quite-a-lot-longer-than-the-names-of-all-others"};
+
+// Of the addresses from 10.0.0.0 to 10.0.0.199 and from 10.0.1.0 to 10.0.1.199.
+QByteArray manyLeases()
+{
+    QByteArray leases;
+    for (int i{0}; i < 400; ++i)
+        leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
+    return leases;
+}
+
+// Ways in which a program adds leases to the file $1.
+void addReloads()
+{
+    QTest::addColumn<QByteArray>("command");
+    QTest::addRow("appended to") << QByteArray{R"(cat >>"$1")"};
+    QTest::addRow("replaced") << QByteArray{R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
+    QTest::addRow("replaced, the old one kept")
+        << QByteArray{R"(ln -f "$1" "$1~"; cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
+    QTest::addRow("written anew") << QByteArray{R"({ cat "$1"; cat; } >"$1.all"; cat "$1.all" >"$1")"};
 }
 
 const QByteArray configuration{R"(ddns-hostname gamma;
@@ -101,6 +127,46 @@ struct Site final
         QContextMenuEvent event{QContextMenuEvent::Mouse, position, table->viewport()->mapToGlobal(position)};
         QApplication::sendEvent(table->viewport(), &event);
     }
+    bool isShownWhole(const char *address, int column) const
+    {
+        const auto &view = static_cast<const QAbstractItemView &>(*table);
+        return table->columnWidth(column) >=
+               view.sizeHintForIndex(table->model()->index(rowOf(address), column)).width();
+    }
+
+    QWidget *header() const { return table->horizontalHeader()->viewport(); }
+    QPoint borderBehind(int column) const
+    {
+        const QHeaderView &view{*table->horizontalHeader()};
+        return {view.sectionViewportPosition(column) + view.sectionSize(column) - 1, view.height() / 2};
+    }
+    void enterHeader() const
+    {
+        QEvent enter{QEvent::Enter};
+        QApplication::sendEvent(header(), &enter);
+    }
+    void drag(int column, int distance) const
+    {
+        enterHeader();
+        const QPoint border{borderBehind(column)};
+        QTest::mousePress(header(), Qt::LeftButton, {}, border);
+        const QPoint end{border + QPoint{distance, 0}};
+        QMouseEvent move{QEvent::MouseMove, end, Qt::NoButton, Qt::LeftButton, {}};
+        QApplication::sendEvent(header(), &move);
+        QTest::mouseRelease(header(), Qt::LeftButton, {}, end);
+    }
+    void doubleClickBorder(int column) const { QTest::mouseDClick(header(), Qt::LeftButton, {}, borderBehind(column)); }
+
+    /// The text that the tip over a cell shows; empty when there is none.
+    QString toolTip(const char *address, int column) const
+    {
+        QToolTip::hideText();
+        const QPoint position{centre(address, column)};
+        QHelpEvent help{QEvent::ToolTip, position, table->viewport()->mapToGlobal(position)};
+        QApplication::sendEvent(table->viewport(), &help);
+        return QTextDocumentFragment::fromHtml(QToolTip::text()).toPlainText();
+    }
+
     void type(const QString &text) const { QTest::keyClicks(field, text); }
     void press(QToolButton *button) const { QTest::mouseClick(button, Qt::LeftButton); }
 
@@ -171,6 +237,15 @@ private slots:
     void rowsAreAsTallAsALine();
     void placeIsKeptOverAutomaticReloads_data();
     void placeIsKeptOverAutomaticReloads();
+    void horizontalPlaceIsKeptOverAutomaticReloads_data();
+    void horizontalPlaceIsKeptOverAutomaticReloads();
+    void leaseThatIsOnlyCurrentIsNotSelected_data();
+    void leaseThatIsOnlyCurrentIsNotSelected();
+    void columnsShowWhatIsScrolledTo();
+    void columnsShowWhatArrives_data();
+    void columnsShowWhatArrives();
+    void columnsAreTheUsersToDrag();
+    void cutTextHasAToolTip();
     void searchIsKeptOverAutomaticReloads();
     void leaseThatLeavesTheFilterHasNoSuccessor();
     void busyCursorShowsWhileMuchIsRead_data();
@@ -601,23 +676,12 @@ void LeaseCommandsTest::rowsAreAsTallAsALine()
     }
 }
 
-void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data()
-{
-    QTest::addColumn<QByteArray>("command");
-    QTest::addRow("appended to") << QByteArray{R"(cat >>"$1")"};
-    QTest::addRow("replaced") << QByteArray{R"(cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
-    QTest::addRow("replaced, the old one kept")
-        << QByteArray{R"(ln -f "$1" "$1~"; cat "$1" - >"$1.new"; mv "$1.new" "$1")"};
-    QTest::addRow("written anew") << QByteArray{R"({ cat "$1"; cat; } >"$1.all"; cat "$1.all" >"$1")"};
-}
+void LeaseCommandsTest::placeIsKeptOverAutomaticReloads_data() { addReloads(); }
 
 void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
 {
     QFETCH(QByteArray, command);
-    QByteArray leases;
-    for (int i{0}; i < 400; ++i)
-        leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
-    writeTestFile(paths::leases(), leases);
+    writeTestFile(paths::leases(), manyLeases());
     const Site site{*m_machine};
     site.click("10.0.1.100", 2);
     site.table->verticalScrollBar()->setValue(site.rowOf("10.0.0.150"));
@@ -636,6 +700,96 @@ void LeaseCommandsTest::placeIsKeptOverAutomaticReloads()
         QCOMPARE(site.topAddress(), QStringLiteral("10.0.0.150"));
         more = lease("9.0.0.2", "once more");
     }
+}
+
+void LeaseCommandsTest::horizontalPlaceIsKeptOverAutomaticReloads_data() { addReloads(); }
+
+void LeaseCommandsTest::horizontalPlaceIsKeptOverAutomaticReloads()
+{
+    QFETCH(QByteArray, command);
+    writeTestFile(paths::leases(), manyLeases());
+    const Site site{*m_machine};
+    site.window->resize(500, 500);
+    QTRY_VERIFY(site.table->horizontalScrollBar()->maximum() > 0);
+    site.table->horizontalScrollBar()->setValue(1);
+    runOutside(paths::leases(), command, lease("10.0.0.3", "other") + lease("10.0.0.201", "other"));
+    QTRY_COMPARE(site.table->model()->rowCount(), 401);
+    QCOMPARE(site.table->horizontalScrollBar()->value(), 1);
+}
+
+void LeaseCommandsTest::leaseThatIsOnlyCurrentIsNotSelected_data() { addReloads(); }
+
+void LeaseCommandsTest::leaseThatIsOnlyCurrentIsNotSelected()
+{
+    QFETCH(QByteArray, command);
+    const Site site{*m_machine};
+    site.click("10.0.0.11");
+    site.table->clearSelection();
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11"));
+    runOutside(paths::leases(), command, lease("10.0.0.1", "before"));
+    QTRY_COMPARE(site.table->model()->rowCount(), 6);
+    QCOMPARE(site.currentAddress(), QStringLiteral("10.0.0.11"));
+    QVERIFY(!site.table->selectionModel()->hasSelection());
+}
+
+void LeaseCommandsTest::columnsShowWhatIsScrolledTo()
+{
+    writeTestFile(paths::leases(), manyLeases() + lease("10.0.1.150", longName));
+    const Site site{*m_machine};
+    QVERIFY(!site.isShownWhole("10.0.1.150", DhcpdLeasesModel::HostName));
+    const int before{site.table->columnWidth(DhcpdLeasesModel::HostName)};
+    site.table->verticalScrollBar()->setValue(site.rowOf("10.0.1.149"));
+    QTRY_VERIFY(site.isShownWhole("10.0.1.150", DhcpdLeasesModel::HostName));
+
+    const int wide{site.table->columnWidth(DhcpdLeasesModel::HostName)};
+    QVERIFY(wide > before);
+    site.table->verticalScrollBar()->setValue(0);
+    QCoreApplication::processEvents();
+    QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::HostName), wide);
+}
+
+void LeaseCommandsTest::columnsShowWhatArrives_data() { addReloads(); }
+
+void LeaseCommandsTest::columnsShowWhatArrives()
+{
+    QFETCH(QByteArray, command);
+    const Site site{*m_machine};
+    for (const bool isUsers : {false, true}) {
+        if (isUsers)
+            site.enterHeader();
+        const QByteArray name{longName + (isUsers ? "and-longer" : "")};
+        runOutside(paths::leases(), command, lease("10.0.0.10", name));
+        QTRY_COMPARE(site.cell(site.rowOf("10.0.0.10"), DhcpdLeasesModel::HostName), QString::fromLatin1(name));
+        QTRY_VERIFY(site.isShownWhole("10.0.0.10", DhcpdLeasesModel::HostName));
+    }
+}
+
+void LeaseCommandsTest::columnsAreTheUsersToDrag()
+{
+    const Site site{*m_machine};
+    const int fitting{site.table->columnWidth(DhcpdLeasesModel::Mac)};
+    site.drag(DhcpdLeasesModel::Mac, 40);
+    QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::Mac), fitting + 40);
+    site.drag(DhcpdLeasesModel::Mac, -70);
+    QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::Mac), fitting - 30);
+
+    runOutside(paths::leases(), R"(cat >>"$1")", lease("10.0.0.1", longName));
+    QTRY_VERIFY(site.isShownWhole("10.0.0.1", DhcpdLeasesModel::HostName));
+    QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::Mac), fitting - 30);
+
+    site.doubleClickBorder(DhcpdLeasesModel::Mac);
+    QTRY_VERIFY(site.isShownWhole("10.0.0.1", DhcpdLeasesModel::Mac));
+}
+
+void LeaseCommandsTest::cutTextHasAToolTip()
+{
+    writeTestFile(paths::leases(), lease("10.0.0.1", "<img src=x>") + lease("10.0.0.2", "b"));
+    const Site site{*m_machine};
+    QVERIFY(site.isShownWhole("10.0.0.1", DhcpdLeasesModel::HostName));
+    QCOMPARE(site.toolTip("10.0.0.1", DhcpdLeasesModel::HostName), QString{});
+    site.drag(DhcpdLeasesModel::HostName, 20 - site.table->columnWidth(DhcpdLeasesModel::HostName));
+    QCOMPARE(site.toolTip("10.0.0.1", DhcpdLeasesModel::HostName), QStringLiteral("<img src=x>"));
+    QTRY_COMPARE(site.toolTip("10.0.0.1", DhcpdLeasesModel::Mac), QString{}); // a tip goes slowly
 }
 
 void LeaseCommandsTest::leaseThatLeavesTheFilterHasNoSuccessor()
