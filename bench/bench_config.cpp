@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "bench/inputs.h"
+#include "bench/measurement.h"
 #include "config/dhcpdconfigmodel.h"
 
 #include <benchmark/benchmark.h>
@@ -9,18 +10,16 @@ namespace {
 void readConfiguration(benchmark::State &state)
 {
     double memory{};
+    Measurement reading;
     for (auto _ : state) {
-        state.PauseTiming();
-        {
-            const double before{inputs::heapBytes()};
-            DhcpdConfigModel model{{QStringLiteral("Topology"), QStringLiteral("Value")}};
-            state.ResumeTiming();
-            model.read(inputs::configuration());
-            state.PauseTiming();
-            memory = inputs::heapBytes() - before;
-        }
-        state.ResumeTiming();
+        const double before{inputs::heapBytes()};
+        DhcpdConfigModel model{{QStringLiteral("Topology"), QStringLiteral("Value")}};
+        reading.begin();
+        model.read(inputs::configuration());
+        reading.end();
+        memory = inputs::heapBytes() - before;
     }
+    reading.report(state);
     inputs::reportMemory(state, memory, inputs::configuration());
 }
 
@@ -28,11 +27,16 @@ void serializeConfiguration(benchmark::State &state)
 {
     DhcpdConfigModel model{{QStringLiteral("Topology"), QStringLiteral("Value")}};
     model.read(inputs::configuration());
-    for (auto _ : state)
+    Measurement writing;
+    for (auto _ : state) {
+        writing.begin();
         benchmark::DoNotOptimize(model.fileContent());
+        writing.end();
+    }
+    writing.report(state);
 }
 
-BENCHMARK(readConfiguration)->Unit(benchmark::kMillisecond);
-BENCHMARK(serializeConfiguration)->Unit(benchmark::kMillisecond);
+BENCHMARK(readConfiguration)->Iterations(1);
+BENCHMARK(serializeConfiguration)->Iterations(1);
 
 } // namespace

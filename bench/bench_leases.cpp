@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "bench/inputs.h"
+#include "bench/measurement.h"
 #include "leases/dhcpdleasesmodel.h"
 
 #include <benchmark/benchmark.h>
@@ -9,21 +10,19 @@ namespace {
 void loadLeases(benchmark::State &state)
 {
     double memory{};
+    Measurement loading;
     for (auto _ : state) {
-        state.PauseTiming();
-        {
-            const double before{inputs::heapBytes()};
-            DhcpdLeasesModel model;
-            state.ResumeTiming();
-            model.reload(inputs::leases());
-            state.PauseTiming();
-            memory = inputs::heapBytes() - before;
-        }
-        state.ResumeTiming();
+        const double before{inputs::heapBytes()};
+        DhcpdLeasesModel model;
+        loading.begin();
+        model.reload(inputs::leases());
+        loading.end();
+        memory = inputs::heapBytes() - before;
     }
+    loading.report(state);
     inputs::reportMemory(state, memory, inputs::leases());
 }
 
-BENCHMARK(loadLeases)->Unit(benchmark::kMillisecond);
+BENCHMARK(loadLeases)->Iterations(1);
 
 } // namespace

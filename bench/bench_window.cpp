@@ -2,14 +2,15 @@
 // What the user waits for in the main window: from the last key or click until everything is painted.
 #include "app/fmain.h"
 #include "bench/inputs.h"
+#include "bench/measurement.h"
 #include "common/paths.h"
 #include "dialogs/hostinputdialog.h"
 
 #include <QApplication>
 #include <QDir>
-#include <QElapsedTimer>
 #include <QFile>
 #include <QLineEdit>
+#include <QStringList>
 #include <QTabWidget>
 #include <QTableView>
 #include <QTemporaryDir>
@@ -64,41 +65,46 @@ private:
     std::unique_ptr<FMain> m_window;
 };
 
-double secondsOf(const QElapsedTimer &timer) { return static_cast<double>(timer.nsecsElapsed()) / 1e9; }
-
 void addHost(benchmark::State &state)
 {
     Site site{inputs::configuration(), {}};
+    Measurement adding;
     for (auto _ : state) {
         QTreeView *tree{site.child<QTreeView>("topologyTree")};
         tree->setCurrentIndex(tree->model()->index(0, 0));
-        QElapsedTimer sinceSave;
-        QTimer::singleShot(0, &site.window(), [&site, &sinceSave] {
+        QTimer::singleShot(0, &site.window(), [&site, &adding] {
             HostInputDialog *dialog{site.window().findChild<HostInputDialog *>()};
             dialog->setName(QStringLiteral("new.example.org"));
-            sinceSave.start();
+            adding.begin();
             dialog->accept();
         });
         site.window().handleAddHost();
         Site::paint();
-        state.SetIterationTime(secondsOf(sinceSave));
+        adding.end();
     }
+    adding.report(state);
 }
 
-void searchKey(benchmark::State &state, const QString &before, const QString &text)
+/// The counters of each key have its place in the list as their suffix.
+void searchKeys(benchmark::State &state)
 {
     Site site{{}, inputs::leases()};
     site.child<QTabWidget>("mainTabWidget")->setCurrentIndex(1);
     Site::paint();
     QLineEdit *search{site.child<QLineEdit>("searchLease")};
     for (auto _ : state) {
-        search->setText(before);
-        Site::paint();
-        QElapsedTimer timer;
-        timer.start();
-        search->setText(text);
-        Site::paint();
-        state.SetIterationTime(secondsOf(timer));
+        const QStringList keys{inputs::keys()};
+        for (int i{0}; i < keys.size(); ++i) {
+            const QStringList texts{keys[i].split(QLatin1Char{'\t'})};
+            search->setText(texts.first());
+            Site::paint();
+            Measurement key;
+            key.begin();
+            search->setText(texts.last());
+            Site::paint();
+            key.end();
+            key.report(state, '_' + std::to_string(i));
+        }
     }
 }
 
@@ -108,6 +114,7 @@ void appendBlock(benchmark::State &state)
     site.child<QTabWidget>("mainTabWidget")->setCurrentIndex(1);
     Site::paint();
     int host{};
+    Measurement appending;
     for (auto _ : state) {
         QFile leases{paths::leases()};
         leases.open(QIODevice::Append);
@@ -120,37 +127,16 @@ void appendBlock(benchmark::State &state)
                          .arg(host++ % 256)
                          .toLatin1());
         leases.close();
-        QElapsedTimer timer;
-        timer.start();
+        appending.begin();
         site.window().leaseReload();
         Site::paint();
-        state.SetIterationTime(secondsOf(timer));
+        appending.end();
     }
+    appending.report(state);
 }
 
-BENCHMARK(addHost)->UseManualTime()->Unit(benchmark::kMillisecond);
-BENCHMARK(appendBlock)->UseManualTime()->Unit(benchmark::kMillisecond)->MinTime(0.2);
-
-void registerSearches()
-{
-    struct Search
-    {
-        const char *name;
-        const char *before;
-        const char *text;
-    };
-    for (const Search &search :
-         {Search{"scattered", "host-1", "host-10"}, Search{"dense", "202", "2026"}, Search{"digit", "", "1"},
-          Search{"none", "host", "hostx"}, Search{"cleared", "host-10", ""}}) {
-        benchmark::RegisterBenchmark((std::string{"searchKey/"} + search.name).c_str(),
-                                     [search](benchmark::State &state) {
-                                         searchKey(state, QLatin1String{search.before}, QLatin1String{search.text});
-                                     })
-            ->UseManualTime()
-            ->Unit(benchmark::kMillisecond);
-    }
-}
-
-const bool registered{(registerSearches(), true)};
+BENCHMARK(addHost)->Iterations(1);
+BENCHMARK(searchKeys)->Iterations(1);
+BENCHMARK(appendBlock)->Iterations(10);
 
 } // namespace

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 // Linked into a program with a main window: when the window has been painted for the first time, prints the
 // milliseconds of processor time used since the start of the process, and ends the program.
+#include "bench/processortime.h"
+
 #include <QCoreApplication>
 #include <QEvent>
 #include <QGuiApplication>
@@ -9,22 +11,13 @@
 
 #include <cstdio>
 #include <cstdlib>
-#include <ctime>
 
 namespace {
-
-/// The processor time of this process, without that of child processes and of other programs.
-double milliseconds()
-{
-    timespec time{};
-    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &time);
-    return static_cast<double>(time.tv_sec) * 1e3 + static_cast<double>(time.tv_nsec) / 1e6;
-}
 
 void report()
 {
     QGuiApplication::sync(); // what was drawn is on the display
-    std::printf("%.2f\n", milliseconds());
+    std::printf("%.2f\n", processorMilliseconds());
     std::fflush(stdout);
     QCoreApplication::quit();
 }

@@ -12,6 +12,8 @@ namespace inputs {
 QString configuration() { return qEnvironmentVariable("ORV_BENCH_CONFIGURATION"); }
 QString leases() { return qEnvironmentVariable("ORV_BENCH_LEASES"); }
 
+QStringList keys() { return qEnvironmentVariable("ORV_BENCH_KEYS").split(QLatin1Char{'\n'}); }
+
 double heapBytes()
 {
     const struct mallinfo2 info

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 namespace benchmark {
 class State;
@@ -12,6 +13,9 @@ namespace inputs {
 /// The campus configuration and lease file that the run works on.
 QString configuration();
 QString leases();
+
+/// The keys typed into the search field: of each, the text before and after it with a tab between.
+QStringList keys();
 
 /// The bytes of memory in use on the heap.
 double heapBytes();
