@@ -5,11 +5,14 @@
 #include <QFile>
 #include <QFileInfo>
 
+#include <algorithm>
+
 #include <sys/stat.h>
 
 namespace {
 
-constexpr int burstMilliseconds{100};
+constexpr qint64 burstMilliseconds{100};
+constexpr qint64 pauseForEachMillisecond{3}; // of what a notice brought about
 
 void unwatch(QFileSystemWatcher *watcher)
 {
@@ -56,7 +59,6 @@ PathWatch::PathWatch(const QString &file, const QString &directory, QObject *par
     , m_directoryWatcher{new QFileSystemWatcher{parent}}
 {
     m_burst.setSingleShot(true);
-    m_burst.setInterval(burstMilliseconds);
     connect(&m_burst, &QTimer::timeout, this, &PathWatch::notify);
 
     connect(m_directoryWatcher, &QFileSystemWatcher::directoryChanged, this, &PathWatch::startBurst);
@@ -101,8 +103,10 @@ void PathWatch::noteAbove()
 // A running timer is not restarted: a file written to all the time is noticed ten times a second, not never.
 void PathWatch::startBurst()
 {
-    if (!m_burst.isActive())
-        m_burst.start();
+    if (m_burst.isActive())
+        return;
+    const qint64 pauseLeft{m_sinceNotice.isValid() ? m_pause - m_sinceNotice.elapsed() : 0};
+    m_burst.start(static_cast<int>(std::max(burstMilliseconds, pauseLeft)));
 }
 
 void PathWatch::notify()
@@ -110,5 +114,9 @@ void PathWatch::notify()
     // First watch anew, then tell: a change that happens while the receiver reads the file is a notice of its own.
     pause();
     resume();
+    QElapsedTimer time;
+    time.start();
     emit changed();
+    m_pause = pauseForEachMillisecond * time.elapsed();
+    m_sinceNotice.start();
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QByteArray>
+#include <QElapsedTimer>
 #include <QFileSystemWatcher>
 #include <QObject>
 #include <QString>
@@ -11,7 +12,8 @@
 /// The directory may be removed, replaced and made again; a third watcher, of the nearest folder above that exists,
 /// tells.
 ///
-/// Notifications that arrive within 100 ms of the first one count as one. Both paths are watched anew after every
+/// Notifications that arrive within 100 ms of the first one count as one; more, where what the last notice brought
+/// about took so long that notices would take more than a quarter of the time. Both paths are watched anew after every
 /// notice: a path whose file was replaced while somebody holds the old one open stays on the dead file otherwise.
 class PathWatch final : public QObject
 {
@@ -46,4 +48,6 @@ private:
     QFileSystemWatcher m_aboveWatcher;
     QByteArray m_identity; // of the directory that is watched, empty while there is none
     QTimer m_burst;
+    QElapsedTimer m_sinceNotice;
+    qint64 m_pause{}; // milliseconds without a notice after the last one
 };

@@ -2,7 +2,7 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """Measures the program beside the programs that it is compared with, on the same files, and prints the ratios.
 
-Usage: bench/compare.py BUILD_FOLDER [--hosts N] [--leases N] [--rounds N] [--only TABLE...]
+Usage: bench/compare.py BUILD_FOLDER [--hosts N] [--leases N] [--rounds N] [--seconds N] [--only TABLE...]
 
 BUILD_FOLDER is a build of the preset "bench". The DHCP server and dhcpd-pools are found in $ORV_TOOLS_DIR, where
 scripts/fetch-tools puts them, or in PATH. All sides of a ratio run in turn, once a round, and the minima of their
@@ -11,6 +11,7 @@ as the program starts for nobody else.
 """
 import argparse
 import contextlib
+import itertools
 import json
 import os
 import pathlib
@@ -23,7 +24,7 @@ import tempfile
 import time
 from typing import NamedTuple
 
-from inputs import write_configuration, write_leases, write_server_leases
+from inputs import appended_blocks, write_configuration, write_leases, write_server_leases
 
 
 class Key(NamedTuple):
@@ -222,8 +223,10 @@ def display(folder):
             server.terminate()
 
 
-def start_rows(bench, _folder, _arguments):
-    with tempfile.TemporaryDirectory() as root, display(root) as (kind, variables):
+@contextlib.contextmanager
+def site():
+    """A root folder with small files for the window: the platform, the folder and an environment to start it in."""
+    with tempfile.TemporaryDirectory() as root, display(root) as (platform, variables):
         for path, content in (
             ("etc/dhcp/dhcpd.conf", "authoritative;\n"),
             ("var/lib/dhcp/dhcpd.leases", ""),
@@ -233,7 +236,11 @@ def start_rows(bench, _folder, _arguments):
             file.parent.mkdir(parents=True)
             file.write_text(content, encoding="ascii")
         # Without programs to start: the time of child processes does not count.
-        environment = dict(os.environ, ORV_TEST_ROOT=root, PATH=root, **variables)
+        yield platform, root, dict(os.environ, ORV_TEST_ROOT=root, PATH=root, **variables)
+
+
+def start_rows(bench, _folder, _arguments):
+    with site() as (platform, _, environment):
 
         def start(program):
             """The milliseconds of processor time, which the program tells, and of the clock on the wall."""
@@ -250,7 +257,7 @@ def start_rows(bench, _folder, _arguments):
         runs = [start("orv_bench_start") + start("orv_bench_start_empty") for _ in bench.rounds for _ in range(4)]
     processor, wall, empty_processor, empty_wall = map(statistics.median, zip(*runs))
     yield Row(
-        f"start to the first painted window ({kind})",
+        f"start to the first painted window ({platform})",
         f"{processor:.1f} ms of processor time, empty window {empty_processor:.1f} ms: "
         f"{processor / empty_processor:.2f}; {wall:.0f} and {empty_wall:.0f} ms by the clock: "
         f"{wall / empty_wall:.2f}",
@@ -259,8 +266,37 @@ def start_rows(bench, _folder, _arguments):
     )
 
 
+BLOCKS_A_SECOND = 500
+WRITES_A_SECOND = 50
+
+
+def busy_rows(bench, _folder, arguments):
+    """The window while a server appends blocks to the lease file, without and with a filter."""
+    for text, kind in (("", "no filter"), ("10.3.", "a filter"), ("e", "a filter of every row")):
+        with site() as (platform, root, environment):
+            path = pathlib.Path(root, "var/lib/dhcp/dhcpd.leases")
+            write_leases(path, arguments.leases)
+            command = [bench.build / "bench/orv_bench_busy", str(arguments.seconds), text]
+            with subprocess.Popen(command, env=environment, stdout=subprocess.PIPE, encoding="ascii") as window, open(
+                path, "a", encoding="ascii"
+            ) as leases:
+                window.stdout.readline()
+                blocks = appended_blocks(arguments.leases)
+                while window.poll() is None:
+                    leases.write("".join(itertools.islice(blocks, BLOCKS_A_SECOND // WRITES_A_SECOND)))
+                    leases.flush()
+                    time.sleep(1 / WRITES_A_SECOND)
+                share, stall = map(float, window.stdout.read().split())
+        yield Row(
+            f"{BLOCKS_A_SECOND} blocks a second, {kind} ({platform})",
+            f"{100 * share:.0f} % of a core, longest stall {stall:.0f} ms",
+            "33 %, 100 ms",
+            share <= 1 / 3 and stall <= 100,
+        )
+
+
 # The parts of the table: each writes what it needs into the folder, and yields rows.
-TABLES = {"configuration": configuration_rows, "leases": lease_rows, "start": start_rows}
+TABLES = {"configuration": configuration_rows, "leases": lease_rows, "busy": busy_rows, "start": start_rows}
 
 
 def main():
@@ -269,6 +305,7 @@ def main():
     parser.add_argument("--hosts", type=int, default=100_000)
     parser.add_argument("--leases", type=int, default=1_000_000)
     parser.add_argument("--rounds", type=int, default=5)
+    parser.add_argument("--seconds", type=int, default=60, help="of the busy server")
     parser.add_argument("--only", nargs="+", choices=TABLES, default=list(TABLES))
     arguments = parser.parse_args()
     bench = Bench(arguments.build.resolve(), arguments.rounds)

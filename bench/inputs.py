@@ -34,19 +34,34 @@ def write_leases(path, blocks):
     with open(path, "w", encoding="ascii") as file:
         file.write(LEASES_HEAD)
         for number in numbers:
-            start = number % 43200
-            clock = "{:02}:{:02}:{:02}".format
-            begin = clock(start // 3600, start // 60 % 60, start % 60)
-            end = clock(start // 3600 + 10, start // 60 % 60, start % 60)
-            low = f"{number >> 16 & 255:02x}:{number >> 8 & 255:02x}:{number & 255:02x}"
-            file.write(
-                f"lease 10.{1 + (number >> 16)}.{number >> 8 & 255}.{number & 255} {{\n"
-                f"  starts 6 2026/11/21 {begin};\n  ends 6 2026/11/21 {end};\n  cltt 6 2026/11/21 {begin};\n"
-                "  binding state active;\n  next binding state free;\n  rewind binding state free;\n"
-                f"  hardware ethernet 02:00:00:{low};\n"
-                f'  uid "\\001\\002\\000\\000\\{number >> 16 & 7:03o}\\001\\{number & 63:03o}";\n'
-                f'  client-hostname "host-{number:07}";\n}}\n'
-            )
+            file.write(plain_block(number, number % 43200))
+
+
+def plain_block(number, start):
+    """The block of the client of that number, whose lease begins at that second of the day."""
+    clock = "{:02}:{:02}:{:02}".format
+    begin = clock(start // 3600, start // 60 % 60, start % 60)
+    end = clock(start // 3600 + 10, start // 60 % 60, start % 60)
+    low = f"{number >> 16 & 255:02x}:{number >> 8 & 255:02x}:{number & 255:02x}"
+    return (
+        f"lease 10.{1 + (number >> 16)}.{number >> 8 & 255}.{number & 255} {{\n"
+        f"  starts 6 2026/11/21 {begin};\n  ends 6 2026/11/21 {end};\n  cltt 6 2026/11/21 {begin};\n"
+        "  binding state active;\n  next binding state free;\n  rewind binding state free;\n"
+        f"  hardware ethernet 02:00:00:{low};\n"
+        f'  uid "\\001\\002\\000\\000\\{number >> 16 & 7:03o}\\001\\{number & 63:03o}";\n'
+        f'  client-hostname "host-{number:07}";\n}}\n'
+    )
+
+
+def appended_blocks(blocks):
+    """What a server appends without end to the plain file of that many blocks: nine renewals, then a new lease."""
+    choose = random.Random(3)
+    new = blocks
+    while True:
+        for _ in range(9):
+            yield plain_block(choose.randrange(new), choose.randrange(43200))
+        yield plain_block(new, choose.randrange(43200))
+        new += choose.randrange(1, 5)
 
 
 def write_server_leases(path, blocks):

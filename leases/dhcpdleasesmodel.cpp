@@ -16,8 +16,13 @@ constexpr std::array headers{
 };
 constexpr int columns{headers.size()};
 
-// More than this, some ten blocks, is announced as one reset: each row announced costs its views more than that.
-constexpr qint64 mostAnnouncedByRow{4096};
+// What is appended beyond this is announced as one reset, before it is read.
+constexpr qint64 mostBytesAnnounced{qint64{1} << 20};
+// More ranges of new rows than these are announced as one reset as well: over a million leases each costs the filter
+// and the view an eighth of what a reset does.
+constexpr std::size_t mostRangesAnnounced{8};
+// Changed rows that are at most so far apart are announced together with those between.
+constexpr int widestGap{8};
 
 } // namespace
 
@@ -80,15 +85,15 @@ void DhcpdLeasesModel::update(const QString &path)
         reload(path);
         return;
     }
-    const bool isAnnouncedByRow{file.size() - m_reader.position() <= mostAnnouncedByRow};
-    if (!isAnnouncedByRow)
+    const bool isMuch{file.size() - m_reader.position() > mostBytesAnnounced};
+    if (isMuch)
         beginResetModel();
     const bool isRead{m_reader.readOn(file)};
-    if (isAnnouncedByRow) {
-        settleOneByOne();
-    } else {
+    if (isMuch) {
         m_table.settleAll();
         endResetModel();
+    } else {
+        settle();
     }
     if (!isRead)
         reload(path);
@@ -113,17 +118,30 @@ QString DhcpdLeasesModel::text(const Lease &lease, int column) const
     }
 }
 
-void DhcpdLeasesModel::settleOneByOne()
+void DhcpdLeasesModel::settle()
 {
-    while (m_table.hasPending()) {
-        const auto [row, isNew] = m_table.placeOfNext();
-        if (isNew) {
-            beginInsertRows({}, row, row);
-            m_table.settleNext();
-            endInsertRows();
-        } else {
-            m_table.settleNext();
-            emit dataChanged(index(row, 0), index(row, columns - 1));
-        }
+    announceChanged(m_table.settleKnown());
+    const std::vector<LeaseTable::Rows> ranges{m_table.newRows()};
+    if (ranges.size() > mostRangesAnnounced) {
+        beginResetModel();
+        m_table.settleAll();
+        endResetModel();
+        return;
+    }
+    for (const LeaseTable::Rows &rows : ranges) {
+        beginInsertRows({}, rows.first, rows.first + rows.count - 1);
+        m_table.settleFirst(rows);
+        endInsertRows();
+    }
+}
+
+void DhcpdLeasesModel::announceChanged(const std::vector<int> &rows)
+{
+    for (auto first = rows.cbegin(); first != rows.cend();) {
+        auto last = first;
+        while (last + 1 != rows.cend() && *(last + 1) - *last <= widestGap)
+            ++last;
+        emit dataChanged(index(*first, 0), index(*last, columns - 1));
+        first = last + 1;
     }
 }

@@ -57,13 +57,14 @@ public slots:
     void reload(const QString &path);
 
     /// Brings the model up to date with the file at `path`. If the file has only grown since it was last read, just
-    /// what was appended is read, and a few new leases are announced as changed and inserted rows; otherwise this is
-    /// a reload.
+    /// what was appended is read, and what it changed is announced as ranges of changed and of inserted rows; a reset
+    /// announces more than a little of it, and what is no addition is a reload.
     void update(const QString &path);
 
 private:
     QString text(const Lease &lease, int column) const;
-    void settleOneByOne();
+    void settle();
+    void announceChanged(const std::vector<int> &rows);
 
     LeaseTable m_table;
     LeaseReader m_reader{m_table};

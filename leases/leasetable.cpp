@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <numeric>
 
 namespace {
 
@@ -87,26 +88,55 @@ void LeaseTable::settleAll()
     m_rows = std::move(rows);
 }
 
-LeaseTable::Place LeaseTable::placeOfNext() const
+std::vector<int> LeaseTable::settleKnown()
 {
-    const quint32 address{m_leases[m_rows.size()].address};
+    const auto pending = m_leases.begin() + size();
+    std::stable_sort(pending, m_leases.end(), [](const Lease &a, const Lease &b) { return a.address < b.address; });
+    std::vector<int> known;
+    auto kept = pending;
+    for (auto lease = pending; lease != m_leases.end(); ++lease) {
+        if (lease + 1 != m_leases.end() && (lease + 1)->address == lease->address)
+            continue; // there is a later one
+        const std::size_t row{lowerBound(lease->address)};
+        if (row < m_rows.size() && m_leases[m_rows[row]].address == lease->address) {
+            m_leases[m_rows[row]] = *lease;
+            known.push_back(static_cast<int>(row));
+        } else {
+            *kept++ = *lease;
+        }
+    }
+    m_leases.erase(kept, m_leases.end());
+    return known;
+}
+
+std::vector<LeaseTable::Rows> LeaseTable::newRows() const
+{
+    std::vector<Rows> ranges;
+    std::size_t next{m_rows.size()}; // the old row that the range goes before
+    int settled{0};
+    for (std::size_t place{m_rows.size()}; place < m_leases.size(); ++place, ++settled) {
+        const std::size_t row{lowerBound(m_leases[place].address)};
+        if (ranges.empty() || row != next)
+            ranges.push_back({static_cast<int>(row) + settled, 0});
+        ++ranges.back().count;
+        next = row;
+    }
+    return ranges;
+}
+
+void LeaseTable::settleFirst(const Rows &rows)
+{
+    std::vector<quint32> places(static_cast<std::size_t>(rows.count));
+    std::iota(places.begin(), places.end(), static_cast<quint32>(m_rows.size()));
+    m_rows.insert(m_rows.begin() + rows.first, places.cbegin(), places.cend());
+}
+
+std::size_t LeaseTable::lowerBound(quint32 address) const
+{
     const auto row = std::lower_bound(m_rows.cbegin(), m_rows.cend(), address, [this](quint32 place, quint32 wanted) {
         return m_leases[place].address < wanted;
     });
-    return {static_cast<int>(row - m_rows.cbegin()), row == m_rows.cend() || m_leases[*row].address != address};
-}
-
-void LeaseTable::settleNext()
-{
-    const Place place{placeOfNext()};
-    const auto row = m_rows.begin() + place.row;
-    if (place.isNew) {
-        m_rows.insert(row, static_cast<quint32>(m_rows.size()));
-    } else {
-        const auto next = m_leases.begin() + size();
-        m_leases[*row] = *next;
-        m_leases.erase(next);
-    }
+    return static_cast<std::size_t>(row - m_rows.cbegin());
 }
 
 QString LeaseTable::addressText(quint32 address) const

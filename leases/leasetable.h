@@ -12,16 +12,16 @@
 
 /// The leases by address, one for each; a later one replaces an earlier one.
 ///
-/// What is added is pending and has no row until it is settled: all at once, which sorts only once, or one by one for a
-/// model that announces each change.
+/// What is added is pending and has no row until it is settled: all at once, or, for a model that announces what
+/// changes, first the leases of addresses that have a row and then one range of new rows after the other.
 class LeaseTable final
 {
 public:
-    /// Where a pending lease goes: to a new row, or in place of the lease in that row.
-    struct Place
+    /// A range of rows.
+    struct Rows
     {
-        int row;
-        bool isNew;
+        int first;
+        int count;
     };
 
     void clear();
@@ -34,12 +34,14 @@ public:
     /// Adds a pending lease. `addressText` is given if the address is not shown the way its number would be.
     void add(const Lease &lease, const std::optional<QString> &addressText);
 
-    bool hasPending() const { return m_rows.size() < m_leases.size(); }
     void settleAll();
-    /// The place of the pending lease that was added first.
-    Place placeOfNext() const;
-    /// Moves the pending lease that was added first to its place.
-    void settleNext();
+    /// Settles the pending leases of addresses that have a row already, and returns these rows in ascending order. For
+    /// each other address its last lease stays pending.
+    std::vector<int> settleKnown();
+    /// After settleKnown(): the ranges of rows that the pending leases will be in, in ascending order.
+    std::vector<Rows> newRows() const;
+    /// Settles the pending leases of the first of these ranges.
+    void settleFirst(const Rows &rows);
 
     int size() const { return static_cast<int>(m_rows.size()); }
     const Lease &at(int row) const { return m_leases[m_rows[static_cast<std::size_t>(row)]]; }
@@ -54,6 +56,9 @@ public:
     int placeInFile(int row) const { return static_cast<int>(m_rows[static_cast<std::size_t>(row)]); }
 
 private:
+    /// The first row with that address or a higher one.
+    std::size_t lowerBound(quint32 address) const;
+
     LeaseTexts m_texts;
     std::vector<Lease> m_leases; // in the order of the file; those from m_rows.size() on are pending
     std::vector<quint32> m_rows; // places in m_leases, by address

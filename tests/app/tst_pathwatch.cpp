@@ -24,6 +24,7 @@ private slots:
     void watchesDirectoryThatIsMadeLater();
     void noticesNothingBesideTheDirectory();
     void noticesNothingWhilePaused();
+    void noticesASlowReceiverLessOften();
 
 private:
     QString path(const char *below) const { return m_root->filePath(QString::fromLatin1(below)); }
@@ -148,6 +149,25 @@ void PathWatchTest::noticesNothingWhilePaused()
     m_watch->resume();
     writeTestFile(path("lib/dhcp/leases"), "2");
     EXPECT(expectNotice);
+}
+
+void PathWatchTest::noticesASlowReceiverLessOften()
+{
+    QElapsedTimer sinceNotice;
+    QVector<qint64> pauses;
+    connect(m_watch, &PathWatch::changed, this, [&] {
+        if (sinceNotice.isValid())
+            pauses += sinceNotice.elapsed();
+        if (pauses.isEmpty())
+            QTest::qSleep(200);
+        writeTestFile(path("lib/dhcp/leases"), QByteArray::number(pauses.size()));
+        sinceNotice.start();
+    });
+    writeTestFile(path("lib/dhcp/leases"), "2");
+    QTRY_VERIFY(pauses.size() >= 2);
+    QVERIFY2(pauses.first() >= 600, qPrintable(QString::number(pauses.first())));
+    QVERIFY2(pauses.at(1) < pauses.first(), qPrintable(QString::number(pauses.at(1))));
+    m_watch->pause();
 }
 
 QTEST_GUILESS_MAIN(PathWatchTest)

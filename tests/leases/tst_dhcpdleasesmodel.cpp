@@ -72,6 +72,8 @@ private slots:
     void tellsHowMuchAnUpdateReads();
     void updateTakesBackAnEndThatTurnsOutToBeNone();
     void updateAnnouncesNewAndChangedRows();
+    void updateJoinsRows_data();
+    void updateJoinsRows();
     void updateAnnouncesMuchAsAReset();
     void updateOfAnUnchangedFileSaysNothing();
     void updateReadsTheWholeOfAnotherFile_data();
@@ -377,6 +379,11 @@ void DhcpdLeasesModelTest::updateAnnouncesNewAndChangedRows()
     const QSignalSpy resets{&model, &QAbstractItemModel::modelReset};
     QSignalSpy inserted{&model, &QAbstractItemModel::rowsInserted};
     QSignalSpy changed{&model, &QAbstractItemModel::dataChanged};
+    connect(&model, &QAbstractItemModel::dataChanged, this, [&](const QModelIndex &first, const QModelIndex &end) {
+        QCOMPARE(first, model.index(1, 0)); // nothing has come yet
+        QCOMPARE(end, model.index(1, 5));
+        QCOMPARE(model.rowCount(), 2);
+    });
 
     appendTo(m_path, leaseBlock(0, 3, 3) + leaseBlock(0, 5, 4) + leaseBlock(0, 3, 5) + leaseBlock(0, 9, 6));
     model.update(m_path);
@@ -384,15 +391,62 @@ void DhcpdLeasesModelTest::updateAnnouncesNewAndChangedRows()
     QCOMPARE(inserted.size(), 2);
     QCOMPARE(inserted[0].mid(1), (QVariantList{1, 1}));
     QCOMPARE(inserted[1].mid(1), (QVariantList{3, 3}));
-    QCOMPARE(changed.size(), 2);
-    QCOMPARE(changed[0][0].toModelIndex(), model.index(2, 0));
-    QCOMPARE(changed[0][1].toModelIndex(), model.index(2, 5));
-    QCOMPARE(changed[1][0].toModelIndex(), model.index(1, 0));
+    QCOMPARE(changed.size(), 1);
     QCOMPARE(last.row(), 2);
     QCOMPARE(last.data().toString(), text("10.0.0.5"));
     QCOMPARE(model.index(2, 2).data().toString(), text("host-4"));
     QCOMPARE(model.index(1, 2).data().toString(), text("host-5"));
     QCOMPARE(rowsOf(model), referenceRows(readTestFile(m_path)));
+}
+
+void DhcpdLeasesModelTest::updateJoinsRows_data()
+{
+    QTest::addColumn<QVector<int>>("octets");
+    QTest::addColumn<QString>("changed");
+    QTest::addColumn<QString>("inserted");
+
+    // The leases before have the even octets from 100 to 198, in the rows from 0 to 49.
+    const auto row = [](const char *name, const QVector<int> &octets, const char *changed, const char *inserted) {
+        QTest::addRow("%s", name) << octets << text(changed) << text(inserted);
+    };
+    row("neighbours", {104, 100, 102}, "0-2 ", "");
+    row("a small gap", {100, 116}, "0-8 ", "");
+    row("a wide gap", {118, 100}, "0-0 9-9 ", "");
+    row("new ones in one place", {3, 1, 2, 1}, "", "0-2 ");
+    row("new ones at both ends", {200, 99, 201}, "", "0-0 51-52 ");
+    row("new ones around an old one", {103, 101}, "", "1-1 3-3 ");
+    row("both", {101, 198, 102, 199, 200}, "1-1 49-49 ", "1-1 51-52 ");
+    row("the most ranges", {101, 103, 105, 107, 109, 111, 113, 115}, "", "1-1 3-3 5-5 7-7 9-9 11-11 13-13 15-15 ");
+    row("too many ranges", {101, 103, 105, 107, 109, 111, 113, 115, 117, 198}, "49-49 ", "reset ");
+}
+
+void DhcpdLeasesModelTest::updateJoinsRows()
+{
+    QFETCH(const QVector<int>, octets);
+    QFETCH(const QString, changed);
+    QFETCH(const QString, inserted);
+    DhcpdLeasesModel model;
+    const QAbstractItemModelTester tester{&model, QAbstractItemModelTester::FailureReportingMode::QtTest};
+    QByteArray file;
+    for (int octet{100}; octet < 200; octet += 2)
+        file += leaseBlock(0, octet, octet);
+    writeTestFile(m_path, file);
+    model.reload(m_path);
+
+    QString announced;
+    const auto note = [&announced](int first, int last) { announced += QStringLiteral("%1-%2 ").arg(first).arg(last); };
+    connect(&model, &QAbstractItemModel::dataChanged, this,
+            [&](const QModelIndex &first, const QModelIndex &last) { note(first.row(), last.row()); });
+    connect(&model, &QAbstractItemModel::rowsInserted, this,
+            [&](const QModelIndex & /*parent*/, int first, int last) { note(first, last); });
+    connect(&model, &QAbstractItemModel::modelReset, this, [&] { announced += QLatin1String{"reset "}; });
+    QByteArray more;
+    for (int i{0}; i < octets.size(); ++i)
+        more += leaseBlock(0, octets[i], 1000 + i);
+    appendTo(m_path, more);
+    model.update(m_path);
+    QCOMPARE(announced, changed + inserted);
+    QCOMPARE(rowsOf(model), referenceRows(file + more));
 }
 
 void DhcpdLeasesModelTest::updateAnnouncesMuchAsAReset()
@@ -406,7 +460,7 @@ void DhcpdLeasesModelTest::updateAnnouncesMuchAsAReset()
     const QSignalSpy resets{&model, &QAbstractItemModel::modelReset};
     const QSignalSpy inserted{&model, &QAbstractItemModel::rowsInserted};
     const QSignalSpy changed{&model, &QAbstractItemModel::dataChanged};
-    QByteArray more;
+    QByteArray more{"# " + QByteArray(1 << 20, 'x') + "\n"};
     for (int i{0}; i < 200; ++i)
         more += leaseBlock(i % 3, i, 2 * i);
     appendTo(m_path, more);
