@@ -199,7 +199,7 @@
     </message>
     <message>
         <source>Zone served by DNS server</source>
-        <translation>Vom DNS-Server bediente Zone</translation>
+        <translation>Zone des DNS-Servers</translation>
     </message>
     <message>
         <source>Group</source>
@@ -207,7 +207,7 @@
     </message>
     <message>
         <source> mounth </source>
-        <translation> Monat(e) </translation>
+        <translation> Mon. </translation>
     </message>
     <message>
         <source> minutes </source>
@@ -263,7 +263,7 @@
     </message>
     <message>
         <source>Generated secret</source>
-        <translation>Erzeugtes Geheimnis</translation>
+        <translation>Geheimer Schlüssel</translation>
     </message>
     <message>
         <source>Master DNS Server</source>
@@ -271,7 +271,7 @@
     </message>
     <message>
         <source> days </source>
-        <translation> Tag(e) </translation>
+        <translation> Tg. </translation>
     </message>
     <message>
         <source> hours </source>
@@ -420,11 +420,11 @@
     </message>
     <message>
         <source>Add arbitrary parameter</source>
-        <translation>Beliebigen Parameter hinzufügen</translation>
+        <translation>Parameter als Text hinzufügen</translation>
     </message>
     <message>
         <source>Add arbitrary declaration</source>
-        <translation>Beliebige Deklaration hinzufügen</translation>
+        <translation>Deklaration als Text hinzufügen</translation>
     </message>
     <message>
         <source>Edit</source>
@@ -522,7 +522,7 @@ Möchten Sie die Änderungen speichern?</translation>
     </message>
     <message>
         <source>There are unsaved changes, save?</source>
-        <translation>Es gibt ungespeicherte Änderungen. Speichern?</translation>
+        <translation>Es gibt ungespeicherte Änderungen. Möchten Sie sie speichern?</translation>
     </message>
     <message>
         <source>The IP address is reserved.
@@ -538,8 +538,8 @@ Zur Topologie wechseln?</translation>
         <source>This editing mode for advanced users.
 After applying this changes configuration may be incorrect.
 Do you want to resume?</source>
-        <translation>Dieser Bearbeitungsmodus ist für erfahrene Benutzer.
-Durch die Änderungen kann die Konfiguration fehlerhaft werden.
+        <translation>Dieser Bearbeitungsmodus ist für erfahrene Benutzer gedacht.
+Nach den Änderungen kann die Konfiguration fehlerhaft sein.
 Möchten Sie fortfahren?</translation>
     </message>
     <message>
@@ -548,7 +548,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>Edit arbitrary declaration</source>
-        <translation>Beliebige Deklaration bearbeiten</translation>
+        <translation>Deklaration als Text bearbeiten</translation>
     </message>
     <message>
         <source>Parameter:</source>
@@ -556,7 +556,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>Edit arbitrary parameter</source>
-        <translation>Beliebigen Parameter bearbeiten</translation>
+        <translation>Parameter als Text bearbeiten</translation>
     </message>
     <message>
         <source>Edit shared network</source>
@@ -620,7 +620,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>Edit time</source>
-        <translation>Zeit bearbeiten</translation>
+        <translation>Dauer bearbeiten</translation>
     </message>
     <message>
         <source>Edit MAC address</source>
@@ -648,7 +648,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>Clear the search</source>
-        <translation>Suche leeren</translation>
+        <translation>Suche löschen</translation>
     </message>
     <message>
         <source>Answer of the DHCP server</source>
@@ -656,7 +656,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>%1 more</source>
-        <translation>%1 weiteren</translation>
+        <translation>%1 weitere</translation>
     </message>
     <message>
         <source>%1 and %2</source>
@@ -676,7 +676,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>The quoted texts in lines %1 will be changed.</source>
-        <translation>Die Texte in Anführungszeichen in den Zeilen %1 werden verändert.</translation>
+        <translation>In diesen Zeilen werden Texte in Anführungszeichen verändert: %1.</translation>
     </message>
     <message>
         <source>The statement in line %1 will be changed.</source>
@@ -684,7 +684,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>The statements in lines %1 will be changed.</source>
-        <translation>Die Anweisungen in den Zeilen %1 werden verändert.</translation>
+        <translation>In diesen Zeilen werden Anweisungen verändert: %1.</translation>
     </message>
     <message>
         <source>The carriage return in line %1 will become part of a word.</source>
@@ -692,7 +692,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>The carriage returns in lines %1 will become parts of words.</source>
-        <translation>Die Wagenrücklaufzeichen in den Zeilen %1 werden Teile von Wörtern.</translation>
+        <translation>In diesen Zeilen werden Wagenrücklaufzeichen Teile von Wörtern: %1.</translation>
     </message>
     <message>
         <source>The configuration could not be read, so there is nothing to save.</source>
@@ -807,7 +807,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>Manual</source>
-        <translation>Handbuch</translation>
+        <translation>Handbuchseite</translation>
     </message>
     <message>
         <source>About %1</source>
@@ -993,7 +993,7 @@ Möchten Sie fortfahren?</translation>
         <source>There is an empty cell.
 To add, fill in the cell.</source>
         <translation>Es gibt eine leere Zelle.
-Füllen Sie sie aus, um eine weitere hinzuzufügen.</translation>
+Füllen Sie sie aus, um die Routen zu übernehmen.</translation>
     </message>
 </context>
 <context>

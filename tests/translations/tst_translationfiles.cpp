@@ -157,8 +157,8 @@ void TranslationFilesTest::textsComeOutInGerman_data()
     row("DhcpdConfigStatement", "All network", "Gesamtes Netzwerk");
     row("DhcpdConfigStatement", "Range", "Adressbereich");
     // Next to large numbers in the code, where lupdate can miss them.
-    row("DhcpdConfigStatement", " mounth ", " Monat(e) ");
-    row("DhcpdConfigStatement", " days ", " Tag(e) ");
+    row("DhcpdConfigStatement", " mounth ", " Mon. ");
+    row("DhcpdConfigStatement", " days ", " Tg. ");
     row("DhcpdConfigStatement", " hours ", " Std. ");
     row("DhcpdConfigStatement", " minutes ", " Min. ");
     row("DhcpdConfigStatement", " seconds ", " Sek. ");
