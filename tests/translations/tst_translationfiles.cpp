@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
+#include "tests/translations/languages.h"
+
 #include <QFile>
+#include <QFileInfo>
 #include <QLocale>
 #include <QProcess>
 #include <QRegularExpression>
@@ -14,13 +17,35 @@ struct Message final
 {
     QString context;
     QString source;
-    QString translation;
+    QStringList translations; // several where the text depends on a number
     bool finished{false};
 
-    QString name() const { return context + QLatin1Char{'|'} + source; }
+    QString name() const
+    {
+        return QStringList{context, source, QString::number(translations.size())}.join(QLatin1Char{'|'});
+    }
 };
 
-QString germanFile() { return QStringLiteral(SOURCE_FOLDER "/translations/orv-admin-dhcp_de.ts"); }
+QString sourceFolder() { return QStringLiteral(SOURCE_FOLDER); }
+
+QString fileOf(const QString &language)
+{
+    return sourceFolder() + QStringLiteral("/translations/orv-admin-dhcp_%1.ts").arg(language);
+}
+
+/// What the element "translation", which the reader has just entered, holds: a text, or one for each plural form.
+QStringList readTranslations(QXmlStreamReader *xml)
+{
+    QString text;
+    QStringList forms;
+    while (xml->readNext() != QXmlStreamReader::EndElement && !xml->hasError()) {
+        if (xml->isStartElement())
+            forms.append(xml->readElementText());
+        else
+            text += xml->text();
+    }
+    return forms.isEmpty() ? QStringList{text} : forms;
+}
 
 /// The messages of a .ts file. Fails the test when it cannot be read.
 QVector<Message> messagesOf(const QString &path)
@@ -41,7 +66,7 @@ QVector<Message> messagesOf(const QString &path)
         } else if (xml.name() == QLatin1String{"translation"}) {
             Message &message{messages.last()};
             message.finished = !xml.attributes().hasAttribute(QLatin1String{"type"});
-            message.translation = xml.readElementText();
+            message.translations = readTranslations(&xml);
         }
     }
     if (xml.hasError())
@@ -69,6 +94,24 @@ QStringList matchesOf(const char *pattern, const QString &text)
     return matches;
 }
 
+/// The locales whose users get the translation of a language: all of its script, or those of the country that it names.
+QStringList localesOf(const QString &language)
+{
+    const QLocale locale{language};
+    const auto country = language.contains(QLatin1Char{'_'}) ? locale.country() : QLocale::AnyCountry;
+    QStringList names;
+    for (const QLocale &match : QLocale::matchingLocales(locale.language(), locale.script(), country))
+        names.append(match.name());
+    return names;
+}
+
+void addLanguageRows()
+{
+    QTest::addColumn<QString>("language");
+    for (const QString &language : translatedLanguages())
+        QTest::addRow("%s", qPrintable(language)) << language;
+}
+
 } // namespace
 
 /// The translations as files and as they are compiled into the program.
@@ -77,72 +120,106 @@ class TranslationFilesTest final : public QObject
     Q_OBJECT
 
 private slots:
-    void germanHasTheTextsOfTheProgram();
-    void germanIsCompleteAndAlike_data();
-    void germanIsCompleteAndAlike();
-    void germanIsLoadedFromTheProgram_data();
-    void germanIsLoadedFromTheProgram();
+    void everyFileIsInTheProgram();
+    void hasTheTextsOfTheProgram_data() { addLanguageRows(); }
+    void hasTheTextsOfTheProgram();
+    void isCompleteAndAlike_data();
+    void isCompleteAndAlike();
+    void isLoadedFromTheProgram_data();
+    void isLoadedFromTheProgram();
+    void hasAGlossary_data() { addLanguageRows(); }
+    void hasAGlossary();
     void textsComeOutInGerman_data();
     void textsComeOutInGerman();
     void englishIsFoundAndChangesNothing();
 };
 
-void TranslationFilesTest::germanHasTheTextsOfTheProgram()
+void TranslationFilesTest::everyFileIsInTheProgram()
 {
+    QStringList files{QStringLiteral("orv-admin-dhcp_en.ts")};
+    for (const QString &language : translatedLanguages())
+        files.append(QFileInfo{fileOf(language)}.fileName());
+    files.sort();
+    QCOMPARE(files, QDir{sourceFolder() + QStringLiteral("/translations")}.entryList({QStringLiteral("*.ts")}));
+    QVERIFY(files.contains(QStringLiteral("orv-admin-dhcp_de.ts")));
+}
+
+// A message has as many plural forms as lupdate makes for the language.
+void TranslationFilesTest::hasTheTextsOfTheProgram()
+{
+    QFETCH(QString, language);
     const QTemporaryDir folder;
     const QString fresh{folder.filePath(QStringLiteral("fresh.ts"))};
     QProcess lupdate;
-    lupdate.setWorkingDirectory(QStringLiteral(SOURCE_FOLDER));
-    lupdate.start(QStringLiteral(LUPDATE), {QStringLiteral("-silent"), QStringLiteral("-I"), QStringLiteral("."),
-                                            QStringLiteral("@translations/folders.lst"), QStringLiteral("-ts"), fresh});
+    lupdate.setWorkingDirectory(sourceFolder());
+    lupdate.start(QStringLiteral(LUPDATE),
+                  {QStringLiteral("-silent"), QStringLiteral("-I"), QStringLiteral("."),
+                   QStringLiteral("@translations/folders.lst"), QStringLiteral("-target-language"), language,
+                   QStringLiteral("-ts"), fresh});
     QVERIFY2(lupdate.waitForFinished(-1), qPrintable(lupdate.errorString()));
     QCOMPARE(lupdate.exitCode(), 0);
 
     const QStringList inProgram{namesOf(messagesOf(fresh))};
     QVERIFY(!inProgram.isEmpty());
-    QCOMPARE(namesOf(messagesOf(germanFile())), inProgram);
+    QCOMPARE(namesOf(messagesOf(fileOf(language))), inProgram);
 }
 
-void TranslationFilesTest::germanIsCompleteAndAlike_data()
+void TranslationFilesTest::isCompleteAndAlike_data()
 {
     QTest::addColumn<QString>("source");
-    QTest::addColumn<QString>("translation");
+    QTest::addColumn<QStringList>("translations");
     QTest::addColumn<bool>("finished");
-    for (const Message &message : messagesOf(germanFile())) {
-        QTest::addRow("%s", qPrintable(message.name().simplified()))
-            << message.source << message.translation << message.finished;
+    for (const QString &language : translatedLanguages()) {
+        for (const Message &message : messagesOf(fileOf(language))) {
+            QTest::addRow("%s|%s", qPrintable(language), qPrintable(message.name().simplified()))
+                << message.source << message.translations << message.finished;
+        }
     }
 }
 
-void TranslationFilesTest::germanIsCompleteAndAlike()
+void TranslationFilesTest::isCompleteAndAlike()
 {
     QFETCH(QString, source);
-    QFETCH(QString, translation);
+    QFETCH(const QStringList, translations);
     QFETCH(bool, finished);
 
     QVERIFY(finished);
-    QVERIFY(!translation.isEmpty());
-    for (const char *pattern : {"%[1-9]", "\n", "&(?=\\w)", "^ ", " $", ":$"})
-        QCOMPARE(matchesOf(pattern, translation), matchesOf(pattern, source));
+    for (QString translation : translations) {
+        QVERIFY(!translation.isEmpty());
+        translation.replace(QChar{0xFF1A}, QLatin1Char{':'}); // the wide one of Chinese and Japanese
+        for (const char *pattern : {"%(?:[1-9]|n)", "\n", "&(?=\\p{L})", "^ ", " $", ":$"})
+            QCOMPARE(matchesOf(pattern, translation), matchesOf(pattern, source));
+    }
 }
 
-void TranslationFilesTest::germanIsLoadedFromTheProgram_data()
+void TranslationFilesTest::isLoadedFromTheProgram_data()
 {
+    QTest::addColumn<QString>("language");
     QTest::addColumn<QString>("locale");
-    for (const char *locale : {"de_DE", "de_AT", "de_CH"})
-        QTest::addRow("%s", locale) << QString::fromLatin1(locale);
+    for (const QString &language : translatedLanguages()) {
+        for (const QString &locale : localesOf(language))
+            QTest::addRow("%s for %s", qPrintable(language), qPrintable(locale)) << language << locale;
+    }
 }
 
-void TranslationFilesTest::germanIsLoadedFromTheProgram()
+void TranslationFilesTest::isLoadedFromTheProgram()
 {
+    QFETCH(QString, language);
     QFETCH(QString, locale);
     QTranslator translator;
     QVERIFY(translator.load(QLocale{locale}, QStringLiteral("orv-admin-dhcp"), QStringLiteral("_"),
                             QStringLiteral(":/i18n")));
-    for (const Message &message : messagesOf(germanFile())) {
-        QCOMPARE(translator.translate(message.context.toUtf8().constData(), message.source.toUtf8().constData()),
-                 message.translation);
+    for (const Message &message : messagesOf(fileOf(language))) {
+        const QString text{
+            translator.translate(message.context.toUtf8().constData(), message.source.toUtf8().constData())};
+        QVERIFY2(message.translations.contains(text), qPrintable(message.name()));
     }
+}
+
+void TranslationFilesTest::hasAGlossary()
+{
+    QFETCH(QString, language);
+    QVERIFY(QFile::exists(sourceFolder() + QStringLiteral("/translations/glossary-%1.md").arg(language)));
 }
 
 void TranslationFilesTest::textsComeOutInGerman_data()
