@@ -3,6 +3,7 @@
 
 #include <QFile>
 #include <QHash>
+#include <QLocale>
 #include <QRegularExpression>
 
 namespace {
@@ -13,6 +14,20 @@ QString plainText(QString line)
     static const QRegularExpression escape{QStringLiteral(R"(\\(-|&|f[BIR]|\(bu))")};
     line.replace(QLatin1String{"\\-"}, QLatin1String{"-"});
     return line.remove(escape).remove(QLatin1Char{'"'}).toHtmlEscaped();
+}
+
+// The page in the first of the user's languages that there is one in, as QTranslator finds a translation.
+QString pagePath()
+{
+    const QString folder{QStringLiteral(":/man/")};
+    for (QString language : QLocale{}.uiLanguages()) {
+        language.replace(QLatin1Char{'-'}, QLatin1Char{'_'});
+        for (; !language.isEmpty(); language.truncate(language.lastIndexOf(QLatin1Char{'_'}))) {
+            if (QFile::exists(folder + language))
+                return folder + language;
+        }
+    }
+    return folder + QLatin1String{"en"};
 }
 
 } // namespace
@@ -26,7 +41,7 @@ QString manualPageHtml()
         {QStringLiteral(".B"), QStringLiteral("<b>%1</b> ")},   {QStringLiteral(".I"), QStringLiteral("<i>%1</i> ")},
         {QStringLiteral(".PP"), QStringLiteral("<p>%1")},       {QStringLiteral(".TP"), QStringLiteral("<p>%1")},
     };
-    QFile page{QStringLiteral(":/orv-admin-dhcp.8")};
+    QFile page{pagePath()};
     if (!page.open(QIODevice::ReadOnly))
         return {};
     QString html;

@@ -3,5 +3,6 @@
 
 #include <QString>
 
-/// The bundled manual page as HTML; `orvInit` makes it known.
+/// The bundled manual page in the language of the default locale, or else in English, as HTML; `orvInit` makes it
+/// known.
 QString manualPageHtml();

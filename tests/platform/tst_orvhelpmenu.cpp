@@ -6,6 +6,7 @@
 
 #include <QAction>
 #include <QDialogButtonBox>
+#include <QDir>
 #include <QMainWindow>
 #include <QMenuBar>
 #include <QPushButton>
@@ -13,6 +14,25 @@
 #include <QTextBrowser>
 
 #include <memory>
+
+namespace {
+
+/// The macros of a bundled manual page, one for each heading, paragraph, tag and emphasis.
+QStringList macrosOf(const QString &language)
+{
+    QFile page{QStringLiteral(":/man/") + language};
+    if (!page.open(QIODevice::ReadOnly))
+        return {};
+    QStringList macros;
+    while (!page.atEnd()) {
+        const QString line{QString::fromUtf8(page.readLine()).trimmed()};
+        if (line.startsWith(QLatin1Char{'.'}))
+            macros.append(line.section(QLatin1Char{' '}, 0, 0));
+    }
+    return macros;
+}
+
+} // namespace
 
 class OrvHelpMenuTest final : public QObject
 {
@@ -27,6 +47,10 @@ private slots:
     void aboutTellsNameVersionDescriptionAndLicence();
     void aboutQtIsShown();
     void manualIsThePage();
+    void manualIsInTheLanguageOfTheLocale_data();
+    void manualIsInTheLanguageOfTheLocale();
+    void everyPageHasAllOfTheEnglishOne_data();
+    void everyPageHasAllOfTheEnglishOne();
     void manualIsOpenedOnce();
 
 private:
@@ -112,6 +136,58 @@ void OrvHelpMenuTest::manualIsThePage()
 
     QTest::mouseClick(manual->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close), Qt::LeftButton);
     QTRY_VERIFY(dialogs().isEmpty());
+}
+
+void OrvHelpMenuTest::manualIsInTheLanguageOfTheLocale_data()
+{
+    QTest::addColumn<QString>("beginning");
+    for (const char *locale : {"C", "en_GB", "pl_PL", "pt_BR"})
+        QTest::addRow("%s", locale) << QStringLiteral("NAME orv-admin-dhcp - configure the ISC DHCP server SYNOPSIS ");
+    for (const char *locale : {"de_DE", "de_AT"}) {
+        QTest::addRow("%s", locale) << QStringLiteral(
+            "BEZEICHNUNG orv-admin-dhcp - den ISC-DHCP-Server konfigurieren ÜBERSICHT ");
+    }
+    for (const char *locale : {"es_ES", "es_MX"}) {
+        QTest::addRow("%s", locale) << QStringLiteral(
+            "NOMBRE orv-admin-dhcp - configurar el servidor DHCP de ISC SINOPSIS ");
+    }
+    for (const char *locale : {"fr_FR", "fr_CA"}) {
+        QTest::addRow("%s", locale) << QStringLiteral(
+            "NOM orv-admin-dhcp - configurer le serveur DHCP de l’ISC SYNOPSIS ");
+    }
+}
+
+void OrvHelpMenuTest::manualIsInTheLanguageOfTheLocale()
+{
+    QFETCH(QString, beginning);
+    const QLocale before;
+    QLocale::setDefault(QLocale{QString::fromLatin1(QTest::currentDataTag())});
+    entry(QStringLiteral("Manual"))->trigger();
+    QLocale::setDefault(before);
+    const QString text{dialogs().constFirst()->findChild<QTextBrowser *>()->toPlainText().simplified()};
+    QVERIFY2(text.startsWith(beginning), qPrintable(text.left(beginning.size())));
+    QVERIFY(text.endsWith(QLatin1String{"systemctl (1)"}));
+    QVERIFY2(!text.contains(QLatin1Char{'\\'}), "an escape was left");
+    QVERIFY2(!text.contains(QLatin1String{" ."}), "a macro was left");
+}
+
+void OrvHelpMenuTest::everyPageHasAllOfTheEnglishOne_data()
+{
+    QTest::addColumn<QString>("page");
+    for (const QString &page : QDir{QStringLiteral(":/man")}.entryList())
+        QTest::addRow("%s", qPrintable(page)) << page;
+}
+
+void OrvHelpMenuTest::everyPageHasAllOfTheEnglishOne()
+{
+    QFETCH(QString, page);
+    QStringList missing{macrosOf(QStringLiteral("en"))};
+    QVERIFY(!missing.isEmpty());
+    for (const QString &macro : macrosOf(page)) {
+        if (!missing.isEmpty() && macro == missing.constFirst())
+            missing.removeFirst();
+    }
+    QCOMPARE(missing, QStringList{});
 }
 
 void OrvHelpMenuTest::manualIsOpenedOnce()
