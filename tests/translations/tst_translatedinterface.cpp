@@ -234,6 +234,8 @@ QStringList buttonTexts()
 
 } // namespace
 
+Q_DECLARE_METATYPE(const DialogRow *)
+
 /// The window, its dialogs and Qt's boxes, as somebody with a desktop in another language sees them.
 class TranslatedInterfaceTest final : public QObject
 {
@@ -394,8 +396,6 @@ void TranslatedInterfaceTest::everyTextOfTheWindowHasRoom()
         menu->close();
     }
 }
-
-Q_DECLARE_METATYPE(const DialogRow *)
 
 QTEST_MAIN(TranslatedInterfaceTest)
 #include "tst_translatedinterface.moc"
