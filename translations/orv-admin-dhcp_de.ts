@@ -712,7 +712,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>the name server is not its primary one</source>
-        <translation>der Nameserver ist nicht ihr primärer</translation>
+        <translation>der Nameserver ist nicht ihr primärer Server</translation>
     </message>
     <message>
         <source>no key may update it</source>
@@ -732,7 +732,7 @@ Möchten Sie fortfahren?</translation>
     </message>
     <message>
         <source>its key &apos;%1&apos; stands behind this place in the configuration</source>
-        <translation>ihr Schlüssel „%1“ steht in der Konfiguration hinter dieser Stelle</translation>
+        <translation>ihr Schlüssel „%1“ steht in der Konfiguration erst nach dieser Stelle</translation>
     </message>
 </context>
 <context>
