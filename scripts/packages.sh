@@ -8,7 +8,7 @@ declare -A packages=(
     [run]="breeze-icon-theme dbus-daemon fonts-dejavu-core iproute2 libqt5svg5 mount procps qttranslations5-l10n socat \
 util-linux xauth"
     [wayland]="qtwayland5"
-    [screenshot]="maim xauth xdotool xvfb"
+    [screenshot]="fonts-wqy-microhei maim xauth xdotool xvfb"
     [test]="at-spi2-core debootstrap dpkg python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
     [fuzz]="clang libclang-rt-dev"
