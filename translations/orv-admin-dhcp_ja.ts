@@ -489,7 +489,7 @@
     <message>
         <source>The configuration has been changed.
 Do you want to overwrite the configuration?</source>
-        <translation>ファイルの設定がこのプログラム以外で変更されました。
+        <translation>ファイルの設定がこのプログラムの外で変更されました。
 設定を上書きしますか?</translation>
     </message>
     <message>

@@ -510,7 +510,7 @@ Do you want to save changes?</source>
     </message>
     <message>
         <source>Answer of the DHCP server</source>
-        <translation>DHCP 服务器的回应</translation>
+        <translation>DHCP 服务器的响应</translation>
     </message>
     <message>
         <source>The comment of the file will not be kept.</source>
@@ -572,7 +572,7 @@ Do you want to save changes?</source>
         <source>The IP address is reserved.
 Go to topology?</source>
         <translation>IP 地址已保留。
-要转到拓扑吗？</translation>
+要转到“拓扑”吗？</translation>
     </message>
     <message>
         <source>Add fixed address</source>
@@ -616,7 +616,7 @@ Go to topology?</source>
     </message>
     <message>
         <source>its key &apos;%1&apos; is not known</source>
-        <translation>它的密钥“%1”未知</translation>
+        <translation>找不到它的密钥“%1”</translation>
     </message>
     <message>
         <source>the DHCP server does not accept its key &apos;%1&apos;</source>
@@ -624,7 +624,7 @@ Go to topology?</source>
     </message>
     <message>
         <source>its key &apos;%1&apos; stands behind this place in the configuration</source>
-        <translation>它的密钥“%1”在配置中位于此处之后</translation>
+        <translation>它的密钥“%1”在配置中定义于此处之后</translation>
     </message>
     <message>
         <source>Value</source>
