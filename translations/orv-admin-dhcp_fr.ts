@@ -162,6 +162,10 @@
         <source>Error adding domain name. Can not add to &apos;%1&apos;</source>
         <translation>Erreur d’ajout du nom de domaine. Impossible d’ajouter un nom de domaine à «&#xa0;%1&#xa0;»</translation>
     </message>
+    <message>
+        <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>

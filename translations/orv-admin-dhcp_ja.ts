@@ -162,6 +162,10 @@
         <source>Error adding domain name. Can not add to &apos;%1&apos;</source>
         <translation>ドメイン名を追加できませんでした。「%1」にドメイン名は追加できません。</translation>
     </message>
+    <message>
+        <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>

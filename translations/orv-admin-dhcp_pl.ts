@@ -162,6 +162,10 @@
         <source>Error adding domain name. Can not add to &apos;%1&apos;</source>
         <translation>Nie udało się dodać nazwy domeny. Do „%1” nie można dodać nazwy domeny.</translation>
     </message>
+    <message>
+        <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>

@@ -162,6 +162,10 @@
         <source>Error adding domain name. Can not add to &apos;%1&apos;</source>
         <translation>添加域名失败。无法向“%1”添加域名。</translation>
     </message>
+    <message>
+        <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
+        <translation type="unfinished"></translation>
+    </message>
 </context>
 <context>
     <name>DhcpdConfigStatement</name>
