@@ -9,6 +9,8 @@ import dataclasses
 import difflib
 import typing
 
+import pyatspi
+
 import desktop
 import machine
 from testcase import ProgramTest
@@ -82,11 +84,11 @@ def with_block(lines, block, others):
 def shown_in(dialog):
     """What stands in the fields of a dialog, by their names."""
     read = {
-        "text": lambda field: field.text,
-        "spin button": lambda field: field.text,
-        "check box": lambda box: box.states & {"checked", "enabled"},
-        "list": lambda view: [item.name for item in view.children],
-        "table": lambda table: table.labels(),
+        pyatspi.ROLE_TEXT: lambda field: field.text,
+        pyatspi.ROLE_SPIN_BUTTON: lambda field: field.text,
+        pyatspi.ROLE_CHECK_BOX: lambda box: box.states & {"checked", "enabled"},
+        pyatspi.ROLE_LIST: lambda view: [item.name for item in view.children],
+        pyatspi.ROLE_TABLE: lambda table: table.labels(),
     }
     return {control.name: read[control.role](control) for control in dialog.below() if control.role in read}
 
@@ -115,7 +117,7 @@ def addresses(*texts):
     """Adds addresses to a list."""
 
     def fill(dialog):
-        (view,) = dialog.all("list")
+        (view,) = dialog.all(pyatspi.ROLE_LIST)
         for text in texts:
             number = len(view.children)
             dialog.button("Add").click()
@@ -129,11 +131,11 @@ def addresses(*texts):
 
 
 def without_first(role):
-    """Takes the first address out of a "list", or the first route out of a "table"."""
+    """Takes the first address out of a list, or the first route out of a table."""
 
     def fill(dialog):
         (view,) = dialog.all(role)
-        entries = view.cells if role == "table" else lambda: view.children
+        entries = view.cells if role == pyatspi.ROLE_TABLE else lambda: view.children
         number = len(entries())
         entries()[0].click()
         dialog.button("Remove").click()
@@ -146,7 +148,7 @@ def routes(*rows, ms=False):
     """Adds routes to a table, each the texts of its cells."""
 
     def fill(dialog):
-        table = dialog.find("table", "Static routes")
+        table = dialog.find(pyatspi.ROLE_TABLE, "Static routes")
         for cells in rows:
             row = len(table.rows)
             dialog.button("Add").click()
@@ -154,7 +156,7 @@ def routes(*rows, ms=False):
             for column, text in enumerate(cells):
                 cell(row, column, text)(dialog)
         if ms:
-            dialog.find("check box", "Route for MS systems").click()
+            dialog.find(pyatspi.ROLE_CHECK_BOX, "Route for MS systems").click()
 
     return fill
 
@@ -163,7 +165,7 @@ def cell(row, column, text):
     """Types into a cell of a table."""
 
     def fill(dialog):
-        table = dialog.find("table", "Static routes")
+        table = dialog.find(pyatspi.ROLE_TABLE, "Static routes")
         table.rows[row].cells[column].double_click()
         dialog.program.keys("ctrl+a")
         dialog.program.type(text)
@@ -177,8 +179,8 @@ def file(folder, name):
     """Chooses a file in the folder that a file dialog shows at first."""
 
     def fill(dialog):
-        dialog.find("combo box", folder)
-        files = dialog.find("tree", "Files")
+        dialog.find(pyatspi.ROLE_COMBO_BOX, folder)
+        files = dialog.find(pyatspi.ROLE_TREE, "Files")
 
         def found():
             return [cell for cell in files.cells() if cell.name == name]
@@ -274,7 +276,7 @@ class CommandTest(ProgramTest):
         for entry in menu.children:
             if any(child.role == desktop.MENU for child in entry.children):
                 found |= {(entry.name, *way) for way in self.offered(menu.submenu(entry.name))}
-            elif entry.role != "separator":
+            elif entry.role != pyatspi.ROLE_SEPARATOR:
                 found.add((entry.name,))
         self.program.keys("Escape")
         self.wait(lambda: not menu.is_showing, f"{menu} closed")

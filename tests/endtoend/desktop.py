@@ -29,9 +29,10 @@ POLL = 0.02  # seconds between two looks
 DOUBLE_CLICK = 0.5  # seconds within which a second click at the same place would be one
 
 # The roles of menus, of what is typed into, and of what is never searched for controls since it may have a million.
-MENU = "popup menu"
-FIELDS = ("text", "spin button")
-VIEWS = ("tree", "table")
+# Roles are compared as numbers everywhere: what they are called depends on the version of the accessibility libraries.
+MENU = pyatspi.ROLE_POPUP_MENU
+FIELDS = (pyatspi.ROLE_TEXT, pyatspi.ROLE_SPIN_BUTTON)
+VIEWS = (pyatspi.ROLE_TREE, pyatspi.ROLE_TABLE)
 
 # What is raised by looking at something that has just gone, or is not there yet. What has gone has no interfaces.
 GONE = (GLib.Error, LookupError, NotImplementedError, subprocess.CalledProcessError, Xlib.error.XError)
@@ -149,13 +150,13 @@ class Control:
         self.accessible = accessible
 
     def __repr__(self):
-        return f"{self.role} {self.name!r}"
+        return f"{self.role.value_nick} {self.name!r}"
 
     # --- Reading
 
     @functools.cached_property
     def role(self):
-        return self.accessible.getRoleName()
+        return self.accessible.getRole()
 
     @property
     def name(self):
@@ -213,13 +214,13 @@ class Control:
     def window(self):
         """The window or menu that it is in."""
         control, parent = self, self.parent
-        while control.role != MENU and parent.role != "application":
+        while control.role != MENU and parent.role != pyatspi.ROLE_APPLICATION:
             control, parent = parent, parent.parent
         return control
 
     def wrap(self, accessible):
-        role = accessible.getRoleName()
-        control = {"tree": Tree, "table": Table, "spin button": SpinBox}.get(role, Control)(self.program, accessible)
+        role = accessible.getRole()
+        control = CLASSES.get(role, Control)(self.program, accessible)
         control.role = role
         return control
 
@@ -340,7 +341,7 @@ class Window(Control):
         display.ask_to_close(self.program.wait(lambda: display.window_at(self.box), lambda: f"{self} on the display"))
 
     def button(self, name):
-        return self.find("push button", name)
+        return self.find(pyatspi.ROLE_PUSH_BUTTON, name)
 
     def field(self, name):
         """The field for a text or number with the name."""
@@ -354,7 +355,7 @@ class Window(Control):
     def choose(self, *entries):
         """Walks through the menu bar with the mouse: choose("File", "Save")."""
         first, *others = entries
-        self.find("menu item", first).open_menu().choose(*others)
+        self.find(pyatspi.ROLE_MENU_ITEM, first).open_menu().choose(*others)
 
 
 class MessageBox(Window):
@@ -362,7 +363,7 @@ class MessageBox(Window):
 
     @property
     def labels(self):
-        return [label.name for label in self.all("label")]
+        return [label.name for label in self.all(pyatspi.ROLE_LABEL)]
 
     @property
     def text(self):
@@ -375,12 +376,12 @@ class MessageBox(Window):
 
     @property
     def buttons(self):
-        return [button.name for button in self.all("push button")]
+        return [button.name for button in self.all(pyatspi.ROLE_PUSH_BUTTON)]
 
     @property
     def default_button(self):
         """The name of the button that Return presses; None when there is none."""
-        defaults = [button.name for button in self.all("push button") if button.has("is-default")]
+        defaults = [button.name for button in self.all(pyatspi.ROLE_PUSH_BUTTON) if button.has("is-default")]
         return defaults[0] if defaults else None
 
     def answer(self, button):
@@ -394,7 +395,7 @@ class Menu(Control):
     @property
     def entries(self):
         """The names of the entries from top to bottom; None stands for a line."""
-        return [None if entry.role == "separator" else entry.name for entry in self.children]
+        return [None if entry.role == pyatspi.ROLE_SEPARATOR else entry.name for entry in self.children]
 
     def entry(self, name):
         """The entry of the name. Waits for it."""
@@ -492,15 +493,15 @@ class View(Control):
 
     @property
     def headers(self):
-        return [child.name for child in self.children if child.role == "table column header"]
+        return [child.name for child in self.children if child.role == pyatspi.ROLE_TABLE_COLUMN_HEADER]
 
     def cells(self):
-        return [child for child in self.children if child.role == "table cell"]
+        return [child for child in self.children if child.role == pyatspi.ROLE_TABLE_CELL]
 
     def cell_rows(self):
         children = self.children
-        cells = [child for child in children if child.role == "table cell"]
-        columns = [child.role for child in children].count("table column header")
+        cells = [child for child in children if child.role == pyatspi.ROLE_TABLE_CELL]
+        columns = [child.role for child in children].count(pyatspi.ROLE_TABLE_COLUMN_HEADER)
         return [cells[i : i + columns] for i in range(0, len(cells), columns)]
 
     @property
@@ -568,6 +569,10 @@ class Tree(View):
             if tuple(way) == labels:
                 found.append(row)
         return found
+
+
+# The controls of some roles.
+CLASSES = {pyatspi.ROLE_TREE: Tree, pyatspi.ROLE_TABLE: Table, pyatspi.ROLE_SPIN_BUTTON: SpinBox}
 
 
 class Program:
@@ -667,7 +672,7 @@ class Program:
     def note_menu(self, event):
         source = event.source
         with contextlib.suppress(*GONE):
-            if event.detail1 and source and source.getRoleName() == MENU:
+            if event.detail1 and source and source.getRole() == MENU:
                 self.menus = [menu for menu in self.menus if menu.path != source.path] + [source]
 
     def accessible(self):
@@ -684,8 +689,8 @@ class Program:
         if not application:
             return []
         found = (application.getChildAtIndex(i) for i in range(application.childCount))
-        kinds = {"alert": MessageBox}
-        windows = [kinds.get(child.getRoleName(), Window)(self, child) for child in found if child]
+        kinds = {pyatspi.ROLE_ALERT: MessageBox}
+        windows = [kinds.get(child.getRole(), Window)(self, child) for child in found if child]
         return [window for window in windows if window.is_showing]
 
     def unknown(self):

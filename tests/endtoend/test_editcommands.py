@@ -6,6 +6,8 @@ Every kind of dialog is run once. That the other statements are treated the same
 
 import dataclasses
 
+import pyatspi
+
 from commandtest import (
     CHANGES,
     CommandTest,
@@ -186,7 +188,7 @@ shared-network "big lab" {
         Dialog(
             "Edit gateways",
             {"Gateways:": ["10.1.0.1", "10.1.0.2"]},
-            steps(without_first("list"), addresses("10.1.0.9")),
+            steps(without_first(pyatspi.ROLE_LIST), addresses("10.1.0.9")),
         ),
         Lines("Gateways: 10.1.0.2, 10.1.0.9", "option routers 10.1.0.2, 10.1.0.9;"),
     ),
@@ -205,7 +207,7 @@ shared-network "big lab" {
         routes_edited(
             ["255.255.255.0: 192.168.1.0: 10.1.0.1", "255.255.0.0: 172.17.0.0: 10.1.0.1"],
             False,
-            steps(without_first("table"), cell(0, 2, "10.1.0.9")),
+            steps(without_first(pyatspi.ROLE_TABLE), cell(0, 2, "10.1.0.9")),
         ),
         Lines("Static route: 16, 172,17, 10,1,0,9", "option classless-static-routes 16, 172,17, 10,1,0,9;"),
     ),

@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """Choosing the interfaces that the server serves."""
 
+import pyatspi
+
 import machine
 from testcase import ProgramTest
 
@@ -38,12 +40,12 @@ class InterfacesTest(ProgramTest):
 
     def offered(self, dialog):
         """Each interface that can be chosen, and whether it is."""
-        boxes = dialog.find("panel", "Available interfaces").all("check box")
+        boxes = dialog.find(pyatspi.ROLE_PANEL, "Available interfaces").all(pyatspi.ROLE_CHECK_BOX)
         return {box.name: box.is_checked for box in boxes}
 
     def toggle(self, dialog, *names):
         for name in names:
-            box = dialog.find("check box", name)
+            box = dialog.find(pyatspi.ROLE_CHECK_BOX, name)
             checked = box.is_checked
             box.click()
             self.wait(lambda: box.is_checked != checked, f"another state of {box}")

@@ -5,6 +5,8 @@ import datetime
 import ipaddress
 import re
 
+import pyatspi
+
 import machine
 from testcase import ProgramTest
 
@@ -66,9 +68,9 @@ def is_red(red, green, blue):
 
 class LeasesTest(ProgramTest):
     def show_leases(self):
-        self.main.find("page tab", "Leases").click()
-        self.table = self.main.find("table", "Leases")
-        self.search = self.main.find("text", "Search")
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
+        self.table = self.main.find(pyatspi.ROLE_TABLE, "Leases")
+        self.search = self.main.find(pyatspi.ROLE_TEXT, "Search")
         self.previous = self.main.button("Previous match")
         self.next = self.main.button("Next match")
 
@@ -152,7 +154,7 @@ class LeaseFile(LeasesTest):
             "F5": lambda: self.main.press("F5"),
             "menu": lambda: self.main.choose("File", "Reload"),
             "tool bar": lambda: self.main.button("Reload").click(),
-            "tab": lambda: (self.main.find("page tab", "Topology").click(), self.show_leases()),
+            "tab": lambda: (self.main.find(pyatspi.ROLE_PAGE_TAB, "Topology").click(), self.show_leases()),
         }
         for name, command in commands.items():
             with self.case(command=name):
@@ -222,7 +224,7 @@ class LeaseFile(LeasesTest):
             self.program.keys("ctrl+a", "BackSpace")
 
         def by_the_button():
-            self.search.find("push button", "Clear the search").click()
+            self.search.find(pyatspi.ROLE_PUSH_BUTTON, "Clear the search").click()
 
         for clear in (by_keys, by_the_button):
             for text in ("door", "nothing"):

@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """Reserving the address of a lease."""
 
+import pyatspi
+
 import machine
 from testcase import CANCELLATIONS, ProgramTest
 
@@ -24,11 +26,11 @@ class ReservationTest(ProgramTest):
         """The program on its tab of leases, with that of one client."""
         self.desk = self.client(MAC, "lan0", self.HOST_NAME)
         super().start()
-        self.main.find("page tab", "Leases").click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
         self.address = self.wait_for_address(self.desk)
 
     def row(self, client):
-        return self.main.find("table", "Leases").row(client.mac)
+        return self.main.find(pyatspi.ROLE_TABLE, "Leases").row(client.mac)
 
     def dialog(self):
         """The dialog that has opened for a lease."""
@@ -62,7 +64,7 @@ class ReservationTest(ProgramTest):
 
     def assert_nothing_reserved(self):
         self.assertFalse(self.main.button("Save").is_enabled)
-        self.main.find("page tab", "Topology").click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Topology").click()
         self.assertEqual([line for line in self.tree.lines() if MAC in line], [])
 
 
@@ -97,7 +99,7 @@ class Reservation(ReservationTest):
         self.assertEqual(self.wait_for_address(self.desk), self.address)
         granted = f"DHCPACK on {self.address} to {MAC}"
         self.wait(lambda: granted in machine.server_log(), f"the restarted server's {granted}")
-        self.main.find("page tab", "Topology").click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Topology").click()
         self.assert_in_tree("desk", MAC, self.address)
 
     def test_is_of_the_chosen_row(self):
@@ -139,7 +141,7 @@ class Reservation(ReservationTest):
     def test_goes_with_the_lease_that_the_menu_was_opened_for(self):
         menu = self.row(self.desk).context_menu()
         machine.LEASES.unlink()  # while the menu is open
-        self.wait(lambda: not self.main.find("table", "Leases").rows, "a table without leases")
+        self.wait(lambda: not self.main.find(pyatspi.ROLE_TABLE, "Leases").rows, "a table without leases")
         menu.choose(COMMAND)
         dialog = self.dialog()
         self.assertEqual(self.fields(dialog), ["desk", MAC, self.address])

@@ -5,6 +5,8 @@ import contextlib
 import os
 import stat
 
+import pyatspi
+
 import machine
 from testcase import CANCELLATIONS, SAVE_QUESTION, ProgramTest, told_comments
 
@@ -84,7 +86,7 @@ class SavingTest(ProgramTest):
 
 class Saving(SavingTest):
     def test_is_offered_while_something_is_unsaved(self):
-        file_menu = self.main.find("menu item", "File").open_menu()
+        file_menu = self.main.find(pyatspi.ROLE_MENU_ITEM, "File").open_menu()
         self.assertFalse(file_menu.entry("Save").is_enabled)
         self.main.press("Escape")
         self.assertFalse(self.is_offered)
@@ -198,7 +200,7 @@ class SavingWhatTheServerRefuses(SavingTest):
         self.assertEqual(box.buttons, ["Save", "Cancel", "Show Details..."])
         self.assertEqual(box.default_button, "Save")
         box.button("Show Details...").click()
-        details = box.find("text", "Answer of the DHCP server").text
+        details = box.find(pyatspi.ROLE_TEXT, "Answer of the DHCP server").text
         self.assertIn(COMPLAINT, details)
         self.assertIn("colour green", details)
         self.assertIn("exiting", details)

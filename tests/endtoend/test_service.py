@@ -6,6 +6,8 @@ import fcntl
 import os
 import signal
 
+import pyatspi
+
 import machine
 from testcase import ProgramTest
 
@@ -45,9 +47,9 @@ class ServiceTest(ProgramTest):
 
     def assert_offers(self, *commands):
         """The commands on the server are these, in the tool bar and in the menu."""
-        buttons = [button.name for button in self.main.find("tool bar").all("push button")]
+        buttons = [button.name for button in self.main.find(pyatspi.ROLE_TOOL_BAR).all(pyatspi.ROLE_PUSH_BUTTON)]
         self.assertEqual(buttons[:2], list(commands))
-        menu = self.main.find("menu item", "Server").open_menu()
+        menu = self.main.find(pyatspi.ROLE_MENU_ITEM, "Server").open_menu()
         self.assertEqual(menu.entries, [*commands, None, "Select interfaces"])
         self.main.press("Escape", "Escape")
 

@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """The start by the superuser: what the window shows, and what it keeps to itself."""
 
+import pyatspi
+
 import desktop
 import machine
 from testcase import ProgramTest
@@ -79,10 +81,12 @@ class Start(ProgramTest):
 
     def test_shows_the_window(self):
         self.assertEqual([window.title for window in self.program.windows()], [desktop.MAIN_TITLE])
-        self.assertEqual([tab.name for tab in self.main.all("page tab")], ["Topology", "Leases"])
-        self.assertEqual([entry.name for entry in self.main.find("menu bar").children], ["File", "Server", "Help"])
+        self.assertEqual([tab.name for tab in self.main.all(pyatspi.ROLE_PAGE_TAB)], ["Topology", "Leases"])
         self.assertEqual(
-            [button.name for button in self.main.find("tool bar").all("push button")],
+            [entry.name for entry in self.main.find(pyatspi.ROLE_MENU_BAR).children], ["File", "Server", "Help"]
+        )
+        self.assertEqual(
+            [button.name for button in self.main.find(pyatspi.ROLE_TOOL_BAR).all(pyatspi.ROLE_PUSH_BUTTON)],
             [
                 "Start DHCP-server",
                 "Restart DHCP-server",
@@ -101,7 +105,7 @@ class Start(ProgramTest):
             "Server": ["Start DHCP-server", "Restart DHCP-server", None, "Select interfaces"],
             "Help": ["Manual", None, "About orv-admin-dhcp", "About Qt"],
         }.items():
-            self.assertEqual(self.main.find("menu item", name).open_menu().entries, entries)
+            self.assertEqual(self.main.find(pyatspi.ROLE_MENU_ITEM, name).open_menu().entries, entries)
             self.main.press("Escape")
 
     def test_gives_the_window_its_last_size(self):
@@ -118,7 +122,7 @@ class Start(ProgramTest):
 class SecondStart(ProgramTest):
     def test_brings_the_first_window_back_and_ends(self):
         display = self.program.display
-        self.main.find("status bar").reach()
+        self.main.find(pyatspi.ROLE_STATUS_BAR).reach()
         display.cover(self.main.box)
         self.assertNotEqual(display.box_below_mouse(), self.main.box)
         self.assertFalse(display.has_keyboard(display.window_at(self.main.box)))

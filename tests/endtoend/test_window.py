@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """The window's own commands: reading the configuration again, the tabs, the tool bar, the help."""
 
+import pyatspi
+
 import machine
 from testcase import ProgramTest
 
@@ -84,9 +86,9 @@ class ToolBar(ProgramTest):
 
     def test_offers_to_add_on_the_tab_of_the_topology_only(self):
         self.wait_for(*ADDING)
-        self.main.find("page tab", "Leases").click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
         self.wait_for()
-        self.main.find("page tab", "Topology").click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Topology").click()
         self.wait_for(*ADDING)
 
 
@@ -94,11 +96,11 @@ class Help(ProgramTest):
     def test_shows_the_manual(self):
         self.main.choose("Help", "Manual")
         manual = self.program.window("Manual")
-        text = manual.find("label", "Manual").text
+        text = manual.find(pyatspi.ROLE_LABEL, "Manual").text
         self.assertTrue(text.startswith("NAME\norv-admin-dhcp - configure the ISC DHCP server"), text)
         self.assertIn("/etc/dhcp/dhcpd.conf", text)
-        self.main.find("page tab", "Leases").click()  # the window can be used meanwhile
-        self.main.find("table", "Leases")
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()  # the window can be used meanwhile
+        self.main.find(pyatspi.ROLE_TABLE, "Leases")
         manual.button("Close").click()
         manual.wait_closed()
 
@@ -122,7 +124,16 @@ class Help(ProgramTest):
 class Names(ProgramTest):
     """Whatever can be used has a name that a screen reader can say."""
 
-    USABLE = {"check box", "menu item", "page tab", "push button", "spin button", "table", "text", "tree"}
+    USABLE = {
+        pyatspi.ROLE_CHECK_BOX,
+        pyatspi.ROLE_MENU_ITEM,
+        pyatspi.ROLE_PAGE_TAB,
+        pyatspi.ROLE_PUSH_BUTTON,
+        pyatspi.ROLE_SPIN_BUTTON,
+        pyatspi.ROLE_TABLE,
+        pyatspi.ROLE_TEXT,
+        pyatspi.ROLE_TREE,
+    }
 
     def assert_named(self, window, *, least):
         usable = [control for control in window.below() if control.role in self.USABLE]
@@ -131,9 +142,9 @@ class Names(ProgramTest):
 
     def test_are_in_the_window(self):
         self.assert_named(self.main, least=13)
-        self.main.find("page tab", "Leases").click()
-        self.main.find("text", "Search").enter("text")  # shows the button that clears it
-        self.main.find("push button", "Clear the search")
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
+        self.main.find(pyatspi.ROLE_TEXT, "Search").enter("text")  # shows the button that clears it
+        self.main.find(pyatspi.ROLE_PUSH_BUTTON, "Clear the search")
         self.assert_named(self.main, least=18)
 
     def test_are_in_its_dialogs(self):

@@ -5,6 +5,8 @@ import contextlib
 import functools
 import unittest
 
+import pyatspi
+
 import desktop
 import machine
 
@@ -66,7 +68,7 @@ class DesktopTest(unittest.TestCase):
     def message(self, title, text, *, informative_text="", buttons=("OK",), default="OK"):
         """A message box that has opened, which must be as described."""
         box = self.program.window(title)
-        self.assertEqual(box.role, "alert")
+        self.assertEqual(box.role, pyatspi.ROLE_ALERT)
         self.assertEqual(box.text, text)
         self.assertEqual(box.informative_text, informative_text)
         self.assertEqual(box.buttons, list(buttons))
@@ -102,7 +104,7 @@ class ProgramTest(DesktopTest):
 
     @property
     def tree(self):
-        return self.main.find("tree", "Topology")
+        return self.main.find(pyatspi.ROLE_TREE, "Topology")
 
     def reload_question(self):
         question = "Do you want to reload configuration from file?"
@@ -129,7 +131,7 @@ class ProgramTest(DesktopTest):
     @property
     def server_state(self):
         """What the status bar says of the server."""
-        return self.main.find("status bar").find("label").name
+        return self.main.find(pyatspi.ROLE_STATUS_BAR).find(pyatspi.ROLE_LABEL).name
 
     def wait_for_server(self, state):
         self.wait(lambda: self.server_state == f"DHCP-server is {state}", f"a server that is {state}")
