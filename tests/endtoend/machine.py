@@ -31,6 +31,15 @@ def run(*command):
     )
 
 
+def process_name(pid):
+    """The name of a process's program; None when it has ended, even if nobody has asked for its exit status yet."""
+    try:
+        before, _, state = pathlib.Path(f"/proc/{pid}/stat").read_text().rpartition(") ")
+    except (FileNotFoundError, ProcessLookupError):
+        return None
+    return None if state[0] in "ZX" else before.partition(" (")[2]
+
+
 def reset():
     """Makes the machine as it was when the private network began: the site's files, a stopped server, no settings."""
     systemctl("stop")

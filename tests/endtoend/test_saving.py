@@ -3,10 +3,14 @@
 
 import contextlib
 import os
+import pathlib
+import signal
 import stat
+import tempfile
 
 import pyatspi
 
+import desktop
 import machine
 from testcase import CANCELLATIONS, SAVE_QUESTION, ProgramTest, told_comments
 
@@ -214,6 +218,54 @@ class SavingWhatTheServerRefuses(SavingTest):
         self.program.window("Information").answer("Save")
         self.wait_for_save()
         self.assertEqual(machine.CONFIGURATION.read_text(), SAVED_REFUSED)
+
+
+class SavingWhileTheServersCheckHangs(SavingTest):
+    """The server that checks what would be written comes to no end, and says nothing."""
+
+    SERVER = "#!/bin/sh\nexec sleep infinity\n"
+
+    def start(self):
+        folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+        server = folder / "dhcpd"
+        server.write_text(self.SERVER)
+        server.chmod(0o755)
+        self.launch(PATH=f"{folder}:{os.environ['PATH']}")
+        self.main = self.program.window(desktop.MAIN_TITLE)
+
+    def open_question(self):
+        """The question of a save, and the number of the process that checks meanwhile."""
+        self.edit()
+        self.main.press("ctrl+s")
+        question = self.program.window("Information")
+
+        def hanging():
+            return [pid for pid in self.program.child_processes() if machine.process_name(pid) == "sleep"]
+
+        (check,) = self.wait(hanging, "the check")
+        return question, check
+
+    def wait_for_end_of(self, check):
+        self.program.wait(
+            lambda: machine.process_name(check) is None,
+            lambda: f"the end of the check {check}",
+            alive=False,
+            alone=False,
+        )
+
+    def test_ends_the_check_when_the_question_is_answered(self):
+        question, check = self.open_question()
+        question.answer("Save")
+        self.wait_for_end_of(check)
+        self.wait_for_save()
+        self.assert_saved()
+
+    def test_leaves_no_check_behind_when_the_program_is_killed(self):
+        _, check = self.open_question()
+        self.program.process.kill()
+        self.assertEqual(self.program.wait_ended(), -signal.SIGKILL)
+        self.wait_for_end_of(check)
+        self.assert_not_saved()
 
 
 class SavingAfterOthersChangedTheFile(SavingTest):
