@@ -99,6 +99,22 @@ Edit addRoutes(bool ms)
     };
 }
 
+/// How the option of static routes is defined.
+QString routeDefinition(bool ms)
+{
+    return ms ? text("option ms-classless-static-routes code 249 = array of unsigned integer 8;")
+              : text("option classless-static-routes code 121 = array of unsigned integer 8;");
+}
+
+/// How many of the statements right below `parent` end with `words`.
+int countBelow(const Model &model, const QModelIndex &parent, const QString &words)
+{
+    int count{};
+    for (int row{}; row < model.rowCount(parent); ++row)
+        count += model.statementFor(model.index(row, 0, parent))->joinedWords().endsWith(words) ? 1 : 0;
+    return count;
+}
+
 using TimeOperation = bool (Model::*)(const QString &seconds, const QModelIndex &parent);
 
 Edit addTime(TimeOperation add, const char *seconds)
@@ -117,6 +133,8 @@ private slots:
     void addsFromBind9();
     void verdictOnEdit_data();
     void verdictOnEdit();
+    void verdictOnRoutes_data();
+    void verdictOnRoutes();
     void verdictOnKeyNames();
 
 private:
@@ -202,16 +220,6 @@ void VerdictTest::verdictOnEdit_data()
     accepted("static routes for MS systems", "", addRoutes(true));
     accepted("static routes of a subnet", "subnet 10.0", addRoutes(false));
     accepted("static routes of a host for MS systems", "host single", addRoutes(true));
-    for (const char *place :
-         {"", "subnet 10.0", "shared-network", "subnet 10.1", "group", "host grouped", "host single"}) {
-        for (const bool ms : {false, true}) {
-            const QByteArray name{QByteArray{"routes wherever: "} + place + (ms ? " for MS systems" : "")};
-            accepted(name, place, [ms](Model &model, const QModelIndex &parent) {
-                model.addRoutes({text("24"), text("192,168,1"), text("10,0,0,1")}, ms, parent);
-                model.addRoutes({text("0"), text("10,0,0,1")}, !ms, parent);
-            });
-        }
-    }
     accepted("static routes of both kinds in both places", "host single", [](Model &model, const QModelIndex &host) {
         for (const bool ms : {false, true, false, true}) {
             addRoutes(ms)(model, host);
@@ -275,6 +283,90 @@ void VerdictTest::verdictOnEdit()
     QVERIFY(edited.outline() != before);
     const QString verdict{complaintOf(m_dhcpd, edited.model().fileContent())};
     QCOMPARE(verdict.section(text(": "), 1), complaint);
+}
+
+// Wherever the server takes an option, as one that nothing is said about yet, that is defined already, or beside the
+// other kind.
+void VerdictTest::verdictOnRoutes_data()
+{
+    QTest::addColumn<QString>("configuration");
+    QTest::addColumn<QString>("place");
+    QTest::addColumn<bool>("ms");
+
+    const struct
+    {
+        const char *name;
+        const char *configuration;
+        const char *place;
+    } places[]{
+        {"all networks", "", ""},
+        {"subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { }", "subnet"},
+        {"subnet in a shared network", "shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { } }", "subnet"},
+        {"subnet in a group", "group { subnet 10.0.0.0 netmask 255.0.0.0 { } }", "subnet"},
+        {"shared network", "shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { } }", "shared-network"},
+        {"shared network in a group", "group { shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { } } }",
+         "shared-network"},
+        {"pool", "subnet 10.0.0.0 netmask 255.0.0.0 { pool { range 10.0.0.5; } }", "pool"},
+        {"pool in a shared network",
+         "shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { } pool { range 10.0.0.5; } }", "pool"},
+        {"group", "group { }", "group"},
+        {"group in a group", "group a { group b { } }", "group b"},
+        {"group in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { group { } }", "group"},
+        {"group in a shared network", "shared-network n { group { } subnet 10.0.0.0 netmask 255.0.0.0 { } }", "group"},
+        {"host", "host h { }", "host"},
+        {"host in a group", "group { host h { } }", "host"},
+        {"host in a group in a group", "group { group { host h { } } }", "host"},
+        {"host in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { host h { } }", "host"},
+        {"host in a shared network", "shared-network n { host h { } subnet 10.0.0.0 netmask 255.0.0.0 { } }", "host"},
+        {"host in a subnet in a shared network",
+         "shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { host h { } } }", "host"},
+        {"host in a group in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { group { host h { } } }", "host"},
+        {"host in a pool", "subnet 10.0.0.0 netmask 255.0.0.0 { pool { host h { } range 10.0.0.5; } }", "host"},
+        {"class", "class \"c\" { match hardware; }", "class"},
+        {"class in a group", "group { class \"c\" { match hardware; } }", "class"},
+        {"class in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { class \"c\" { match hardware; } }", "class"},
+        {"subclass", "class \"c\" { match hardware; } subclass \"c\" 1:00:11:22:33:44:55 { }", "subclass"},
+        {"condition", "if known { }", "if"},
+        {"alternative", "if known { } else { }", "else"},
+        {"condition in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { if known { } }", "if"},
+        {"event", "on commit { }", "on"},
+        {"event in a pool", "subnet 10.0.0.0 netmask 255.0.0.0 { pool { range 10.0.0.5; on commit { } } }", "on"},
+    };
+    const struct
+    {
+        const char *name;
+        QString definitions;
+    } beginnings[]{
+        {"undefined", {}},
+        {"defined", routeDefinition(false) + routeDefinition(true)},
+        {"one defined", routeDefinition(false)},
+        {"defined by another name", text("option routes-of-others code 121 = array of integer 8;")},
+    };
+    for (const auto &place : places) {
+        for (const auto &beginning : beginnings) {
+            for (const bool ms : {false, true}) {
+                QTest::addRow("%s, %s%s", place.name, beginning.name, ms ? ", for MS systems" : "")
+                    << beginning.definitions + text(place.configuration) << text(place.place) << ms;
+            }
+        }
+    }
+}
+
+void VerdictTest::verdictOnRoutes()
+{
+    QFETCH(const QString, configuration);
+    QFETCH(const QString, place);
+    QFETCH(const bool, ms);
+    QCOMPARE(complaintOf(m_dhcpd, configuration.toUtf8()), QString{});
+    EditedModel edited{configuration};
+    DhcpdConfigModel &model{edited.model()};
+    for (const bool isMs : {ms, !ms, ms}) {
+        model.addRoutes({text("24"), text("192,168,1"), text("10,0,0,1")}, isMs, edited.find(place));
+        QCOMPARE(complaintOf(m_dhcpd, model.fileContent()), QString{});
+    }
+    QCOMPARE(countBelow(model, edited.find(place), text("24, 192,168,1, 10,0,0,1")), 3);
+    for (const bool isMs : {false, true})
+        QCOMPARE(model.fileContent().count(routeDefinition(isMs).toUtf8()), 1);
 }
 
 // The model relies on the way in which the server compares the names of keys.

@@ -150,9 +150,9 @@ def routes(*rows, ms=False):
     def fill(dialog):
         table = dialog.find(pyatspi.ROLE_TABLE, "Static routes")
         for cells in rows:
-            row = len(table.rows)
+            row = len(table.cell_rows())
             dialog.button("Add").click()
-            dialog.program.wait(lambda n=row: len(table.rows) == n + 1, lambda: f"one more row in {table}")
+            dialog.program.wait(lambda n=row: len(table.cell_rows()) == n + 1, lambda: f"one more row in {table}")
             for column, text in enumerate(cells):
                 cell(row, column, text)(dialog)
         if ms:
@@ -166,11 +166,12 @@ def cell(row, column, text):
 
     def fill(dialog):
         table = dialog.find(pyatspi.ROLE_TABLE, "Static routes")
-        table.rows[row].cells[column].double_click()
+        place = table.cell_rows()[row][column]
+        place.double_click()
         dialog.program.keys("ctrl+a")
         dialog.program.type(text)
         dialog.program.keys("Return")
-        dialog.program.wait(lambda: table.rows[row].texts[column] == text, lambda: f"{text!r} in {table.labels()}")
+        dialog.program.wait(lambda: place.name == text, lambda: f"{text!r} in {table.labels()}")
 
     return fill
 

@@ -1,6 +1,7 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """The DHCP server's machine that the program runs on: the private network."""
 
+import ipaddress
 import os
 import pathlib
 import shutil
@@ -129,6 +130,12 @@ class Client:
     def address(self):
         """Its address; empty while it has none."""
         return self.tell("address")
+
+    @property
+    def routes(self):
+        """The gateways of the networks that it was given routes to."""
+        lines = map(str.split, self.tell("routes").splitlines())
+        return {ipaddress.ip_network("0.0.0.0/0" if to == "default" else to): via for to, _, via, *_ in lines}
 
     @property
     def log(self):
