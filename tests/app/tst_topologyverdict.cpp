@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 // What the DHCP server itself says of a file after every command of the topology tree.
 #include "common/paths.h"
+#include "config/dhcpdconfigmodel.h"
 #include "tests/app/topologywindow.h"
 #include "tests/support/dialogdriver.h"
 #include "tests/support/realdhcpd.h"
@@ -105,15 +106,25 @@ class TopologyVerdictTest final : public QObject
     Q_OBJECT
 
 private slots:
+    void initTestCase();
     void serverAcceptsWhatEveryCommandMade();
+    void serverAcceptsRoutesWhereverTheyAreOffered_data();
+    void serverAcceptsRoutesWhereverTheyAreOffered();
+
+private:
+    QString m_server;
 };
+
+void TopologyVerdictTest::initTestCase()
+{
+    // Looked for before a window puts another server into PATH.
+    m_server = realDhcpd();
+    if (m_server.isEmpty())
+        QSKIP("no dhcpd in the folder of ORV_TOOLS_DIR, in PATH or in /usr/sbin");
+}
 
 void TopologyVerdictTest::serverAcceptsWhatEveryCommandMade()
 {
-    // Looked for before the window puts another server into PATH.
-    const QString server{realDhcpd()};
-    if (server.isEmpty())
-        QSKIP("no dhcpd in the folder of ORV_TOOLS_DIR, in PATH or in /usr/sbin");
     const TopologyWindow window{configuration};
     ModalBoxes boxes;
 
@@ -183,9 +194,62 @@ void TopologyVerdictTest::serverAcceptsWhatEveryCommandMade()
 
     saveThroughTheMenu(window, boxes);
     const QByteArray file{readTestFile(paths::configuration())};
-    QCOMPARE(complaintOf(server, file), QString{});
+    QCOMPARE(complaintOf(m_server, file), QString{});
     QCOMPARE(QString::fromUtf8(file), text(saved));
     QVERIFY(!window.offersSave());
+}
+
+void TopologyVerdictTest::serverAcceptsRoutesWhereverTheyAreOffered_data()
+{
+    QTest::addColumn<QByteArray>("configuration");
+    QTest::addColumn<QString>("place");
+    QTest::addColumn<bool>("ms");
+
+    const struct
+    {
+        const char *name;
+        const char *configuration;
+        const char *place;
+    } places[]{
+        {"all networks", "", ""},
+        {"host", "host h { }", "host"},
+        {"host in a group", "group { host h { } }", "host"},
+        {"host in a group in a group", "group { group { host h { } } }", "host"},
+        {"host in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { host h { } }", "host"},
+        {"host in a group in a subnet", "subnet 10.0.0.0 netmask 255.0.0.0 { group { host h { } } }", "host"},
+        {"host in a pool", "subnet 10.0.0.0 netmask 255.0.0.0 { pool { host h { } range 10.0.0.5; } }", "host"},
+        {"host in a shared network", "shared-network n { host h { } subnet 10.0.0.0 netmask 255.0.0.0 { } }", "host"},
+        {"host in a subnet in a shared network",
+         "shared-network n { subnet 10.0.0.0 netmask 255.0.0.0 { host h { } } }", "host"},
+    };
+    const QByteArray definitions{"option classless-static-routes code 121 = array of unsigned integer 8;\n"
+                                 "option ms-classless-static-routes code 249 = array of unsigned integer 8;\n"};
+    for (const auto &place : places) {
+        for (const bool ms : {false, true}) {
+            for (const bool isDefined : {false, true}) {
+                QTest::addRow("%s%s, %s", place.name, ms ? ", for MS systems" : "", isDefined ? "defined" : "undefined")
+                    << (isDefined ? definitions : QByteArray{}) + place.configuration << text(place.place) << ms;
+            }
+        }
+    }
+}
+
+void TopologyVerdictTest::serverAcceptsRoutesWhereverTheyAreOffered()
+{
+    QFETCH(const QByteArray, configuration);
+    QFETCH(const QString, place);
+    QFETCH(const bool, ms);
+    const TopologyWindow window{configuration};
+    ModalBoxes boxes;
+    window.choose(boxes, place, list("Add static route"), [&] {
+        boxes.expectDialog<QDialog>([&](QDialog *dialog) {
+            addRoute(list("255.255.0.0 | 172.16.0.0 | 10.0.0.1"), ms)(boxes, dialog);
+            save(*dialog);
+        });
+    });
+    const QString option{ms ? text("option ms-classless-static-routes") : text("option classless-static-routes")};
+    QCOMPARE(window.model().parent(window.find(option + text(" 16, 172,16, 10,0,0,1"))), window.find(place));
+    QCOMPARE(complaintOf(m_server, window.content()), QString{});
 }
 
 QTEST_MAIN(TopologyVerdictTest)
