@@ -4,7 +4,7 @@
 #include "platform/manualpage.h"
 #include "platform/orvinit.h"
 
-#include <QCoreApplication>
+#include <QApplication>
 #include <QDialog>
 #include <QDialogButtonBox>
 #include <QMessageBox>
@@ -14,10 +14,19 @@
 OrvHelpMenu::OrvHelpMenu(QWidget *parent)
     : QMenu{tr("&Help"), parent}
 {
-    addAction(tr("Manual"), this, &OrvHelpMenu::showManual);
+    addCommand(tr("Manual"), &OrvHelpMenu::showManual);
     addSeparator();
-    addAction(tr("About %1").arg(QCoreApplication::applicationName()), this, &OrvHelpMenu::showAbout);
-    addAction(tr("About Qt"), this, [this] { QMessageBox::aboutQt(parentWidget()); });
+    addCommand(tr("About %1").arg(QCoreApplication::applicationName()), &OrvHelpMenu::showAbout);
+    addCommand(tr("About Qt"), &OrvHelpMenu::showAboutQt);
+}
+
+void OrvHelpMenu::addCommand(const QString &text, void (OrvHelpMenu::*command)())
+{
+    addAction(text, this, [this, command] {
+        // A desktop's global menu and a screen reader come past an open dialog, which would cover what is shown.
+        if (!QApplication::activeModalWidget())
+            (this->*command)();
+    });
 }
 
 void OrvHelpMenu::showManual()
@@ -52,3 +61,5 @@ void OrvHelpMenu::showAbout()
                            .arg(name.toHtmlEscaped(), QCoreApplication::applicationVersion().toHtmlEscaped(),
                                 description.toHtmlEscaped(), licence.toHtmlEscaped()));
 }
+
+void OrvHelpMenu::showAboutQt() { QMessageBox::aboutQt(parentWidget()); }

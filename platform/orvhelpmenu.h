@@ -6,7 +6,8 @@
 
 class QDialog;
 
-/// The Help menu of the main window `parent`: the manual page, and who made the program.
+/// The Help menu of the main window `parent`: the manual page, and who made the program. It shows nothing while a modal
+/// dialog is open.
 class OrvHelpMenu final : public QMenu
 {
     Q_OBJECT
@@ -16,8 +17,10 @@ public:
     Q_DISABLE_COPY_MOVE(OrvHelpMenu)
 
 private:
+    void addCommand(const QString &text, void (OrvHelpMenu::*command)());
     void showManual();
     void showAbout();
+    void showAboutQt();
 
     QPointer<QDialog> m_manual;
 };

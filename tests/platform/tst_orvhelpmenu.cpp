@@ -52,6 +52,7 @@ private slots:
     void everyPageHasAllOfTheEnglishOne_data();
     void everyPageHasAllOfTheEnglishOne();
     void manualIsOpenedOnce();
+    void nothingOpensUnderADialog();
 
 private:
     QAction *entry(const QString &text) const;
@@ -199,6 +200,20 @@ void OrvHelpMenuTest::manualIsOpenedOnce()
     QTRY_VERIFY(dialogs().isEmpty());
     entry(QStringLiteral("Manual"))->trigger();
     QCOMPARE(dialogs().size(), 1);
+}
+
+void OrvHelpMenuTest::nothingOpensUnderADialog()
+{
+    QMessageBox open{m_window.get()};
+    ModalBoxes boxes; // fails the test when another one opens
+    boxes.expectDialog<QMessageBox>([this](QMessageBox *box) {
+        for (QAction *action : m_menu->actions())
+            action->trigger();
+        QCOMPARE(dialogs(), QList<QDialog *>{box});
+        QTest::keyClick(box, Qt::Key_Escape);
+    });
+    open.exec();
+    boxes.verify();
 }
 
 QTEST_MAIN(OrvHelpMenuTest)
