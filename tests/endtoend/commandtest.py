@@ -236,6 +236,16 @@ def time_form(title, shown, texts):
     return form(title, dict(zip(("Mounth:", "Days:", "Hours", "Minutes", "Seconds"), shown)), texts)
 
 
+def parameter(*entries):
+    """The way to an entry of the submenu for parameters."""
+    return ("Add parameter", *entries)
+
+
+def option(*entries):
+    """The way to an entry of the submenu for options, which is in that for parameters."""
+    return parameter("Add option", *entries)
+
+
 CHANGES = {("Edit",), ("Remove",)}  # what every menu but the network's offers
 
 # --- Places in the sites of several tests

@@ -34,6 +34,8 @@ MENU = pyatspi.ROLE_POPUP_MENU
 FIELDS = (pyatspi.ROLE_TEXT, pyatspi.ROLE_SPIN_BUTTON)
 VIEWS = (pyatspi.ROLE_TREE, pyatspi.ROLE_TABLE)
 
+PRESS = "Press"  # the name of the action of whatever does something when it is pressed
+
 # What is raised by looking at something that has just gone, or is not there yet. What has gone has no interfaces.
 GONE = (GLib.Error, LookupError, NotImplementedError, subprocess.CalledProcessError, Xlib.error.XError)
 
@@ -279,6 +281,28 @@ class Control:
             self.program.keys("ctrl+a", "Delete")
         self.program.type(text)
         self.program.wait(lambda: self.value == text, lambda: f"{self} with {text!r}; it has {self.text!r}")
+
+    @property
+    def can_be_pressed(self):
+        """Whether a screen reader can press it."""
+        return PRESS in self.actions
+
+    @property
+    def actions(self):
+        """What a screen reader can do with it."""
+        try:
+            actions = self.accessible.queryAction()
+        except NotImplementedError:
+            return []
+        return [actions.getName(i) for i in range(actions.nActions)]
+
+    def press_aloud(self):
+        """What a screen reader does, which heeds neither the mouse nor what is in front."""
+        # That it was done is said only when the windows are closed that it opens.
+        with contextlib.suppress(GLib.Error):
+            self.accessible.queryAction().doAction(self.actions.index(PRESS))
+        # A button is released a moment later.
+        self.program.wait(lambda: not self.has("pressed"), lambda: f"{self} released", alone=False)
 
     def open_menu(self):
         """The menu of an entry that has one, opened by a click."""

@@ -20,6 +20,8 @@ from commandtest import (
     addresses,
     file,
     form,
+    option,
+    parameter,
     routes,
     time_form,
     words_form,
@@ -59,14 +61,6 @@ host plotter {
 NETWORK = ROOT.below("Shared network: office", "shared-network office")
 NEW_NETWORK = ROOT.below("Shared network: lab", "shared-network lab")
 HOST = ROOT.below("Host: plotter", "host plotter")
-
-
-def parameter(*entries):
-    return ("Add parameter", *entries)
-
-
-def option(*entries):
-    return parameter("Add option", *entries)
 
 
 NO_TIME = ("0", "0", "0 h", "0 m", "0 s")
