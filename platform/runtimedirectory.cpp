@@ -6,8 +6,27 @@
 #include <QFileInfo>
 #include <QStandardPaths>
 
+#include <optional>
+
 #include <sys/stat.h>
 #include <unistd.h>
+
+namespace {
+
+/// Who may do what with the folder `path` (no symbolic link to one) of this user; nothing where that is none.
+std::optional<mode_t> accessToOwnDirectory(const QString &path)
+{
+    struct stat status
+    {
+    };
+    // A trailing slash would make lstat() follow a symbolic link.
+    if (!QDir::isAbsolutePath(path) || lstat(QFile::encodeName(QDir::cleanPath(path)).constData(), &status) != 0 ||
+        !S_ISDIR(status.st_mode) || status.st_uid != geteuid())
+        return {};
+    return status.st_mode & ACCESSPERMS;
+}
+
+} // namespace
 
 OwnersUmask::OwnersUmask()
     : m_before{umask(S_IRWXG | S_IRWXO)}
@@ -16,22 +35,18 @@ OwnersUmask::OwnersUmask()
 
 OwnersUmask::~OwnersUmask() { umask(m_before); }
 
-bool isPrivateDirectory(const QString &path)
-{
-    struct stat status
-    {
-    };
-    // A trailing slash would make lstat() follow a symbolic link.
-    return QDir::isAbsolutePath(path) && lstat(QFile::encodeName(QDir::cleanPath(path)).constData(), &status) == 0 &&
-           S_ISDIR(status.st_mode) && status.st_uid == geteuid() && (status.st_mode & ACCESSPERMS) == S_IRWXU;
-}
+bool isPrivateDirectory(const QString &path) { return accessToOwnDirectory(path) == mode_t{S_IRWXU}; }
 
 bool makePrivateDirectory(const QString &path)
 {
+    const QByteArray name{QFile::encodeName(path)};
     if (!QFileInfo::exists(path)) {
         const OwnersUmask mask;
         QDir{}.mkpath(QFileInfo{path}.path());
-        mkdir(QFile::encodeName(path).constData(), S_IRWXU);
+        mkdir(name.constData(), S_IRWXU);
+    } else if (const auto access = accessToOwnDirectory(path); access && (*access & (S_IRWXG | S_IRWXO)) == 0) {
+        // Left by a version that let a umask close it to its own user. Others cannot have put anything into it.
+        chmod(name.constData(), S_IRWXU);
     }
     return isPrivateDirectory(path);
 }

@@ -20,7 +20,8 @@ private:
 /// Whether `path` is a folder (no symbolic link to one) that belongs to this user and that nobody else can enter.
 bool isPrivateDirectory(const QString &path);
 
-/// Makes the folder `path` unless it exists. Returns whether it is private then.
+/// Makes the folder `path` unless it exists, and lets this user do everything in one of his that is closed to others.
+/// Returns whether it is private then.
 bool makePrivateDirectory(const QString &path);
 
 /// Where the program makes a folder of its own: the superuser's, and that of users without a session.

@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """The start by the superuser: what the window shows, and what it keeps to itself."""
 
+import pathlib
+
 import pyatspi
 
 import desktop
@@ -133,6 +135,16 @@ class SecondStart(ProgramTest):
         self.wait(lambda: display.box_below_mouse() == self.main.box, "the first window in front")
         self.wait(lambda: display.has_keyboard(display.window_at(self.main.box)), "the first window with the keyboard")
         self.assertEqual(len(self.tree.rows), len(SITE.splitlines()))
+
+
+class SecondStartInAFolderThatWasClosed(SecondStart):
+    """The folder in which the first start leaves word of itself is the superuser's, but lacks a right of his."""
+
+    FOLDER = pathlib.Path("/run/orv-admin-dhcp")
+
+    def prepare(self):
+        self.FOLDER.mkdir(exist_ok=True)
+        self.FOLDER.chmod(0o500)
 
 
 class StartInGerman(ProgramTest):

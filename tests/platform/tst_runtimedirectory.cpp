@@ -33,6 +33,8 @@ private slots:
     void folderOfAnotherUserIsNotPrivate();
     void ownFolderIsMadePrivate_data();
     void ownFolderIsMadePrivate();
+    void ownFolderIsOpenedToItsUser_data();
+    void ownFolderIsOpenedToItsUser();
     void ownFolderMustBePrivate_data();
     void ownFolderMustBePrivate();
     void ownFolderIsNeverBelowTmp();
@@ -160,10 +162,28 @@ void RuntimeDirectoryTest::ownFolderIsMadePrivate()
     QVERIFY(makePrivateDirectory(own()));
 }
 
+void RuntimeDirectoryTest::ownFolderIsOpenedToItsUser_data()
+{
+    QTest::addColumn<uint>("mode");
+    for (const uint mode : {0U, 0100U, 0400U, 0500U, 0600U})
+        QTest::addRow("mode %04o", mode) << mode;
+}
+
+void RuntimeDirectoryTest::ownFolderIsOpenedToItsUser()
+{
+    QFETCH(const uint, mode);
+    const QString closed{folder(QStringLiteral("closed"), mode)};
+    QVERIFY(!isPrivateDirectory(closed));
+    QVERIFY(makePrivateDirectory(closed));
+    QVERIFY(isPrivateDirectory(closed));
+}
+
 void RuntimeDirectoryTest::ownFolderMustBePrivate_data()
 {
     QTest::addColumn<QString>("name");
     QTest::addRow("open to everybody") << QStringLiteral("open");
+    QTest::addRow("open to the group but not to its user") << QStringLiteral("group");
+    QTest::addRow("another user's") << QStringLiteral("other");
     QTest::addRow("symbolic link") << QStringLiteral("link");
     QTest::addRow("symbolic link to nothing") << QStringLiteral("dangling");
     QTest::addRow("a file") << QStringLiteral("file");
@@ -174,12 +194,18 @@ void RuntimeDirectoryTest::ownFolderMustBePrivate()
 {
     QFETCH(const QString, name);
     folder(QStringLiteral("open"), 0777);
-    QVERIFY(QFile::link(folder(QStringLiteral("target"), 0700), m_folder->filePath(QStringLiteral("link"))));
+    folder(QStringLiteral("group"), 0570);
+    if (name == QLatin1String{"other"} &&
+        chown(QFile::encodeName(folder(name, 0500)).constData(), otherUser, otherUser) != 0)
+        QSKIP("only the superuser can give a folder away");
+    const QString target{folder(QStringLiteral("target"), 0500)};
+    QVERIFY(QFile::link(target, m_folder->filePath(QStringLiteral("link"))));
     QVERIFY(QFile::link(m_folder->filePath(QStringLiteral("nothing")), m_folder->filePath(QStringLiteral("dangling"))));
     QFile file{m_folder->filePath(QStringLiteral("file"))};
     QVERIFY(file.open(QIODevice::WriteOnly));
 
     QVERIFY(!makePrivateDirectory(m_folder->filePath(name)));
+    QVERIFY(!isPrivateDirectory(target));
     QVERIFY(!QFile::exists(m_folder->filePath(QStringLiteral("nothing"))));
     if (geteuid() == 0 || !isPrivateDirectory(m_ofUser))
         QCOMPARE(runtimeDirectory(m_folder->filePath(name)), QString{});
