@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>Error al editar «%1». El bloque estaría anidado a demasiada profundidad.</translation>
     </message>
 </context>
 <context>

@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>Errore nella modifica di «%1». Il blocco sarebbe annidato troppo in profondità.</translation>
     </message>
 </context>
 <context>

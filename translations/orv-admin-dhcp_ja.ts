@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」を編集できませんでした。ブロックの入れ子が深くなりすぎます。</translation>
     </message>
 </context>
 <context>

@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>Nie udało się zmienić „%1”. Blok byłby zagnieżdżony zbyt głęboko.</translation>
     </message>
 </context>
 <context>

@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>Erro ao editar “%1”. O bloco ficaria aninhado em níveis demais.</translation>
     </message>
 </context>
 <context>

@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>Не удалось изменить «%1». Блок оказался бы вложен слишком глубоко.</translation>
     </message>
 </context>
 <context>

@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation type="unfinished"></translation>
+        <translation>编辑“%1”失败。该块的嵌套会过深。</translation>
     </message>
 </context>
 <context>
