@@ -21,7 +21,7 @@ TreeViewState *showIn(QTreeView *tree, DhcpdConfigModel *model)
 {
     tree->setModel(model);
     tree->setContextMenuPolicy(Qt::CustomContextMenu);
-    return new TreeViewState{tree};
+    return new TreeViewState{tree, [model](bool isMarked) { model->markLeaves(isMarked); }};
 }
 
 } // namespace

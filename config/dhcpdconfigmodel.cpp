@@ -50,6 +50,18 @@ int DhcpdConfigModel::rowCount(const QModelIndex &parent) const
 
 int DhcpdConfigModel::columnCount(const QModelIndex &parent) const { return statementFor(parent)->wordCount(); }
 
+bool DhcpdConfigModel::hasChildren(const QModelIndex &parent) const
+{
+    // As the base's, but without counting words: a view asks for it for every row.
+    return rowCount(parent) > 0 && !statementFor(parent)->words().isEmpty();
+}
+
+Qt::ItemFlags DhcpdConfigModel::flags(const QModelIndex &index) const
+{
+    const bool isMarked{m_marksLeaves && !hasChildren(index)};
+    return QAbstractItemModel::flags(index) | (isMarked ? Qt::ItemNeverHasChildren : Qt::NoItemFlags);
+}
+
 QVariant DhcpdConfigModel::data(const QModelIndex &index, int role) const
 {
     if (!index.isValid() || !index.internalPointer())

@@ -32,6 +32,8 @@ public:
     using QObject::parent;
     int rowCount(const QModelIndex &parent = {}) const override;
     int columnCount(const QModelIndex &parent = {}) const override;
+    bool hasChildren(const QModelIndex &parent = {}) const override;
+    Qt::ItemFlags flags(const QModelIndex &index) const override;
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
     QVariant headerData(int section, Qt::Orientation orientation, int role = Qt::DisplayRole) const override;
     /// Gives a statement a new value after checking it.
@@ -42,6 +44,9 @@ public:
     DhcpdConfigStatement *statementFor(const QModelIndex &index) const;
     /// The index of a statement of the tree in `column`; invalid for the invisible top node.
     QModelIndex indexOf(const DhcpdConfigStatement &statement, int column = 0) const;
+    /// While leaves are marked, the flags of a statement without children have Qt::ItemNeverHasChildren, which spares a
+    /// view that opens all others a search for it. They are not marked at first, since statements come and go.
+    void markLeaves(bool isMarked) { m_marksLeaves = isMarked; }
     /// Whether the tree has changed since it was read.
     bool isModified() const { return m_modified; }
 
@@ -96,8 +101,8 @@ public:
     void addRoutes(const QStringList &routes, bool ms, const QModelIndex &parent);
 
     /// Puts `words` in the place of all words of a statement, without a reset; nothing is modified when it has them
-    /// already. False for the nodes above the file's statements, and, with an error(), where a line would become a block
-    /// that is nested too deep.
+    /// already. False for the nodes above the file's statements, and, with an error(), where a line would become a
+    /// block that is nested too deep.
     bool replaceWords(const QModelIndex &index, const QStringList &words);
     /// Takes a statement with everything under it out of the tree.
     void removeStatement(const QModelIndex &index);
@@ -149,6 +154,7 @@ private:
 
     std::unique_ptr<DhcpdConfigDeclaration> m_topNode; // invisible; its words are the header labels
     bool m_modified{};
+    bool m_marksLeaves{};
     QString m_errorReason;
     ReadingLosses m_losses;
     TextEncoding m_encoding; // of the file that was read last

@@ -39,6 +39,15 @@ public:
         endResetModel();
     }
 
+    std::unique_ptr<Node> removeFirst()
+    {
+        beginRemoveRows({}, 0, 0);
+        std::unique_ptr<Node> removed{std::move(m_top.children.front())};
+        m_top.children.erase(m_top.children.begin());
+        endRemoveRows();
+        return removed;
+    }
+
     QModelIndex index(int row, int column, const QModelIndex &parent = {}) const override
     {
         return hasIndex(row, column, parent)
@@ -65,6 +74,13 @@ public:
         return role == Qt::DisplayRole ? nodeOf(index).name : QVariant{};
     }
 
+    Qt::ItemFlags flags(const QModelIndex &index) const override
+    {
+        const bool isMarked{m_marksLeaves && !hasChildren(index)};
+        return QAbstractItemModel::flags(index) | (isMarked ? Qt::ItemNeverHasChildren : Qt::NoItemFlags);
+    }
+    void markLeaves(bool isMarked) { m_marksLeaves = isMarked; }
+
 private:
     const Node &nodeOf(const QModelIndex &index) const
     {
@@ -73,6 +89,7 @@ private:
     }
 
     mutable Node m_top{text("top")};
+    bool m_marksLeaves{};
 };
 
 } // namespace
@@ -88,6 +105,8 @@ private slots:
     void everyBranchOpensAgain();
     void openBranchesStayOverAReset();
     void openBranchWithinAClosedOneStays();
+    void manyClosedBranchesStayOverAReset();
+    void branchThatWasRemovedIsForgotten();
     void scrollPositionStaysOverAReset();
     void currentRowIsNotKept();
     void emptyModelIsNothing();
@@ -118,7 +137,7 @@ void TreeViewStateTest::init()
 
     m_tree = std::make_unique<QTreeView>();
     m_tree->setModel(m_model.get());
-    m_viewState = new TreeViewState{m_tree.get()};
+    m_viewState = new TreeViewState{m_tree.get(), [this](bool isMarked) { m_model->markLeaves(isMarked); }};
     m_tree->show();
     QVERIFY(QTest::qWaitForWindowExposed(m_tree.get()));
 }
@@ -196,6 +215,28 @@ void TreeViewStateTest::openBranchWithinAClosedOneStays()
     QCOMPARE(open(), text("b d g").split(QLatin1Char{' '}));
     m_tree->expand(find(text("a")));
     QVERIFY(!m_tree->visualRect(find(text("i"))).isEmpty());
+}
+
+void TreeViewStateTest::manyClosedBranchesStayOverAReset()
+{
+    m_model->reset([this] {
+        for (int i{0}; i < 50; ++i)
+            m_model->top().add(text("many")).add(text("leaf"));
+    });
+    m_tree->expand(find(text("a")));
+    m_tree->expand(find(text("7")));
+    m_model->reset([] {});
+    QCOMPARE(open(), text("a").split(QLatin1Char{' '}));
+    QVERIFY(!m_tree->isExpanded(find(text("many"))));
+    QVERIFY(!m_tree->visualRect(find(text("e"))).isEmpty());
+}
+
+void TreeViewStateTest::branchThatWasRemovedIsForgotten()
+{
+    m_viewState->expandAll();
+    std::unique_ptr<NodeModel::Node> removed{m_model->removeFirst()};
+    m_model->reset([&] { m_model->top().children.push_back(std::move(removed)); });
+    QCOMPARE(open(), text("g").split(QLatin1Char{' '}));
 }
 
 void TreeViewStateTest::scrollPositionStaysOverAReset()

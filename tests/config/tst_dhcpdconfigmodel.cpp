@@ -104,6 +104,7 @@ private slots:
     void showsIcons_data();
     void showsIcons();
     void itemsAreNotEditable();
+    void leavesAreMarkedOnRequest();
     void findsStatements();
 
     void readTellsOneDataChange();
@@ -352,6 +353,20 @@ void DhcpdConfigModelTest::itemsAreNotEditable()
     QCOMPARE(m_model->flags({}), Qt::ItemFlags{});
     QCOMPARE(m_model->flags(allNetwork()), Qt::ItemIsSelectable | Qt::ItemIsEnabled);
     QCOMPARE(m_model->flags(m_model->index(1, 1, allNetwork())), Qt::ItemIsSelectable | Qt::ItemIsEnabled);
+}
+
+void DhcpdConfigModelTest::leavesAreMarkedOnRequest()
+{
+    QVERIFY(m_model->parse(QStringLiteral("a b; pool { c d; } group { }")));
+    const auto isMarked = [this](int row) {
+        return m_model->index(row, 0, allNetwork()).flags().testFlag(Qt::ItemNeverHasChildren);
+    };
+    QVERIFY(!isMarked(0) && !isMarked(1) && !isMarked(2));
+    m_model->markLeaves(true);
+    QVERIFY(isMarked(0) && !isMarked(1) && isMarked(2));
+    QVERIFY(!allNetwork().flags().testFlag(Qt::ItemNeverHasChildren));
+    m_model->markLeaves(false);
+    QVERIFY(!isMarked(0) && !isMarked(1) && !isMarked(2));
 }
 
 void DhcpdConfigModelTest::findsStatements()
