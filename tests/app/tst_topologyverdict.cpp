@@ -201,7 +201,7 @@ void TopologyVerdictTest::serverAcceptsWhatEveryCommandMade()
 
 void TopologyVerdictTest::serverAcceptsRoutesWhereverTheyAreOffered_data()
 {
-    QTest::addColumn<QByteArray>("configuration");
+    QTest::addColumn<QByteArray>("site");
     QTest::addColumn<QString>("place");
     QTest::addColumn<bool>("ms");
 
@@ -236,10 +236,10 @@ void TopologyVerdictTest::serverAcceptsRoutesWhereverTheyAreOffered_data()
 
 void TopologyVerdictTest::serverAcceptsRoutesWhereverTheyAreOffered()
 {
-    QFETCH(const QByteArray, configuration);
+    QFETCH(const QByteArray, site);
     QFETCH(const QString, place);
     QFETCH(const bool, ms);
-    const TopologyWindow window{configuration};
+    const TopologyWindow window{site};
     ModalBoxes boxes;
     window.choose(boxes, place, list("Add static route"), [&] {
         boxes.expectDialog<QDialog>([&](QDialog *dialog) {
