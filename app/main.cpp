@@ -13,7 +13,6 @@
 
 namespace {
 
-constexpr const char *version{"2.1.6+ci1"};
 constexpr const char *description{QT_TRANSLATE_NOOP("OrvHelpMenu", "Configure DHCP server")};
 constexpr int raiseMilliseconds{5000};
 
@@ -43,7 +42,7 @@ int main(int argc, char *argv[])
         return EXIT_FAILURE;
     }
 
-    orvInit(version, description);
+    orvInit(ORV_VERSION, description);
     if (getuid() != 0) {
         QMessageBox::critical(nullptr, QObject::tr("Error"), QObject::tr("Must be superuser"), QMessageBox::Ok);
         return EXIT_FAILURE;

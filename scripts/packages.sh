@@ -9,6 +9,7 @@ declare -A packages=(
 util-linux xauth"
     [wayland]="qtwayland5"
     [screenshot]="fonts-wqy-microhei maim xauth xdotool xvfb"
+    [pictures]="librsvg2-bin"
     [test]="at-spi2-core debootstrap dpkg python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
     [fuzz]="clang libclang-rt-dev"
