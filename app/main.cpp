@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "app/fmain.h"
+#include "platform/displaycheck.h"
 #include "platform/orvinit.h"
 #include "platform/qtsingleapplication.h"
+#include "platform/runtimedirectory.h"
 
 #include <QIcon>
 #include <QLibraryInfo>
@@ -9,6 +11,7 @@
 #include <QTranslator>
 
 #include <cstdlib>
+#include <optional>
 #include <unistd.h>
 
 namespace {
@@ -30,7 +33,12 @@ int main(int argc, char *argv[])
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
     QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
+    // By which a Wayland compositor finds the entry in the menu, and so the icon.
+    QGuiApplication::setDesktopFileName(QStringLiteral("org.orv.admin.dhcp"));
+    provideRuntimeDirectory();
+    std::optional<DisplayCheck> displayCheck{std::in_place};
     QtSingleApplication application{argc, argv};
+    displayCheck.reset();
 
     QTranslator qtTranslator;
     QTranslator translator;

@@ -70,3 +70,10 @@ QString runtimeDirectory(const QString &own)
     }
     return makePrivateDirectory(own) ? own : QString{};
 }
+
+void provideRuntimeDirectory()
+{
+    const QString directory{qEnvironmentVariableIsEmpty("XDG_RUNTIME_DIR") ? runtimeDirectory() : QString{}};
+    if (!directory.isEmpty())
+        qputenv("XDG_RUNTIME_DIR", QFile::encodeName(directory));
+}

@@ -31,3 +31,7 @@ QString ownRuntimeDirectory();
 /// that of others the session's runtime directory where it is private, else `own`, made when it is missing. Empty when
 /// that is not private either; never a folder that others can enter.
 QString runtimeDirectory(const QString &own = ownRuntimeDirectory());
+
+/// Names that folder to Qt where no session has named one, for which Qt would make one of its own among the temporary
+/// files of everybody. To be called before the application object is made.
+void provideRuntimeDirectory();

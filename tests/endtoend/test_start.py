@@ -1,6 +1,7 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
 """The start by the superuser: what the window shows, and what it keeps to itself."""
 
+import os
 import pathlib
 
 import pyatspi
@@ -157,6 +158,15 @@ class StartInGerman(ProgramTest):
         question = "Möchten Sie die Konfiguration neu aus der Datei laden?"
         # The texts of the buttons are not the program's own but Qt's.
         self.message("Information", question, buttons=["Ja", "Nein"], default="Ja").answer("Nein")
+
+
+class StartWithoutSession(ProgramTest):
+    def start(self):
+        self.launch(XDG_RUNTIME_DIR="")
+        self.main = self.program.window(desktop.MAIN_TITLE)
+
+    def test_leaves_no_folder_among_the_temporary_files(self):
+        self.assertEqual(list(pathlib.Path(os.environ["TMPDIR"]).glob("runtime-*")), [])
 
 
 class StartWithoutConfiguration(ProgramTest):
