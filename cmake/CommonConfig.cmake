@@ -1,4 +1,6 @@
 # SPDX-License-Identifier: GPL-3.0-or-later
+include(CheckCXXSourceCompiles)
+
 # The language level, warnings, hardening and Qt defines of every target, in one interface target.
 add_library(orv_common_config INTERFACE)
 target_compile_features(orv_common_config INTERFACE cxx_std_17)
@@ -11,7 +13,6 @@ target_compile_definitions(orv_common_config INTERFACE
     QT_NO_CAST_TO_ASCII
     QT_NO_NARROWING_CONVERSIONS_IN_CONNECT
     QT_NO_URL_CAST_FROM_STRING
-    $<$<CONFIG:Release,RelWithDebInfo>:_FORTIFY_SOURCE=2>
 )
 target_compile_options(orv_common_config INTERFACE
     -Wall -Wextra -Wpedantic -Wcast-qual -Wconversion -Wextra-semi -Wnon-virtual-dtor -Wold-style-cast
@@ -19,6 +20,17 @@ target_compile_options(orv_common_config INTERFACE
     $<$<BOOL:${ORV_WARNINGS_AS_ERRORS}>:-Werror>
     -fstack-protector-strong
 )
+# A distribution's compiler or flags may ask for more of it.
+set(CMAKE_REQUIRED_FLAGS -O2)
+check_cxx_source_compiles("
+    #ifndef _FORTIFY_SOURCE
+    #error
+    #endif
+    int main() {}" ORV_HAS_FORTIFY_SOURCE)
+unset(CMAKE_REQUIRED_FLAGS)
+if(NOT ORV_HAS_FORTIFY_SOURCE)
+    target_compile_definitions(orv_common_config INTERFACE $<$<CONFIG:Release,RelWithDebInfo>:_FORTIFY_SOURCE=2>)
+endif()
 set(CMAKE_POSITION_INDEPENDENT_CODE ON)
 target_link_options(orv_common_config INTERFACE -Wl,-z,relro,-z,now)
 

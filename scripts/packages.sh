@@ -9,6 +9,7 @@ declare -A packages=(
 util-linux xauth"
     [wayland]="qtwayland5"
     [screenshot]="fonts-wqy-microhei maim xauth xdotool xvfb"
+    [package]="dpkg-dev lintian"
     [pictures]="librsvg2-bin"
     [test]="appstream at-spi2-core debootstrap desktop-file-utils dpkg man-db python3-pyatspi python3-xlib"
     [bench]="libbenchmark-dev python3"
