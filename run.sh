@@ -61,6 +61,11 @@ elif [ -z "${DISPLAY:-}" ]; then
     groups+=(wayland)
     export QT_QPA_PLATFORM=${QT_QPA_PLATFORM:-wayland}
 fi
+# Before much is installed and built for nothing.
+if [ "$mode" != system ] && ! scripts/private-network --try; then
+    [ "$(id -u)" -eq 0 ] || echo "run.sh: the superuser may in most cases: sudo ./run.sh${picture:+ --screenshot "$picture"}" >&2
+    exit 1
+fi
 require_packages "${groups[@]}"
 [ "$mode" = system ] || scripts/fetch-tools isc-dhcp-server isc-dhcp-client
 scripts/build release

@@ -43,4 +43,15 @@ require_packages build run screenshot test
 scripts/fetch-tools
 scripts/build "$preset"
 export ORV_TOOLS_DIR=$PWD/build/tools
-exec ctest --preset "$preset" "$@"
+status=0
+ctest --preset "$preset" "$@" || status=$?
+
+# CTest names the tests that were skipped but keeps their reasons to itself.
+log=build/$preset/Testing/Temporary/LastTest.log
+[ ! -e "$log" ] || awk '
+    / Testing: / { name = $3; reason = "" }
+    /^<end of output>$/ { inside = 0 }
+    inside && !/^-+$/ { reason = reason "\n    " $0 }
+    /^Output:$/ { inside = 1 }
+    /^Test Skipped\.$/ { print name " was skipped:" reason }' "$log"
+exit "$status"

@@ -41,13 +41,19 @@ missing_packages() {
     done
 }
 
-# require_packages GROUP...: installs what is missing of the groups; asks for no rights when nothing is.
+# require_packages GROUP...: installs what is missing of the groups; asks for no rights when nothing is. A machine with
+# other packages than Debian's has to have the programs.
 require_packages() {
     local missing
+    if ! command -v dpkg-query >/dev/null || ! command -v apt-get >/dev/null; then
+        echo "This machine has no apt: whether what is needed ($*) is there will be seen."
+        return 0
+    fi
     mapfile -t missing < <(missing_packages "$@")
     [ "${#missing[@]}" -gt 0 ] || return 0
 
     echo "Installing for this ($*): ${missing[*]}"
-    as_root "apt-get update && DEBIAN_FRONTEND=noninteractive \
+    # An archive of somebody else's that cannot be read stops nothing.
+    as_root "apt-get update; DEBIAN_FRONTEND=noninteractive \
 apt-get install -y --no-install-recommends ${missing[*]}"
 }
