@@ -43,15 +43,18 @@ require_packages build run screenshot test
 scripts/fetch-tools
 scripts/build "$preset"
 export ORV_TOOLS_DIR=$PWD/build/tools
+results=$PWD/build/$preset/tests.xml
 status=0
-ctest --preset "$preset" "$@" || status=$?
+rm -f "$results"
+ctest --preset "$preset" --output-junit "$results" "$@" || status=$?
 
 # CTest names the tests that were skipped but keeps their reasons to itself.
-log=build/$preset/Testing/Temporary/LastTest.log
-[ ! -e "$log" ] || awk '
-    / Testing: / { name = $3; reason = "" }
-    /^<end of output>$/ { inside = 0 }
-    inside && !/^-+$/ { reason = reason "\n    " $0 }
-    /^Output:$/ { inside = 1 }
-    /^Test Skipped\.$/ { print name " was skipped:" reason }' "$log"
+[ ! -e "$results" ] || python3 - "$results" <<'END'
+import sys
+import xml.etree.ElementTree
+
+for test in xml.etree.ElementTree.parse(sys.argv[1]).iter("testcase"):
+    if test.find("skipped") is not None:
+        print(f"Skipped: {test.get('name')}\n{test.findtext('system-out')}")
+END
 exit "$status"
