@@ -2,6 +2,7 @@
 #include "dialogs/multipleipinputdialog.h"
 
 #include "config/values.h"
+#include "dialogs/buttons.h"
 #include "dialogs/ipinputdialog.h"
 #include "ui_multipleipinputdialog.h"
 
@@ -12,6 +13,8 @@ MultipleIpInputDialog::MultipleIpInputDialog(QWidget *parent)
     m_ui->setupUi(this);
     connect(m_ui->addButton, &QPushButton::clicked, this, &MultipleIpInputDialog::handleAddIp);
     connect(m_ui->removeButton, &QPushButton::clicked, this, &MultipleIpInputDialog::handleRemoveIps);
+    for (QPushButton *button : {m_ui->addButton, m_ui->removeButton})
+        buttons::pressByReturn(button);
     connect(m_ui->ipList, &QListWidget::currentItemChanged, this, [this] { m_ui->removeButton->setEnabled(true); });
 }
 
@@ -62,5 +65,5 @@ void MultipleIpInputDialog::handleRemoveIps()
 {
     qDeleteAll(m_ui->ipList->selectedItems());
     if (m_ui->ipList->count() == 0)
-        m_ui->removeButton->setEnabled(false);
+        buttons::disable(m_ui->removeButton, m_ui->ipList);
 }

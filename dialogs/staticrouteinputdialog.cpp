@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "dialogs/staticrouteinputdialog.h"
 
+#include "dialogs/buttons.h"
 #include "dialogs/netmask.h"
 #include "dialogs/patterns.h"
 #include "dialogs/routemodel.h"
@@ -80,7 +81,15 @@ StaticRouteInputDialog::StaticRouteInputDialog(QWidget *parent)
     m_ui->removeButton->setIcon(QIcon::fromTheme(QStringLiteral("list-remove")));
     connect(m_ui->addButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleAddStaticRoute);
     connect(m_ui->removeButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleRemoveStaticRoute);
+    for (QPushButton *button : {m_ui->addButton, m_ui->removeButton})
+        buttons::pressByReturn(button);
     connect(m_ui->StaticRouteTable, &QTableView::clicked, this, [this] { m_ui->removeButton->setEnabled(true); });
+    // A row is selected by keys, too.
+    connect(m_ui->StaticRouteTable->selectionModel(), &QItemSelectionModel::selectionChanged, this,
+            [this](const QItemSelection &selected) {
+                if (!selected.isEmpty())
+                    m_ui->removeButton->setEnabled(true);
+            });
 }
 
 StaticRouteInputDialog::~StaticRouteInputDialog() = default;
@@ -108,7 +117,13 @@ void StaticRouteInputDialog::lockMsRoute() { m_ui->checkBoxMS->setEnabled(false)
 void StaticRouteInputDialog::handleAddStaticRoute()
 {
     m_model->addRoutes({QString{}, QString{}, QString{}});
-    m_ui->StaticRouteTable->scrollToBottom();
+    QTableView *table{m_ui->StaticRouteTable};
+    table->scrollToBottom();
+    // The keyboard goes on there. What is selected stays, since that is what a removal is about.
+    if (!table->selectionModel()->hasSelection()) {
+        table->selectionModel()->setCurrentIndex(m_model->index(m_model->rowCount() - 1, 0),
+                                                 QItemSelectionModel::NoUpdate);
+    }
 }
 
 void StaticRouteInputDialog::accept()
@@ -124,7 +139,7 @@ void StaticRouteInputDialog::handleRemoveStaticRoute()
 {
     m_model->removeRoute(m_ui->StaticRouteTable->currentIndex());
     if (!m_ui->StaticRouteTable->selectionModel()->hasSelection())
-        m_ui->removeButton->setEnabled(false);
+        buttons::disable(m_ui->removeButton, m_ui->StaticRouteTable);
 }
 
 QStringList StaticRouteInputDialog::cellTexts() const

@@ -12,6 +12,7 @@
 #include <QGroupBox>
 #include <QLineEdit>
 #include <QListWidget>
+#include <QMetaEnum>
 #include <QPushButton>
 
 namespace {
@@ -49,6 +50,8 @@ private slots:
     void cancelledAddAppendsNothing();
     void removeDeletesTheSelectedEntries();
     void removeIsDisabledWithAnEmptyList();
+    void listIsEditedWithTheKeyboardAlone_data();
+    void listIsEditedWithTheKeyboardAlone();
 };
 
 void AddressDialogsTest::subnetReturnsWhatWasSet()
@@ -309,6 +312,57 @@ void AddressDialogsTest::removeIsDisabledWithAnEmptyList()
     driver::click(remove);
     QCOMPARE(dialog.ips(), QString{});
     QVERIFY(!remove->isEnabled());
+}
+
+void AddressDialogsTest::listIsEditedWithTheKeyboardAlone_data()
+{
+    QTest::addColumn<Qt::Key>("key");
+    for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter, Qt::Key_Space})
+        QTest::addRow("%s", QMetaEnum::fromType<Qt::Key>().valueToKey(key)) << key;
+}
+
+void AddressDialogsTest::listIsEditedWithTheKeyboardAlone()
+{
+    QFETCH(Qt::Key, key);
+    MultipleIpInputDialog dialog;
+    driver::open(dialog);
+    const auto *list = driver::find<QListWidget>(dialog);
+    const auto *add = driver::find<QPushButton>(dialog, text("addButton"));
+    const auto *remove = driver::find<QPushButton>(dialog, text("removeButton"));
+    const auto *save = driver::find<QDialogButtonBox>(dialog)->button(QDialogButtonBox::Save);
+
+    ModalBoxes boxes;
+    QCOMPARE(QApplication::focusWidget(), list);
+    driver::press(Qt::Key_Tab);
+    for (const char *address : {"10.0.0.1", "10.0.0.2"}) {
+        QCOMPARE(QApplication::focusWidget(), add);
+        QVERIFY(save->isDefault());
+        boxes.expectDialog<IpInputDialog>([address](IpInputDialog * /*ipDialog*/) {
+            QTest::keyClicks(QApplication::focusWidget(), text(address));
+            driver::press(Qt::Key_Return);
+        });
+        driver::press(key);
+        boxes.verify();
+    }
+    QCOMPARE(dialog.ips(), text("10.0.0.1, 10.0.0.2"));
+
+    driver::press(Qt::Key_Backtab);
+    for (const auto &[row, left] : {std::pair{Qt::Key_End, "10.0.0.1"}, std::pair{Qt::Key_Space, ""}}) {
+        QCOMPARE(QApplication::focusWidget(), list);
+        driver::press(row);
+        driver::press(Qt::Key_Tab);
+        driver::press(Qt::Key_Tab);
+        QCOMPARE(QApplication::focusWidget(), remove);
+        driver::press(key);
+        QCOMPARE(dialog.ips(), text(left));
+        if (*left) {
+            driver::press(Qt::Key_Backtab);
+            driver::press(Qt::Key_Backtab);
+        }
+    }
+    // Beside the last one there is nothing to remove, and the keyboard stays in the list.
+    QCOMPARE(QApplication::focusWidget(), list);
+    QVERIFY(dialog.isVisible());
 }
 
 QTEST_MAIN(AddressDialogsTest)

@@ -14,6 +14,7 @@
 #include <QIcon>
 #include <QImage>
 #include <QLineEdit>
+#include <QMetaEnum>
 #include <QPushButton>
 #include <QTableView>
 #include <QTemporaryDir>
@@ -89,6 +90,10 @@ private slots:
     void removeFollowsClicks();
     void removeTakesOnlyTheCurrentRow();
     void buttonsShowThemeIcons();
+    void returnPressesTheFocusedButton_data();
+    void returnPressesTheFocusedButton();
+    void routesAreTypedWithTheKeyboardAlone();
+    void routesAreRemovedWithTheKeyboardAlone();
 };
 
 void StaticRouteInputDialogTest::readsAndWritesOptionValues_data()
@@ -339,6 +344,79 @@ void StaticRouteInputDialogTest::buttonsShowThemeIcons()
     const StaticRouteInputDialog dialog;
     QCOMPARE(button(dialog, "addButton")->icon().name(), text("list-add"));
     QCOMPARE(button(dialog, "removeButton")->icon().name(), text("list-remove"));
+}
+
+void StaticRouteInputDialogTest::returnPressesTheFocusedButton_data()
+{
+    QTest::addColumn<Qt::Key>("key");
+    for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter, Qt::Key_Space})
+        QTest::addRow("%s", QMetaEnum::fromType<Qt::Key>().valueToKey(key)) << key;
+}
+
+void StaticRouteInputDialogTest::returnPressesTheFocusedButton()
+{
+    QFETCH(Qt::Key, key);
+    StaticRouteInputDialog dialog;
+    driver::open(dialog);
+    button(dialog, "addButton")->setFocus();
+    driver::press(key);
+    driver::press(key);
+    QVERIFY(dialog.isVisible());
+    QCOMPARE(cells(dialog).size(), 6);
+    auto *boxButtons = driver::find<QDialogButtonBox>(dialog);
+    QVERIFY(boxButtons->button(QDialogButtonBox::Yes)->isDefault());
+    boxButtons->button(QDialogButtonBox::Cancel)->setFocus();
+    driver::press(key);
+    QVERIFY(!dialog.isVisible());
+    QCOMPARE(dialog.result(), int{QDialog::Rejected});
+}
+
+void StaticRouteInputDialogTest::routesAreTypedWithTheKeyboardAlone()
+{
+    StaticRouteInputDialog dialog;
+    dialog.setRoutes(text("24, 192,168,1,0, 192,168,1,1"), false);
+    driver::open(dialog);
+    QCOMPARE(QApplication::focusWidget(), table(dialog));
+    driver::press(Qt::Key_Tab);
+    driver::press(Qt::Key_Return);
+    driver::press(Qt::Key_Backtab);
+    driver::press(Qt::Key_2); // opens the editor in the new row
+    QTest::keyClicks(QApplication::focusWidget(), text("55.0.0.0"));
+    driver::press(Qt::Key_Tab);
+    driver::retype(text("10.0.0.0"));
+    driver::press(Qt::Key_Tab);
+    driver::retype(text("192.168.1.2"));
+    driver::press(Qt::Key_Return);
+    QTRY_COMPARE(cells(dialog), (QStringList{text("255.255.255.0"), text("192.168.1.0"), text("192.168.1.1"),
+                                             text("255.0.0.0"), text("10.0.0.0"), text("192.168.1.2")}));
+    QTRY_COMPARE(QApplication::focusWidget(), table(dialog));
+    driver::press(Qt::Key_Return);
+    QCOMPARE(dialog.result(), int{QDialog::Accepted});
+}
+
+void StaticRouteInputDialogTest::routesAreRemovedWithTheKeyboardAlone()
+{
+    StaticRouteInputDialog dialog;
+    dialog.setRoutes(text("24, 192,168,1,0, 192,168,1,1, 8, 10,0,0,0, 10,0,0,1, 16, 172,16,0,0, 10,0,0,2"), false);
+    driver::open(dialog);
+    auto *remove = button(dialog, "removeButton");
+    QVERIFY(!remove->isEnabled());
+    for (const auto &[arrow, left] :
+         {std::pair{Qt::Key_Down, text("255.255.255.0, 255.255.0.0")}, std::pair{Qt::Key_Right, text("255.255.0.0")},
+          std::pair{Qt::Key_End, QString{}}}) {
+        QCOMPARE(QApplication::focusWidget(), table(dialog));
+        driver::press(arrow);
+        QVERIFY(remove->isEnabled());
+        driver::press(Qt::Key_Tab);
+        driver::press(Qt::Key_Tab);
+        QCOMPARE(QApplication::focusWidget(), remove);
+        driver::press(Qt::Key_Return);
+        QStringList masks;
+        for (int i{0}; i < cells(dialog).size(); i += 3)
+            masks.append(cells(dialog).at(i));
+        QCOMPARE(masks.join(text(", ")), left);
+        QVERIFY(!remove->isEnabled());
+    }
 }
 
 QTEST_MAIN(StaticRouteInputDialogTest)
