@@ -3,6 +3,7 @@
 
 #include "app/commandguard.h"
 #include "app/configurationfile.h"
+#include "app/keyboardmenu.h"
 #include "app/leasepage.h"
 #include "app/plainmessagebox.h"
 #include "app/servicecontrols.h"
@@ -17,6 +18,7 @@
 #include <QCloseEvent>
 #include <QGuiApplication>
 #include <QSettings>
+#include <QShortcut>
 
 namespace {
 
@@ -64,6 +66,7 @@ FMain::FMain(QWidget *parent)
     setUpService();
     setUpTopology();
     setUpLeases();
+    setUpKeys();
     connect(m_ui->mainTabWidget, &QTabWidget::currentChanged, this, &FMain::currentTabChanged);
     resize(QSettings{}.value(QLatin1String{sizeKey}, size()).toSize());
 }
@@ -125,6 +128,37 @@ void FMain::setUpLeases()
     connect(m_ui->searchPrevLease, &QToolButton::clicked, this, &FMain::selectPrevLease);
     connect(m_ui->searchNextLease, &QToolButton::clicked, this, &FMain::selectNextLease);
     connect(m_leases.get(), &LeasePage::reservationRequested, m_topology.get(), &TopologyPage::reserve);
+}
+
+// What the keyboard reaches beside the actions, whose own shortcuts are in the form.
+void FMain::setUpKeys()
+{
+    const struct
+    {
+        QList<QKeySequence> keys;
+        QWidget *widget; // which must have the keyboard; any in the window if this is the window
+        void (FMain::*slot)();
+    } shortcuts[]{
+        {{Qt::Key_Return, Qt::Key_Enter, Qt::Key_F2}, m_ui->topologyTree, &FMain::handleEdit},
+        {QKeySequence::keyBindings(QKeySequence::Copy), m_ui->dhcpdLeaseTable, &FMain::copyLease},
+        {QKeySequence::keyBindings(QKeySequence::Find), this, &FMain::goToLeaseSearch},
+    };
+    for (const auto &[keys, widget, slot] : shortcuts) {
+        for (const QKeySequence &key : keys) {
+            auto *shortcut = new QShortcut{key, widget};
+            shortcut->setContext(widget == this ? Qt::WindowShortcut : Qt::WidgetShortcut);
+            connect(shortcut, &QShortcut::activated, this, slot);
+        }
+    }
+    connect(new KeyboardMenu{m_ui->topologyTree}, &KeyboardMenu::requested, this, &FMain::openTreeMenu);
+    connect(new KeyboardMenu{m_ui->dhcpdLeaseTable}, &KeyboardMenu::requested, m_leases.get(), &LeasePage::openMenu);
+}
+
+void FMain::goToLeaseSearch()
+{
+    m_ui->mainTabWidget->setCurrentIndex(LeasesTab);
+    m_ui->searchLease->setFocus();
+    m_ui->searchLease->selectAll();
 }
 
 void FMain::reload()
@@ -216,10 +250,12 @@ void FMain::startStopServer()
 
 void FMain::handleServerStateChanged(DhcpServerManager::ServerStates state) { m_service->showState(state); }
 
-void FMain::handleTreeContextMenuRequested(QPoint /*position*/)
+void FMain::handleTreeContextMenuRequested(QPoint /*position*/) { openTreeMenu(QCursor::pos()); }
+
+void FMain::openTreeMenu(const QPoint &place)
 {
     if (mayStartCommand())
-        m_topology->openMenu();
+        m_topology->openMenu(place);
 }
 
 void FMain::handleTreeDoubleClicked(QModelIndex index) { m_topology->edit(index); }
@@ -288,7 +324,13 @@ void FMain::handleAddBind9Settings() { m_topology->declarations().addBind9Settin
 
 void FMain::leaseReload() { m_leases->update(); }
 
-void FMain::handleTableContextMenuRequested(QPoint position) { m_leases->openMenu(position); }
+void FMain::handleTableContextMenuRequested(QPoint position)
+{
+    if (m_ui->dhcpdLeaseTable->indexAt(position).isValid())
+        m_leases->openMenu(QCursor::pos());
+}
+
+void FMain::copyLease() { m_leases->copyCurrent(); }
 
 void FMain::handleReserveIp() { m_leases->reserveCurrent(); }
 

@@ -98,6 +98,11 @@ private:
     void setUpService();
     void setUpTopology();
     void setUpLeases();
+    void setUpKeys();
+
+    void openTreeMenu(const QPoint &place);
+    void goToLeaseSearch();
+    void copyLease();
 
     void showError(const QString &text, const QString &reason = {});
     void showInformation(const QString &text);

@@ -9,6 +9,8 @@
 #include "common/paths.h"
 #include "ui_fmain.h"
 
+#include <QClipboard>
+#include <QGuiApplication>
 #include <QHeaderView>
 #include <QMenu>
 
@@ -138,12 +140,21 @@ void LeasePage::showMatch(const QModelIndex &match)
     m_ui.dhcpdLeaseTable->scrollTo(match);
 }
 
-void LeasePage::openMenu(const QPoint &position)
+void LeasePage::openMenu(const QPoint &place)
 {
-    if (!m_ui.dhcpdLeaseTable->indexAt(position).isValid())
-        return;
     m_menuLease = leaseAt(m_ui.dhcpdLeaseTable->currentIndex());
-    m_menu->popup(QCursor::pos());
+    m_menu->popup(place);
+}
+
+void LeasePage::copyCurrent() const
+{
+    const QModelIndex current{m_ui.dhcpdLeaseTable->currentIndex()};
+    if (!current.isValid())
+        return;
+    QStringList cells;
+    for (int column{0}; column < m_proxy.columnCount(); ++column)
+        cells.append(current.siblingAtColumn(column).data().toString());
+    QGuiApplication::clipboard()->setText(cells.join(QLatin1Char{'\t'}));
 }
 
 void LeasePage::reserveCurrent() { request(m_menuLease ? m_menuLease : leaseAt(m_ui.dhcpdLeaseTable->currentIndex())); }

@@ -40,8 +40,10 @@ public:
     /// Goes to the next match (1) or the one before (-1), if there is one.
     void step(int step);
 
-    /// Offers the commands on the lease at a place in the table.
-    void openMenu(const QPoint &position);
+    /// Offers the commands on the current lease, in a menu at a place on the screen.
+    void openMenu(const QPoint &place);
+    /// Puts the cells of the current lease into the clipboard, separated by tabs.
+    void copyCurrent() const;
     /// Asks for a reservation of the lease that the menu is about, or of the current one.
     void reserveCurrent();
     void reserve(const QModelIndex &index);

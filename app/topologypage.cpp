@@ -46,10 +46,10 @@ void TopologyPage::showAll()
     tree->setCurrentIndex(m_model->index(0, 0));
 }
 
-void TopologyPage::openMenu()
+void TopologyPage::openMenu(const QPoint &place)
 {
     if (m_ui.topologyTree->currentIndex().isValid())
-        m_menus.menuFor(m_commands.currentStatement())->popup(QCursor::pos());
+        m_menus.menuFor(m_commands.currentStatement())->popup(place);
 }
 
 void TopologyPage::edit(const QModelIndex &index)

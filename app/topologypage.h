@@ -26,7 +26,8 @@ public:
 
     /// Opens the whole tree, with columns as wide as their contents, and makes the top row current.
     void showAll();
-    void openMenu();
+    /// Offers the commands on the current statement, in a menu at a place on the screen.
+    void openMenu(const QPoint &place);
     /// Opens the editor that fits the statement at `index`; nothing for the nodes above the file's statements.
     void edit(const QModelIndex &index);
     void editCurrent();

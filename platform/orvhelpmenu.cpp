@@ -14,15 +14,15 @@
 OrvHelpMenu::OrvHelpMenu(QWidget *parent)
     : QMenu{tr("&Help"), parent}
 {
-    addCommand(tr("Manual"), &OrvHelpMenu::showManual);
+    addCommand(tr("Manual"), &OrvHelpMenu::showManual)->setShortcut(QKeySequence::HelpContents);
     addSeparator();
     addCommand(tr("About %1").arg(QCoreApplication::applicationName()), &OrvHelpMenu::showAbout);
     addCommand(tr("About Qt"), &OrvHelpMenu::showAboutQt);
 }
 
-void OrvHelpMenu::addCommand(const QString &text, void (OrvHelpMenu::*command)())
+QAction *OrvHelpMenu::addCommand(const QString &text, void (OrvHelpMenu::*command)())
 {
-    addAction(text, this, [this, command] {
+    return addAction(text, this, [this, command] {
         // A desktop's global menu and a screen reader come past an open dialog, which would cover what is shown.
         if (!QApplication::activeModalWidget())
             (this->*command)();

@@ -17,7 +17,7 @@ public:
     Q_DISABLE_COPY_MOVE(OrvHelpMenu)
 
 private:
-    void addCommand(const QString &text, void (OrvHelpMenu::*command)());
+    QAction *addCommand(const QString &text, void (OrvHelpMenu::*command)());
     void showManual();
     void showAbout();
     void showAboutQt();
