@@ -29,10 +29,7 @@ void installTranslator(QTranslator *translator, const QString &name, const QStri
 
 int main(int argc, char *argv[])
 {
-    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
-    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
-    // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
-    QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
+    orvSetAttributes();
     // By which a Wayland compositor finds the entry in the menu, and so the icon.
     QGuiApplication::setDesktopFileName(QStringLiteral("org.orv.admin.dhcp"));
     provideRuntimeDirectory();

@@ -53,6 +53,14 @@ void chooseIconTheme()
 
 } // namespace
 
+void orvSetAttributes()
+{
+    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
+    QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
+}
+
 void orvInit(const char *version, const char *descriptionText)
 {
     Q_INIT_RESOURCE(platform);
