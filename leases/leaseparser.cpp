@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstring>
 #include <utility>
 
 namespace {
@@ -18,7 +19,6 @@ constexpr std::size_t npos{std::string_view::npos};
 constexpr std::array usualStates{"active"sv,   "free"sv,  "expired"sv, "released"sv, "abandoned"sv,
                                  "reserved"sv, "reset"sv, "backup"sv,  "bootp"sv};
 
-bool startsWith(std::string_view text, std::string_view start) { return text.substr(0, start.size()) == start; }
 bool contains(std::string_view text, std::string_view part) { return text.find(part) != npos; }
 
 /// The place in `line` of the quote that ends a quoted text beginning at `begin`, or npos. A backslash escapes the
@@ -37,13 +37,29 @@ std::size_t closingQuote(std::string_view line, std::size_t begin)
     return quote;
 }
 
+/// The place of the next quote or sign of a comment, or npos.
+std::size_t quoteOrComment(std::string_view line, std::size_t begin)
+{
+    const auto *place = std::find_if(line.begin() + begin, line.end(), [](char c) { return c == '"' || c == '#'; });
+    return place == line.end() ? npos : static_cast<std::size_t>(place - line.begin());
+}
+
+/// Whether there is anything in a part of a line outside of quotes by which a line is taken for more than nothing.
+bool hasKeyword(std::string_view outside)
+{
+    constexpr std::array keywords{"{"sv,      "}"sv,   "hardware"sv, "client-hostname"sv, "binding state"sv,
+                                  "starts"sv, "ends"sv};
+    return std::any_of(keywords.begin(), keywords.end(),
+                       [outside](std::string_view keyword) { return contains(outside, keyword); });
+}
+
 /// The parts of a line that are neither quoted nor a comment. The quotes stay, so that what they separate is not
 /// joined.
 std::string outsideOfQuotes(std::string_view line)
 {
     std::string outside;
     for (std::size_t begin{0}; begin < line.size();) {
-        const std::size_t end{line.find_first_of("\"#", begin)};
+        const std::size_t end{quoteOrComment(line, begin)};
         outside += line.substr(begin, end - begin);
         if (end == npos || line[end] == '#')
             break;
@@ -59,10 +75,10 @@ std::optional<std::string_view> quotedAt(std::string_view line, std::size_t plac
 {
     if (place == npos)
         return {};
-    std::size_t begin{line.find_first_of("\"#")};
+    std::size_t begin{quoteOrComment(line, 0)};
     while (begin < place && line[begin] == '"') {
         const std::size_t closing{closingQuote(line, begin + 1)};
-        begin = closing == npos ? npos : line.find_first_of("\"#", closing + 1);
+        begin = closing == npos ? npos : quoteOrComment(line, closing + 1);
     }
     if (begin != place || line[begin] != '"')
         return {};
@@ -111,66 +127,115 @@ std::string withoutLast(std::string_view word) { return withoutEnds(word, 0, 1);
 
 LeaseTime timeOf(std::string_view line) { return LeaseTime::parse(word(line, 4), withoutLast(word(line, 5))); }
 
-/// The number of an address of four plain decimal numbers; nothing for every other text.
-std::optional<quint32> plainAddress(std::string_view text)
+// The functions below look for a line of one layout at `line`, from where there are at least mostOfUsual bytes, and say
+// where the line after it begins, or null.
+constexpr std::ptrdiff_t mostOfUsual{64};
+
+// More variables and options than a server's configuration has.
+constexpr std::size_t mostHarmless{16};
+
+template<std::size_t size>
+bool startsWith(const char *line, const char (&start)[size])
 {
-    quint32 address{0};
-    const char *c{text.data()};
-    const char *end{c + text.size()};
+    return std::memcmp(line, start, size - 1) == 0;
+}
+
+template<std::size_t size>
+const char *after(const char *line, const char (&start)[size])
+{
+    return startsWith(line, start) ? line + size - 1 : nullptr;
+}
+
+bool isDigit(char c) { return c >= '0' && c <= '9'; }
+bool isHexDigit(char c) { return isDigit(c) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F'); }
+bool isHexDigitOrColon(char c) { return isHexDigit(c) || c == ':'; }
+
+/// The word lease, an address of four plain decimal numbers and an opening brace.
+const char *usualAddress(const char *line, quint32 &address)
+{
+    const char *c{after(line, "lease ")};
+    if (!c)
+        return nullptr;
+    quint32 number{0};
     for (int part{0}; part < 4; ++part) {
-        if (part > 0 && (c == end || *c++ != '.'))
-            return {};
+        if (part > 0 && *c++ != '.')
+            return nullptr;
         const char *begin{c};
         quint32 value{0};
-        while (c != end && *c >= '0' && *c <= '9' && c - begin < 3)
+        while (isDigit(*c) && c - begin < 3)
             value = value * 10 + static_cast<quint32>(*c++ - '0');
         if (c == begin || value > 255 || (*begin == '0' && c - begin > 1)) // a number that begins with 0 is octal
-            return {};
-        address = address << 8U | value;
+            return nullptr;
+        number = number << 8U | value;
     }
-    return c == end ? std::optional{address} : std::nullopt;
+    const char *next{after(c, " {\n")};
+    if (next)
+        address = number;
+    return next;
 }
 
-/// The time in a line of a keyword with its indentation, a weekday, a time of the usual layout and a semicolon; else
-/// null. `keyword` ends with a space.
-const char *usualTime(std::string_view line, std::string_view keyword)
+/// A keyword with its indentation and a space, a weekday, a time of the usual layout and a semicolon.
+template<std::size_t size>
+const char *usualTime(const char *line, const char (&keyword)[size])
 {
-    const std::size_t time{keyword.size() + 2};
-    const bool isUsual{line.size() == time + LeaseTime::usualLength + 1 && startsWith(line, keyword) &&
-                       line[time - 2] >= '0' && line[time - 2] <= '9' && line[time - 1] == ' ' &&
-                       LeaseTime::hasUsualLayout(line.data() + time) && line.back() == ';'};
-    return isUsual ? line.data() + time : nullptr;
+    const char *day{after(line, keyword)};
+    if (!day || !isDigit(day[0]) || day[1] != ' ' || !LeaseTime::hasUsualLayout(day + 2))
+        return nullptr;
+    return after(day + 2 + LeaseTime::usualLength, ";\n");
 }
 
-/// The state in a line of a keyword with its indentation, one of the usual states and a semicolon; else empty.
-std::string_view usualState(std::string_view line, std::string_view keyword)
+template<std::size_t size>
+const char *usualTime(const char *line, const char (&keyword)[size], LeaseTime &time)
 {
-    if (!startsWith(line, keyword) || line.back() != ';')
-        return {};
-    const std::string_view state{line.substr(keyword.size(), line.size() - keyword.size() - 1)};
-    const auto usual = std::find(usualStates.begin(), usualStates.end(), state);
-    return usual != usualStates.end() ? *usual : std::string_view{};
+    const char *next{usualTime(line, keyword)};
+    if (next)
+        time = LeaseTime::fromUsualLayout(line + size - 1 + 2);
+    return next;
 }
 
-/// The quoted text in a line of a keyword with its indentation, that text and a semicolon; else nothing. `keyword` ends
-/// with the opening quote.
-std::optional<std::string_view> usualQuoted(std::string_view line, std::string_view keyword)
+/// A keyword with its indentation and a space, one of the usual states and a semicolon.
+template<std::size_t size>
+const char *usualState(const char *line, const char (&keyword)[size], std::size_t &state)
 {
-    if (line.size() < keyword.size() + 2 || !startsWith(line, keyword) || line.back() != ';' ||
-        closingQuote(line, keyword.size()) != line.size() - 2)
-        return {};
-    return line.substr(keyword.size(), line.size() - 2 - keyword.size());
+    const char *begin{after(line, keyword)};
+    if (!begin)
+        return nullptr;
+    for (state = 0; state < usualStates.size(); ++state) {
+        const std::string_view usual{usualStates[state]};
+        if (*begin == usual.front() && std::memcmp(begin, usual.data(), usual.size()) == 0)
+            return after(begin + usual.size(), ";\n");
+    }
+    return nullptr;
 }
 
-/// The address in a line of the word lease, a plain address and an opening brace; else nothing.
-std::optional<quint32> usualAddress(std::string_view line)
+/// The hardware address of an Ethernet card.
+const char *usualHardware(const char *line, std::string_view &address)
 {
-    constexpr std::string_view begin{"lease "};
-    constexpr std::string_view end{" {"};
-    if (line.size() < begin.size() + end.size() || !startsWith(line, begin) ||
-        line.substr(line.size() - end.size()) != end)
-        return {};
-    return plainAddress(line.substr(begin.size(), line.size() - end.size() - begin.size()));
+    constexpr std::size_t length{17};
+    const char *begin{after(line, "  hardware ethernet ")};
+    if (!begin)
+        return nullptr;
+    for (std::size_t i{0}; i < length; ++i) {
+        if (i % 3 == 2 ? begin[i] != ':' : !isHexDigit(begin[i]))
+            return nullptr;
+    }
+    address = {begin, length};
+    return after(begin + length, ";\n");
+}
+
+/// A keyword with its indentation, a quoted text, of which `keyword` has the first quote, and a semicolon.
+template<std::size_t size>
+const char *usualQuoted(const char *line, const char *end, const char (&keyword)[size], std::string_view &text)
+{
+    const char *begin{after(line, keyword)};
+    if (!begin)
+        return nullptr;
+    const std::string_view rest{begin, static_cast<std::size_t>(end - begin)};
+    const std::size_t lineFeed{rest.find('\n')};
+    if (lineFeed == npos || lineFeed < 2 || rest[lineFeed - 1] != ';')
+        return nullptr;
+    text = rest.substr(0, lineFeed - 2);
+    return closingQuote(rest.substr(0, lineFeed), 0) == text.size() ? begin + lineFeed + 1 : nullptr;
 }
 
 } // namespace
@@ -225,81 +290,106 @@ void LeaseParser::feedLines(std::string_view bytes)
         readLine(m_unfinished);
         begin = end + 1;
     }
-    for (std::size_t end{}; (end = bytes.find('\n', begin)) != npos; begin = end + 1)
-        readLine(bytes.substr(begin, end - begin));
-    m_unfinished = bytes.substr(begin);
+    const char *end{bytes.data() + bytes.size()};
+    const char *line{bytes.data() + begin};
+    while (line != end) {
+        const char *next{end - line >= mostOfUsual ? readUsualLine(line, end) : nullptr};
+        if (!next) {
+            const auto *lineFeed =
+                static_cast<const char *>(std::memchr(line, '\n', static_cast<std::size_t>(end - line)));
+            if (!lineFeed)
+                break;
+            readLine({line, static_cast<std::size_t>(lineFeed - line)});
+            next = lineFeed + 1;
+        }
+        line = next;
+    }
+    m_unfinished.assign(line, end);
+}
+
+/// Reads the line at `line` if it is wholly of a layout that the server writes, and returns the line after it, else
+/// null. Each layout leaves no room for a keyword or brace that would make readLine() take the line for something else.
+const char *LeaseParser::readUsualLine(const char *line, const char *end)
+{
+    const char *next{};
+    std::string_view text;
+    std::size_t state{};
+    switch (line[2]) {
+    case 's':
+        next = usualTime(line, "  starts ", m_values.lease.start);
+        return next ? next : afterSetting(line, end);
+    case 'e':
+        return usualTime(line, "  ends ", m_values.lease.end);
+    case 'c':
+        next = usualQuoted(line, end, R"(  client-hostname ")", text);
+        if (next)
+            m_values.lease.host = add(text);
+        return next ? next : usualTime(line, "  cltt ");
+    case 'b':
+        next = usualState(line, "  binding state ", state);
+        if (next)
+            setUsualState(state);
+        return next;
+    case 'h':
+        next = usualHardware(line, text);
+        if (next)
+            m_values.lease.mac = add(text);
+        return next;
+    case 'a':
+        next = usualAddress(line, m_values.lease.address);
+        if (next)
+            m_values.addressText.reset();
+        return next ? next : usualTime(line, "  atsfp ");
+    case 't':
+        next = usualTime(line, "  tstp ");
+        return next ? next : usualTime(line, "  tsfp ");
+    case 'n':
+        return usualState(line, "  next binding state ", state);
+    case 'o':
+        return afterSetting(line, end);
+    case 'r':
+        return usualState(line, "  rewind binding state ", state);
+    case 'u':
+        return usualQuoted(line, end, R"(  uid ")", text);
+    default:
+        next = after(line, "}\n");
+        if (next)
+            endBlock();
+        return next;
+    }
+}
+
+/// The line after one that sets a variable or states an option, or null; such a line means nothing here.
+const char *LeaseParser::afterSetting(const char *begin, const char *end)
+{
+    if (!startsWith(begin, "  set ") && !startsWith(begin, "  option "))
+        return nullptr;
+    const std::string_view rest{begin, static_cast<std::size_t>(end - begin)};
+    const std::size_t lineFeed{rest.find('\n')};
+    if (lineFeed == npos || rest[lineFeed - 1] != ';')
+        return nullptr;
+    const std::string_view line{rest.substr(0, lineFeed - 1)};
+    const std::size_t quote{line.find('"')};
+    const std::size_t value{quote != npos ? quote : line.rfind(' ')};
+    const bool isPlainValue{quote != npos ? closingQuote(line, quote + 1) == line.size() - 1
+                                          : std::all_of(line.begin() + value + 1, line.end(), isHexDigitOrColon)};
+    return isPlainValue && isHarmless(line.substr(0, value)) ? line.data() + lineFeed + 1 : nullptr;
+}
+
+/// Whether what comes before a value has no keyword.
+bool LeaseParser::isHarmless(std::string_view beginning)
+{
+    if (std::find(m_harmless.begin(), m_harmless.end(), beginning) != m_harmless.end())
+        return true;
+    if (hasKeyword(beginning))
+        return false;
+    if (m_harmless.size() == mostHarmless)
+        m_harmless.clear();
+    m_harmless.emplace_back(beginning);
+    return true;
 }
 
 void LeaseParser::readLine(std::string_view line)
-{
-    if (!readUsualLine(line))
-        readAnyLine(line);
-}
-
-/// Reads a line that is wholly of a layout that the server writes. Each layout leaves no room for a keyword or brace
-/// that would make readAnyLine() take the line for something else; in all others the answer is false.
-bool LeaseParser::readUsualLine(std::string_view line)
-{
-    if (line.size() < 3) {
-        if (line == "}"sv)
-            endBlock();
-        return line.empty() || line == "}"sv;
-    }
-    switch (line[2]) {
-    case 's':
-        return readUsualTime(line, "  starts "sv, m_values.lease.start);
-    case 'e':
-        return readUsualTime(line, "  ends "sv, m_values.lease.end);
-    case 'c':
-        if (const std::optional<std::string_view> host{usualQuoted(line, R"(  client-hostname ")"sv)}) {
-            m_values.lease.host = add(*host);
-            return true;
-        }
-        return usualTime(line, "  cltt "sv);
-    case 'b':
-        if (const std::string_view state{usualState(line, "  binding state "sv)}; !state.empty()) {
-            setState(state);
-            return true;
-        }
-        return false;
-    case 'h':
-        if (startsWith(line, "  hardware "sv) && !contains(line, "{"sv)) {
-            const std::string_view mac{word(line, 4)};
-            if (!mac.empty() && mac.back() == ';') {
-                m_values.lease.mac = add(mac.substr(0, mac.size() - 1));
-                return true;
-            }
-        }
-        return false;
-    case 'a':
-        if (const std::optional<quint32> address{usualAddress(line)}) {
-            m_values.lease.address = *address;
-            m_values.addressText.reset();
-            return true;
-        }
-        return usualTime(line, "  atsfp "sv);
-    case 't':
-        return usualTime(line, "  tstp "sv) || usualTime(line, "  tsfp "sv);
-    case 'n':
-        return !usualState(line, "  next binding state "sv).empty();
-    case 'r':
-        return !usualState(line, "  rewind binding state "sv).empty();
-    case 'u':
-        return usualQuoted(line, R"(  uid ")"sv).has_value();
-    default:
-        return false;
-    }
-}
-
-bool LeaseParser::readUsualTime(std::string_view line, std::string_view keyword, LeaseTime &time)
-{
-    const char *text{usualTime(line, keyword)};
-    if (text)
-        time = LeaseTime::fromUsualLayout(text);
-    return text;
-}
-
-void LeaseParser::readAnyLine(std::string_view line)
 {
     const std::string outside{outsideOfQuotes(line)};
     const auto has = [&outside](std::string_view keyword) { return contains(outside, keyword); };
@@ -345,8 +435,13 @@ void LeaseParser::setState(std::string_view state)
         m_values.lease.state = add(state);
         return;
     }
-    LeaseTexts::Id &id{m_usualStates[static_cast<std::size_t>(usual - usualStates.begin())]};
+    setUsualState(static_cast<std::size_t>(usual - usualStates.begin()));
+}
+
+void LeaseParser::setUsualState(std::size_t state)
+{
+    LeaseTexts::Id &id{m_usualStates[state]};
     if (id == LeaseTexts::Id{})
-        id = add(state);
+        id = add(usualStates[state]);
     m_values.lease.state = id;
 }

@@ -45,13 +45,14 @@ private:
 
     void feedLines(std::string_view bytes);
     void readLine(std::string_view line);
-    bool readUsualLine(std::string_view line);
-    static bool readUsualTime(std::string_view line, std::string_view keyword, LeaseTime &time);
-    void readAnyLine(std::string_view line);
+    const char *readUsualLine(const char *line, const char *end);
+    const char *afterSetting(const char *begin, const char *end);
+    bool isHarmless(std::string_view beginning);
 
     void startBlock(std::string_view address);
     void endBlock();
     void setState(std::string_view state);
+    void setUsualState(std::size_t state);
     LeaseTexts::Id add(std::string_view text) { return m_table.texts().add(text); }
 
     LeaseTable &m_table;
@@ -60,4 +61,5 @@ private:
     std::optional<Values> m_beforeUnfinished;
     bool m_blockEnded{false};                  // since finish() began to read the unfinished line
     std::vector<LeaseTexts::Id> m_usualStates; // by their places in the list of usual states
+    std::vector<std::string> m_harmless;       // the beginnings of settings, which recur
 };
