@@ -4,6 +4,7 @@
 #include <QHostAddress>
 
 #include <algorithm>
+#include <array>
 #include <limits>
 #include <numeric>
 
@@ -22,6 +23,26 @@ constexpr std::size_t manyPending{std::size_t{1} << 20U};
 quint64 sortKey(quint32 address, std::size_t place) { return quint64{address} << 32U | place; }
 quint32 addressOf(quint64 key) { return static_cast<quint32>(key >> 32U); }
 quint32 placeOf(quint64 key) { return static_cast<quint32>(key); }
+
+/// Sorts by the addresses, and keeps those of one address in their order: byte by byte from the lowest one on, which is
+/// several times as fast as comparing a million of them.
+void sortByAddress(std::vector<quint64> &keys)
+{
+    constexpr unsigned addressBegin{32};
+    constexpr unsigned bitsOfByte{8};
+    constexpr unsigned bitsOfKey{64};
+    std::vector<quint64> sorted(keys.size());
+    for (unsigned shift{addressBegin}; shift < bitsOfKey; shift += bitsOfByte) {
+        const auto byteOf = [shift](quint64 key) { return static_cast<std::size_t>(key >> shift & 0xFFU); };
+        std::array<std::size_t, 256> places{};
+        for (const quint64 key : keys)
+            ++places.at(byteOf(key));
+        std::exclusive_scan(places.begin(), places.end(), places.begin(), std::size_t{0});
+        for (const quint64 key : keys)
+            sorted[places.at(byteOf(key))++] = key;
+        keys.swap(sorted);
+    }
+}
 
 } // namespace
 
@@ -52,7 +73,7 @@ void LeaseTable::settleAll()
     keys.reserve(m_leases.size() - settled);
     for (std::size_t place{settled}; place < m_leases.size(); ++place)
         keys.push_back(sortKey(m_leases[place].address, place));
-    std::sort(keys.begin(), keys.end());
+    sortByAddress(keys);
 
     // Merge the last lease of each address into the rows. One whose address has a row already takes the place of the
     // old one; `rowOf` has the rows of the others, and no row for leases that were replaced by later ones.
