@@ -101,7 +101,9 @@ void DhcpdLeasesModel::update(const QString &path)
 
 QString DhcpdLeasesModel::text(const Lease &lease, int column) const
 {
-    const auto decoded = [this](LeaseTexts::Id id) { return decodeLeaseText(m_table.texts().at(id)); };
+    const auto decoded = [this, column](LeaseTexts::Id id) {
+        return decodeLeaseText(m_table.texts(static_cast<LeaseColumn>(column)).at(id));
+    };
     switch (column) {
     case Address:
         return m_table.addressText(lease.address);

@@ -10,5 +10,5 @@ LeaseHits::LeaseHits(const LeaseTable &table)
 void LeaseHits::addInFile(int place)
 {
     m_isHit[static_cast<std::size_t>(place)] = true;
-    m_isEmpty = false;
+    ++m_count;
 }

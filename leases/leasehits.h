@@ -11,15 +11,17 @@ class LeaseHits final
 public:
     explicit LeaseHits(const LeaseTable &table);
 
-    bool isEmpty() const { return m_isEmpty; }
+    bool isEmpty() const { return m_count == 0; }
+    bool isComplete() const { return m_count == m_isHit.size(); }
     bool contains(int row) const { return containsInFile(m_table->placeInFile(row)); }
 
     /// The same by the place in the file.
     bool containsInFile(int place) const { return m_isHit[static_cast<std::size_t>(place)]; }
+    /// For a place that is not contained yet.
     void addInFile(int place);
 
 private:
     const LeaseTable *m_table;
     std::vector<bool> m_isHit; // in the order of the file
-    bool m_isEmpty{true};
+    std::size_t m_count{0};
 };

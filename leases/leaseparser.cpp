@@ -323,7 +323,7 @@ const char *LeaseParser::readUsualLine(const char *line, const char *end)
     case 'c':
         next = usualQuoted(line, end, R"(  client-hostname ")", text);
         if (next)
-            m_values.lease.host = add(text);
+            setHost(text);
         return next ? next : usualTime(line, "  cltt ");
     case 'b':
         next = usualState(line, "  binding state ", state);
@@ -333,7 +333,7 @@ const char *LeaseParser::readUsualLine(const char *line, const char *end)
     case 'h':
         next = usualHardware(line, text);
         if (next)
-            m_values.lease.mac = add(text);
+            setMac(text);
         return next;
     case 'a':
         next = usualAddress(line, m_values.lease.address);
@@ -396,10 +396,10 @@ void LeaseParser::readLine(std::string_view line)
     if (has("{"sv)) {
         startBlock(word(line, 1));
     } else if (has("hardware"sv)) {
-        m_values.lease.mac = add(withoutLast(word(line, 4)));
+        setMac(withoutLast(word(line, 4)));
     } else if (has("client-hostname"sv)) {
         const std::optional<std::string_view> quoted{quotedAt(line, wordPlace(line, 3))};
-        m_values.lease.host = quoted ? add(*quoted) : add(withoutEnds(word(line, 3), 1, 2));
+        setHost(quoted ? std::string{*quoted} : withoutEnds(word(line, 3), 1, 2));
     } else if (has("binding state"sv) && !has("next"sv) && !has("rewind"sv)) {
         setState(withoutLast(word(line, 4)));
     } else if (has("starts"sv)) {
@@ -432,7 +432,7 @@ void LeaseParser::setState(std::string_view state)
 {
     const auto usual = std::find(usualStates.begin(), usualStates.end(), state);
     if (usual == usualStates.end()) {
-        m_values.lease.state = add(state);
+        m_values.lease.state = m_table.texts(LeaseColumn::State).add(state);
         return;
     }
     setUsualState(static_cast<std::size_t>(usual - usualStates.begin()));
@@ -442,6 +442,6 @@ void LeaseParser::setUsualState(std::size_t state)
 {
     LeaseTexts::Id &id{m_usualStates[state]};
     if (id == LeaseTexts::Id{})
-        id = add(usualStates[state]);
+        id = m_table.texts(LeaseColumn::State).add(usualStates[state]);
     m_values.lease.state = id;
 }

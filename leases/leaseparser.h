@@ -51,9 +51,10 @@ private:
 
     void startBlock(std::string_view address);
     void endBlock();
+    void setMac(std::string_view mac) { m_values.lease.mac = m_table.texts(LeaseColumn::Mac).add(mac); }
+    void setHost(std::string_view host) { m_values.lease.host = m_table.texts(LeaseColumn::HostName).add(host); }
     void setState(std::string_view state);
     void setUsualState(std::size_t state);
-    LeaseTexts::Id add(std::string_view text) { return m_table.texts().add(text); }
 
     LeaseTable &m_table;
     Values m_values;

@@ -7,6 +7,15 @@
 
 #include <QSignalBlocker>
 
+#include <algorithm>
+
+namespace {
+
+// So few are asked one by one in less time than all of a million at once.
+constexpr int fewRows{1000};
+
+} // namespace
+
 LeaseProxyModel::LeaseProxyModel(QObject *parent)
     : QSortFilterProxyModel{parent}
 {
@@ -56,12 +65,20 @@ QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const
     if (!model || !isSearchable(start, role, hits, flags))
         return QSortFilterProxyModel::match(start, role, value, hits, flags);
     const QModelIndex first{mapToSource(start)};
-    const LeaseNeedle needle{value.toString(),
-                             flags.testFlag(Qt::MatchCaseSensitive) ? Qt::CaseSensitive : Qt::CaseInsensitive};
-    if (!m_lastMatch || !(m_lastMatch->needle() == needle))
-        m_lastMatch = model->search(needle);
-    const LeaseHits found{m_lastMatch->find(static_cast<LeaseColumn>(first.column()), m_found ? &*m_found : nullptr)};
+    const LeaseSearch &search{searchFor(value.toString(), flags)};
+    const auto column = static_cast<LeaseColumn>(first.column());
     QModelIndexList matches;
+    // Where many rows have the text, one of the first has it.
+    const int few{std::min(start.row() + fewRows, rowCount())};
+    for (int row{start.row()}; hits > 0 && row < few; ++row) {
+        const QModelIndex candidate{index(row, start.column())};
+        if (search.contains(mapToSource(candidate).row(), column))
+            matches.append(candidate);
+        if (matches.size() == hits)
+            return matches;
+    }
+    matches.clear();
+    const LeaseHits found{search.find(column, m_found ? &*m_found : nullptr)};
     if (found.isEmpty())
         return matches;
     const int rows{model->rowCount()};
@@ -74,6 +91,19 @@ QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const
             matches.append(match);
     }
     return matches;
+}
+
+/// The search for a text that match() was given; the filter's where it is the same, which knows its way already.
+const LeaseSearch &LeaseProxyModel::searchFor(const QString &text, Qt::MatchFlags flags) const
+{
+    LeaseNeedle needle{text, Qt::CaseSensitive};
+    if (!flags.testFlag(Qt::MatchCaseSensitive) && !needle.isCaseless())
+        needle.sensitivity = Qt::CaseInsensitive;
+    if (m_search && m_search->needle() == needle)
+        return *m_search;
+    if (!m_lastMatch || !(m_lastMatch->needle() == needle))
+        m_lastMatch = leases()->search(needle);
+    return *m_lastMatch;
 }
 
 bool LeaseProxyModel::filterAcceptsRow(int row, const QModelIndex &parent) const

@@ -2,9 +2,19 @@
 #include "leases/leasesearch.h"
 
 #include "leases/leasetable.h"
+#include "leases/leasetextscan.h"
 
 #include <algorithm>
+#include <array>
 #include <utility>
+
+namespace {
+
+// Those first that take the least time for a lease: most often one of them spares the others.
+constexpr std::array columns{LeaseColumn::State,   LeaseColumn::Start, LeaseColumn::End,
+                             LeaseColumn::Address, LeaseColumn::Mac,   LeaseColumn::HostName};
+
+} // namespace
 
 LeaseSearch::LeaseSearch(const LeaseTable &table, LeaseTimeTexts &timeTexts, LeaseNeedle needle)
     : m_table{table}
@@ -12,55 +22,32 @@ LeaseSearch::LeaseSearch(const LeaseTable &table, LeaseTimeTexts &timeTexts, Lea
     , m_addressPattern{m_needle}
     , m_textPattern{m_needle}
     , m_timePattern{m_needle, timeTexts}
-    , m_textScan{m_textPattern, table.texts()}
 {
 }
 
-bool LeaseSearch::contains(int row) const { return isInAny(m_table.at(row), allColumns()); }
-
-LeaseHits LeaseSearch::find() const { return findIn(allColumns(), nullptr); }
-
-LeaseHits LeaseSearch::find(LeaseColumn column, const LeaseHits *among) const { return findIn({column}, among); }
-
-const LeaseSearch::Columns &LeaseSearch::allColumns()
+bool LeaseSearch::contains(int row) const
 {
-    static const Columns columns{LeaseColumn::Address, LeaseColumn::Mac,   LeaseColumn::HostName,
-                                 LeaseColumn::State,   LeaseColumn::Start, LeaseColumn::End};
-    return columns;
+    const Lease &lease{m_table.at(row)};
+    return std::any_of(columns.begin(), columns.end(), [&](LeaseColumn column) { return isIn(lease, column); });
 }
 
-LeaseHits LeaseSearch::findIn(Columns columns, const LeaseHits *among) const
+bool LeaseSearch::contains(int row, LeaseColumn column) const { return isIn(m_table.at(row), column); }
+
+LeaseHits LeaseSearch::find() const
 {
     LeaseHits hits{m_table};
-    columns.erase(
-        std::remove_if(columns.begin(), columns.end(), [this](LeaseColumn column) { return !canBeIn(column); }),
-        columns.end());
-    if (columns.empty())
-        return hits;
-    for (int place{0}; place < m_table.size(); ++place) {
-        if ((!among || among->containsInFile(place)) && isInAny(m_table.inFileOrder(place), columns))
-            hits.addInFile(place);
+    for (const LeaseColumn column : columns) {
+        if (!hits.isComplete())
+            addHits(hits, column, nullptr);
     }
     return hits;
 }
 
-bool LeaseSearch::canBeIn(LeaseColumn column) const
+LeaseHits LeaseSearch::find(LeaseColumn column, const LeaseHits *among) const
 {
-    switch (column) {
-    case LeaseColumn::Address:
-        return m_table.hasIrregularAddresses() || m_addressPattern.canBeIn();
-    case LeaseColumn::Mac:
-    case LeaseColumn::HostName:
-    case LeaseColumn::State:
-        return m_textScan.hasCandidates();
-    default:
-        return true;
-    }
-}
-
-bool LeaseSearch::isInAny(const Lease &lease, const Columns &columns) const
-{
-    return std::any_of(columns.begin(), columns.end(), [&](LeaseColumn column) { return isIn(lease, column); });
+    LeaseHits hits{m_table};
+    addHits(hits, column, among);
+    return hits;
 }
 
 bool LeaseSearch::isIn(const Lease &lease, LeaseColumn column) const
@@ -71,11 +58,11 @@ bool LeaseSearch::isIn(const Lease &lease, LeaseColumn column) const
     case LeaseColumn::Address:
         return isInAddress(lease.address);
     case LeaseColumn::Mac:
-        return m_textScan.isIn(lease.mac);
+        return isInText(column, lease.mac);
     case LeaseColumn::HostName:
-        return m_textScan.isIn(lease.host);
+        return isInText(column, lease.host);
     case LeaseColumn::State:
-        return m_textScan.isIn(lease.state);
+        return isInText(column, lease.state);
     case LeaseColumn::Start:
         return m_timePattern.isIn(lease.start);
     case LeaseColumn::End:
@@ -88,4 +75,69 @@ bool LeaseSearch::isInAddress(quint32 address) const
 {
     const QString *irregular{m_table.irregularAddressText(address)};
     return irregular ? m_needle.isIn(*irregular) : m_addressPattern.isIn(address);
+}
+
+bool LeaseSearch::canBeInAddress() const
+{
+    const QHash<quint32, QString> &irregular{m_table.irregularAddresses()};
+    return m_addressPattern.canBeIn() || std::any_of(irregular.cbegin(), irregular.cend(),
+                                                     [this](const QString &text) { return m_needle.isIn(text); });
+}
+
+bool LeaseSearch::isInText(LeaseColumn column, LeaseTexts::Id text) const
+{
+    return m_textPattern.isIn(m_table.texts(column).at(text));
+}
+
+void LeaseSearch::addHits(LeaseHits &hits, LeaseColumn column, const LeaseHits *among) const
+{
+    if (m_needle.text.isEmpty()) {
+        addHitsIf(hits, among, [](const Lease & /*lease*/) { return true; });
+        return;
+    }
+    switch (column) {
+    case LeaseColumn::Address:
+        if (canBeInAddress())
+            addHitsIf(hits, among, [this](const Lease &lease) { return isInAddress(lease.address); });
+        break;
+    case LeaseColumn::Mac:
+        addTextHits(hits, column, &Lease::mac, among);
+        break;
+    case LeaseColumn::HostName:
+        addTextHits(hits, column, &Lease::host, among);
+        break;
+    case LeaseColumn::State:
+        addTextHits(hits, column, &Lease::state, among);
+        break;
+    case LeaseColumn::Start:
+        addTimeHits(hits, &Lease::start, among);
+        break;
+    case LeaseColumn::End:
+        addTimeHits(hits, &Lease::end, among);
+        break;
+    }
+}
+
+template<typename IsIn>
+void LeaseSearch::addHitsIf(LeaseHits &hits, const LeaseHits *among, const IsIn &isIn) const
+{
+    for (int place{0}; place < m_table.size(); ++place) {
+        if (!hits.containsInFile(place) && (!among || among->containsInFile(place)) && isIn(m_table.inFileOrder(place)))
+            hits.addInFile(place);
+    }
+}
+
+void LeaseSearch::addTextHits(LeaseHits &hits, LeaseColumn column, LeaseTexts::Id Lease::*text,
+                              const LeaseHits *among) const
+{
+    LeaseTextScan scan{m_textPattern, m_table.texts(column)};
+    if (scan.hasMatches())
+        addHitsIf(hits, among, [&scan, text](const Lease &lease) { return scan.isIn(lease.*text); });
+}
+
+void LeaseSearch::addTimeHits(LeaseHits &hits, LeaseTime Lease::*time, const LeaseHits *among) const
+{
+    const auto canBeIn = [this](LeaseTime day) { return m_timePattern.canBeOn(day); };
+    if (std::any_of(m_table.days().cbegin(), m_table.days().cend(), canBeIn))
+        addHitsIf(hits, among, [this, time](const Lease &lease) { return m_timePattern.isIn(lease.*time); });
 }

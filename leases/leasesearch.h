@@ -6,10 +6,7 @@
 #include "leases/leasehits.h"
 #include "leases/leaseneedle.h"
 #include "leases/leasetextpattern.h"
-#include "leases/leasetextscan.h"
 #include "leases/leasetimepattern.h"
-
-#include <vector>
 
 class LeaseTable;
 class LeaseTimeTexts;
@@ -27,27 +24,30 @@ public:
 
     /// Whether the text is in any column of a row.
     bool contains(int row) const;
+    /// Whether the text is in one column of a row.
+    bool contains(int row, LeaseColumn column) const;
 
-    /// All leases that have the text in any column; as find() below, for the leases that there were at the start.
+    /// All leases that have the text in any column.
     LeaseHits find() const;
     /// All leases that have the text in `column`; if `among` is given, only of those that it contains.
     LeaseHits find(LeaseColumn column, const LeaseHits *among = nullptr) const;
 
 private:
-    using Columns = std::vector<LeaseColumn>;
-
-    static const Columns &allColumns();
-    LeaseHits findIn(Columns columns, const LeaseHits *among) const;
-    /// Whether the text may be in any cell of a column.
-    bool canBeIn(LeaseColumn column) const;
-    bool isInAny(const Lease &lease, const Columns &columns) const;
     bool isIn(const Lease &lease, LeaseColumn column) const;
     bool isInAddress(quint32 address) const;
+    bool canBeInAddress() const;
+    bool isInText(LeaseColumn column, LeaseTexts::Id text) const;
+
+    /// Adds the leases that have the text in a column.
+    void addHits(LeaseHits &hits, LeaseColumn column, const LeaseHits *among) const;
+    template<typename IsIn>
+    void addHitsIf(LeaseHits &hits, const LeaseHits *among, const IsIn &isIn) const;
+    void addTextHits(LeaseHits &hits, LeaseColumn column, LeaseTexts::Id Lease::*text, const LeaseHits *among) const;
+    void addTimeHits(LeaseHits &hits, LeaseTime Lease::*time, const LeaseHits *among) const;
 
     const LeaseTable &m_table;
     LeaseNeedle m_needle;
     LeaseAddressPattern m_addressPattern;
     LeaseTextPattern m_textPattern;
     LeaseTimePattern m_timePattern;
-    mutable LeaseTextScan m_textScan;
 };

@@ -13,7 +13,7 @@ namespace {
 // How much room is made ahead, by the size of a usual block and of the texts in it. Memory that turns out not to be
 // needed is never touched.
 constexpr qint64 bytesPerLease{256};
-constexpr qint64 bytesPerTextByte{8};
+constexpr qint64 bytesPerTextByte{16};
 constexpr qint64 mostBytesAhead{qint64{1} << 30};
 
 // When so many are pending they are settled, so that a file of many blocks for few addresses does not fill the memory.
@@ -52,7 +52,8 @@ void LeaseTable::reserveForFile(qint64 bytes)
 {
     const auto ahead = static_cast<std::size_t>(std::min(bytes, mostBytesAhead));
     m_leases.reserve(ahead / bytesPerLease);
-    m_texts.reserve(ahead / bytesPerTextByte);
+    texts(LeaseColumn::Mac).reserve(ahead / bytesPerTextByte);
+    texts(LeaseColumn::HostName).reserve(ahead / bytesPerTextByte);
 }
 
 void LeaseTable::add(const Lease &lease, const std::optional<QString> &addressText)
@@ -60,6 +61,8 @@ void LeaseTable::add(const Lease &lease, const std::optional<QString> &addressTe
     if (m_leases.size() - m_rows.size() >= std::max(manyPending, m_rows.size()))
         settleAll();
     m_leases.push_back(lease);
+    addDay(lease.start, m_lastStart);
+    addDay(lease.end, m_lastEnd);
     if (addressText)
         m_addressTexts.insert(lease.address, *addressText);
     else if (!m_addressTexts.isEmpty())
@@ -158,6 +161,14 @@ std::size_t LeaseTable::lowerBound(quint32 address) const
         return m_leases[place].address < wanted;
     });
     return static_cast<std::size_t>(row - m_rows.cbegin());
+}
+
+/// Adds the day of a time; `last` is the one before, which is most often of the same day.
+void LeaseTable::addDay(LeaseTime time, LeaseTime &last)
+{
+    if (time.dateKey() != last.dateKey() && time.isValid())
+        m_days.insert(time.dateKey(), time);
+    last = time;
 }
 
 QString LeaseTable::addressText(quint32 address) const

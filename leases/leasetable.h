@@ -7,6 +7,7 @@
 #include <QHash>
 #include <QString>
 
+#include <array>
 #include <optional>
 #include <vector>
 
@@ -28,8 +29,15 @@ public:
     /// Makes room for the leases of a file of that many bytes.
     void reserveForFile(qint64 bytes);
 
-    LeaseTexts &texts() { return m_texts; }
-    const LeaseTexts &texts() const { return m_texts; }
+    /// The texts of one of the columns Mac, HostName and State.
+    LeaseTexts &texts(LeaseColumn column) { return m_texts[static_cast<std::size_t>(column) - firstOfTexts]; }
+    const LeaseTexts &texts(LeaseColumn column) const
+    {
+        return m_texts[static_cast<std::size_t>(column) - firstOfTexts];
+    }
+
+    /// A time of each day that leases were added with, also if they have been replaced since.
+    const QHash<quint32, LeaseTime> &days() const { return m_days; }
 
     /// Adds a pending lease. `addressText` is given if the address is not shown the way its number would be.
     void add(const Lease &lease, const std::optional<QString> &addressText);
@@ -48,7 +56,7 @@ public:
     QString addressText(quint32 address) const;
     /// The text of an address that is not shown the way its number would be; null for any other.
     const QString *irregularAddressText(quint32 address) const;
-    bool hasIrregularAddresses() const { return !m_addressTexts.isEmpty(); }
+    const QHash<quint32, QString> &irregularAddresses() const { return m_addressTexts; }
 
     /// The same leases in the order of the file, in which they and their texts lie in memory: reading all of them is
     /// several times as fast as by row.
@@ -56,10 +64,16 @@ public:
     int placeInFile(int row) const { return static_cast<int>(m_rows[static_cast<std::size_t>(row)]); }
 
 private:
+    static constexpr auto firstOfTexts = static_cast<std::size_t>(LeaseColumn::Mac);
+
+    void addDay(LeaseTime time, LeaseTime &last);
     /// The first row with that address or a higher one.
     std::size_t lowerBound(quint32 address) const;
 
-    LeaseTexts m_texts;
+    std::array<LeaseTexts, 3> m_texts;
+    QHash<quint32, LeaseTime> m_days; // by their keys
+    LeaseTime m_lastStart;
+    LeaseTime m_lastEnd;
     std::vector<Lease> m_leases; // in the order of the file; those from m_rows.size() on are pending
     std::vector<quint32> m_rows; // places in m_leases, by address
     QHash<quint32, QString> m_addressTexts;

@@ -6,21 +6,25 @@
 LeaseTextScan::LeaseTextScan(const LeaseTextPattern &pattern, const LeaseTexts &texts)
     : m_pattern{pattern}
     , m_texts{texts}
-    , m_candidate{pattern.nextCandidate(texts.memory(), 0)}
-    , m_hasCandidates{m_candidate != texts.memory().size()}
+    , m_match{pattern.nextMatch(texts.memory(), 0)}
 {
 }
 
 bool LeaseTextScan::isIn(LeaseTexts::Id id)
 {
-    const std::string_view text{m_texts.at(id)};
     const std::string_view memory{m_texts.memory()};
+    const std::string_view text{m_texts.at(id)};
     const auto begin = static_cast<std::size_t>(text.data() - memory.data());
-    if (begin < m_begin)
-        return m_pattern.isIn(text);
-    if (begin > m_candidate) {
-        m_begin = begin;
-        m_candidate = m_pattern.nextCandidate(memory, begin);
+    if (begin < m_begin) {
+        if (id != m_last) {
+            m_last = id;
+            m_isInLast = m_pattern.isIn(text);
+        }
+        return m_isInLast;
     }
-    return m_candidate < begin + text.size() && m_pattern.isIn(text);
+    if (begin > m_match) {
+        m_begin = begin;
+        m_match = m_pattern.nextMatch(memory, begin);
+    }
+    return m_match < begin + text.size() && m_pattern.isIn(text);
 }

@@ -5,25 +5,26 @@
 
 class LeaseTextPattern;
 
-/// Applies a pattern to many of a table's texts, of which few have the needle: one pass over the memory in which they
-/// lie finds where the next one can be, and all before are answered by their place. It is fast if they are asked for in
-/// the order in which they were added. A search in a million leases takes up to half less time with it.
+/// Applies a pattern to many texts of a column, of which few have the needle: one pass over the memory in which they
+/// lie finds where the next one is, and all before are answered by their place. It is fast if they are asked for in the
+/// order in which they were added, or as one text again and again.
 class LeaseTextScan final
 {
 public:
+    /// `pattern` has a needle that is not empty.
     LeaseTextScan(const LeaseTextPattern &pattern, const LeaseTexts &texts);
 
-    /// Whether the needle is in a text, also in one that was added since.
+    /// Whether the needle may be in any of the texts.
+    bool hasMatches() const { return m_match != m_texts.memory().size(); }
     bool isIn(LeaseTexts::Id id);
-
-    /// Whether the needle may be in any of the texts that there were at the start.
-    bool hasCandidates() const { return m_hasCandidates; }
 
 private:
     const LeaseTextPattern &m_pattern;
     const LeaseTexts &m_texts;
-    // Offsets in the memory of the texts: those from the one to the other do not have the needle.
+    // Offsets in the memory of the texts: none that begins between the one and the other has the needle.
     std::size_t m_begin{0};
-    std::size_t m_candidate;
-    bool m_hasCandidates;
+    std::size_t m_match;
+    // The answer for the last text that lies before m_begin.
+    LeaseTexts::Id m_last{0};
+    bool m_isInLast{false};
 };

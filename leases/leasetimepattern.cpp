@@ -3,6 +3,7 @@
 
 #include "leases/leasetimetexts.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace {
@@ -16,12 +17,40 @@ constexpr std::size_t mostSplits{13};
 LeaseTimePattern::LeaseTimePattern(LeaseNeedle needle, LeaseTimeTexts &texts)
     : m_needle{std::move(needle)}
     , m_texts{texts}
+    , m_canBeInTimesOfDay{canBeInTimesOfDay()}
     , m_timesOfDay(secondsOfDay)
 {
     const QString &text{m_needle.text};
     for (int at{text.indexOf(LeaseTimeTexts::separator)}; at >= 0 && m_splits.size() < mostSplits;
          at = text.indexOf(LeaseTimeTexts::separator, at + 1))
         m_splits.push_back({text.left(at), text.mid(at + 1)});
+}
+
+bool LeaseTimePattern::isIn(LeaseTime time) const
+{
+    if (!time.isValid() || !canBeOn(time))
+        return false;
+    const unsigned onDate{dateFits(time) & ~known};
+    return (onDate & inDate) != 0 || (timeOfDayFits(time) & onDate) != 0;
+}
+
+bool LeaseTimePattern::canBeOn(LeaseTime time) const
+{
+    return m_canBeInTimesOfDay || (dateFits(time) & ~(known | inTimeOfDay)) != 0;
+}
+
+/// Whether all its characters are in times of day.
+bool LeaseTimePattern::canBeInTimesOfDay() const
+{
+    const QSet<QChar> characters{m_texts.timeOfDayCharacters()};
+    const auto isThere = [this, &characters](QChar character) {
+        // Case matters for other letters than a character alone tells: for those outside of the first plane.
+        return character.isSurrogate() || characters.contains(character) ||
+               (m_needle.sensitivity == Qt::CaseInsensitive &&
+                std::any_of(characters.begin(), characters.end(),
+                            [character](QChar other) { return other.toCaseFolded() == character.toCaseFolded(); }));
+    };
+    return std::all_of(m_needle.text.begin(), m_needle.text.end(), isThere);
 }
 
 template<typename FitsSplit>
@@ -53,6 +82,14 @@ LeaseTimePattern::Fits LeaseTimePattern::timeOfDayFits(LeaseTime time) const
 }
 
 LeaseTimePattern::Fits LeaseTimePattern::dateFits(LeaseTime time) const
+{
+    if (time.dateKey() == m_lastDate)
+        return m_lastDateFits;
+    m_lastDate = time.dateKey();
+    return m_lastDateFits = findDateFits(time);
+}
+
+LeaseTimePattern::Fits LeaseTimePattern::findDateFits(LeaseTime time) const
 {
     const std::size_t year{time.dateKey() >> 16U};
     if (year >= m_years.size())

@@ -19,7 +19,10 @@ class LeaseTimePattern final
 public:
     LeaseTimePattern(LeaseNeedle needle, LeaseTimeTexts &texts);
 
-    bool isIn(LeaseTime time) const { return time.isValid() && (timeOfDayFits(time) & dateFits(time) & ~known) != 0; }
+    bool isIn(LeaseTime time) const;
+
+    /// Whether it may be in the text of any time of the day of `time`.
+    bool canBeOn(LeaseTime time) const;
 
 private:
     /// The bit `known`, and one for each place where the needle can be in a text: in the time of day, in the date, and
@@ -43,12 +46,19 @@ private:
 
     Fits timeOfDayFits(LeaseTime time) const;
     Fits dateFits(LeaseTime time) const;
+    Fits findDateFits(LeaseTime time) const;
     template<typename FitsSplit>
     Fits findFits(unsigned in, unsigned inOther, const QString &text, const FitsSplit &fitsSplit) const;
+
+    bool canBeInTimesOfDay() const;
 
     LeaseNeedle m_needle;
     LeaseTimeTexts &m_texts;
     std::vector<Split> m_splits;
+    bool m_canBeInTimesOfDay;
     mutable std::vector<Fits> m_timesOfDay;
     mutable std::vector<std::unique_ptr<Year>> m_years;
+    // Most times are of the same date as the one before.
+    mutable quint32 m_lastDate{0};
+    mutable Fits m_lastDateFits{0};
 };

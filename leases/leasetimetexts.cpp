@@ -13,13 +13,9 @@ QString LeaseTimeTexts::text(LeaseTime time)
     return time.isValid() ? timeOfDayText(time) + separator + dateText(time) : QString{};
 }
 
-QString LeaseTimeTexts::timeOfDayText(LeaseTime time)
-{
-    followLocale();
-    if (!m_timesOfDay)
-        m_timesOfDay.emplace(m_locale);
-    return m_timesOfDay->text(time.time());
-}
+QString LeaseTimeTexts::timeOfDayText(LeaseTime time) { return timesOfDay().text(time.time()); }
+
+QSet<QChar> LeaseTimeTexts::timeOfDayCharacters() { return timesOfDay().characters(); }
 
 QString LeaseTimeTexts::dateText(LeaseTime time)
 {
@@ -30,6 +26,14 @@ QString LeaseTimeTexts::dateText(LeaseTime time)
     if (text == m_dates.end())
         text = m_dates.insert(time.dateKey(), m_locale.toString(time.date(), QLocale::NarrowFormat));
     return *text;
+}
+
+const TimeOfDayTexts &LeaseTimeTexts::timesOfDay()
+{
+    followLocale();
+    if (!m_timesOfDay)
+        m_timesOfDay.emplace(m_locale);
+    return *m_timesOfDay;
 }
 
 void LeaseTimeTexts::followLocale()

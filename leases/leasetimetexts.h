@@ -23,9 +23,12 @@ public:
     /// What comes before and after the separator in the text of a valid time.
     QString timeOfDayText(LeaseTime time);
     QString dateText(LeaseTime time);
+    /// All characters that come before the separator in any text.
+    QSet<QChar> timeOfDayCharacters();
 
 private:
     void followLocale();
+    const TimeOfDayTexts &timesOfDay();
 
     QLocale m_locale;
     QHash<quint32, QString> m_dates;

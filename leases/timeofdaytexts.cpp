@@ -49,6 +49,15 @@ TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
         m_minutes[i] = numberIn(text(0, static_cast<int>(i), number), first.minute);
         m_seconds[i] = numberIn(text(0, number, static_cast<int>(i)), first.second);
     }
+
+    const auto addCharacters = [this](const QString &of) {
+        for (const QChar character : of)
+            m_characters.insert(character);
+    };
+    for (const Hour &hour : m_hours)
+        addCharacters(hour.text);
+    std::for_each(m_minutes.begin(), m_minutes.end(), addCharacters);
+    std::for_each(m_seconds.begin(), m_seconds.end(), addCharacters);
 }
 
 /// Where `left` differs from `right`, which has the same length.

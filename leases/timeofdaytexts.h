@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #pragma once
 
+#include <QSet>
 #include <QString>
 #include <QTime>
 
@@ -16,6 +17,9 @@ public:
     explicit TimeOfDayTexts(const QLocale &locale);
 
     QString text(QTime time) const;
+
+    /// All characters that are in any of the texts.
+    const QSet<QChar> &characters() const { return m_characters; }
 
 private:
     /// Where a number stands in a text.
@@ -38,4 +42,5 @@ private:
     std::array<Hour, 24> m_hours;
     std::array<QString, 60> m_minutes;
     std::array<QString, 60> m_seconds;
+    QSet<QChar> m_characters;
 };

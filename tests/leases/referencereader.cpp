@@ -139,8 +139,11 @@ LeaseRows rowsOf(const LeaseTable &table)
     LeaseTimeTexts times;
     for (int row{0}; row < table.size(); ++row) {
         const Lease &lease{table.at(row)};
-        const auto text = [&](LeaseTexts::Id id) { return decodeLeaseText(table.texts().at(id)); };
-        rows.append(QStringList{table.addressText(lease.address), text(lease.mac), text(lease.host), text(lease.state),
+        const auto text = [&](LeaseColumn column, LeaseTexts::Id id) {
+            return decodeLeaseText(table.texts(column).at(id));
+        };
+        rows.append(QStringList{table.addressText(lease.address), text(LeaseColumn::Mac, lease.mac),
+                                text(LeaseColumn::HostName, lease.host), text(LeaseColumn::State, lease.state),
                                 times.text(lease.start), times.text(lease.end)});
     }
     return rows;
