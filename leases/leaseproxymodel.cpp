@@ -5,8 +5,6 @@
 #include "leases/leaseneedle.h"
 #include "leases/leasesearch.h"
 
-#include <QSignalBlocker>
-
 #include <algorithm>
 
 namespace {
@@ -50,11 +48,8 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
     beginResetModel();
     m_text = text;
     searchAgain();
-    {
-        // The base's own notices would move rows one by one, or twice.
-        const QSignalBlocker blocker{this};
-        invalidate();
-    }
+    // Upon the reset the base asks about all rows anew. Its own ways to have that done would move rows one by one, or
+    // ask twice where a row is current.
     endResetModel();
 }
 
