@@ -86,6 +86,10 @@ class MenuEntry(desktop.Program):
         )
 
 
+def tree_of(window):
+    return next((control for control in window.below() if isinstance(control, desktop.Tree)), None)
+
+
 class Start(unittest.TestCase):
     def start(self, password):
         self.agent = Agent(password)
@@ -102,7 +106,7 @@ class Start(unittest.TestCase):
     def test_with_the_password_shows_the_configuration(self):
         self.start("secret")
         window = self.program.window(desktop.MAIN_TITLE)
-        tree = window.find("tree", "Topology")
+        tree = self.program.wait(lambda: tree_of(window), lambda: f"a tree in {window}")
         lines = self.program.wait(tree.lines, lambda: "a tree with rows")
         self.assertEqual(lines[0], "All network")
         self.assertIn("    Default lease time: 10 minutes", lines)
