@@ -11,6 +11,7 @@
 #include "common/fileio.h"
 #include "common/paths.h"
 #include "config/dhcpdconfigmodel.h"
+#include "dialogs/spokenfocus.h"
 #include "platform/orvhelpmenu.h"
 #include "platform/packagemanager.h"
 #include "ui_fmain.h"
@@ -143,6 +144,9 @@ void FMain::setUpKeys()
         {QKeySequence::keyBindings(QKeySequence::Copy), m_ui->dhcpdLeaseTable, &FMain::copyLease},
         {QKeySequence::keyBindings(QKeySequence::Find), this, &FMain::goToLeaseSearch},
     };
+    for (QAbstractItemView *view :
+         std::initializer_list<QAbstractItemView *>{m_ui->topologyTree, m_ui->dhcpdLeaseTable})
+        new SpokenFocus{view};
     for (const auto &[keys, widget, slot] : shortcuts) {
         for (const QKeySequence &key : keys) {
             auto *shortcut = new QShortcut{key, widget};

@@ -7,6 +7,7 @@
 #include "app/pathwatch.h"
 #include "app/windowtext.h"
 #include "common/paths.h"
+#include "dialogs/buttons.h"
 #include "ui_fmain.h"
 
 #include <QClipboard>
@@ -67,6 +68,7 @@ void LeasePage::setUpSearch()
     m_ui.searchPrevLease->setIcon(QIcon::fromTheme(QStringLiteral("previous")));
     m_ui.searchNextLease->setIcon(QIcon::fromTheme(QStringLiteral("next")));
     for (QToolButton *button : {m_ui.searchPrevLease, m_ui.searchNextLease}) {
+        buttons::pressByReturn(button);
         button->setAutoRaise(true);
         button->setEnabled(false);
     }

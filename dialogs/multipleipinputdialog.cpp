@@ -4,6 +4,7 @@
 #include "config/values.h"
 #include "dialogs/buttons.h"
 #include "dialogs/ipinputdialog.h"
+#include "dialogs/spokenfocus.h"
 #include "ui_multipleipinputdialog.h"
 
 MultipleIpInputDialog::MultipleIpInputDialog(QWidget *parent)
@@ -13,6 +14,7 @@ MultipleIpInputDialog::MultipleIpInputDialog(QWidget *parent)
     m_ui->setupUi(this);
     connect(m_ui->addButton, &QPushButton::clicked, this, &MultipleIpInputDialog::handleAddIp);
     connect(m_ui->removeButton, &QPushButton::clicked, this, &MultipleIpInputDialog::handleRemoveIps);
+    new SpokenFocus{m_ui->ipList};
     for (QPushButton *button : {m_ui->addButton, m_ui->removeButton})
         buttons::pressByReturn(button);
     connect(m_ui->ipList, &QListWidget::currentItemChanged, this, [this] { m_ui->removeButton->setEnabled(true); });

@@ -5,6 +5,7 @@
 #include "dialogs/netmask.h"
 #include "dialogs/patterns.h"
 #include "dialogs/routemodel.h"
+#include "dialogs/spokenfocus.h"
 #include "ui_staticrouteinputdialog.h"
 
 #include <QHostAddress>
@@ -81,6 +82,7 @@ StaticRouteInputDialog::StaticRouteInputDialog(QWidget *parent)
     m_ui->removeButton->setIcon(QIcon::fromTheme(QStringLiteral("list-remove")));
     connect(m_ui->addButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleAddStaticRoute);
     connect(m_ui->removeButton, &QPushButton::clicked, this, &StaticRouteInputDialog::handleRemoveStaticRoute);
+    new SpokenFocus{m_ui->StaticRouteTable};
     for (QPushButton *button : {m_ui->addButton, m_ui->removeButton})
         buttons::pressByReturn(button);
     connect(m_ui->StaticRouteTable, &QTableView::clicked, this, [this] { m_ui->removeButton->setEnabled(true); });

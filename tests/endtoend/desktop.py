@@ -263,8 +263,7 @@ class Control:
     def click(self, button=1, count=1):
         if not self.is_enabled:
             self.program.wait(lambda: self.is_enabled, lambda: f"{self} enabled")
-        self.reach()
-        self.program.click(button, count)
+        self.program.hand.click(self, button, count)
 
     def double_click(self):
         self.click(count=2)
@@ -501,14 +500,14 @@ class Row:
         return self.cells[0].has("expanded")
 
     def click(self, **options):
-        self.view.scroll_to(self.cells[0])
+        self.view.program.hand.bring_in_sight(self.cells[0], self.view)
         self.cells[0].click(**options)
 
     def double_click(self):
         self.click(count=2)
 
     def context_menu(self):
-        self.view.scroll_to(self.cells[0])
+        self.view.program.hand.bring_in_sight(self.cells[0], self.view)
         return self.cells[0].context_menu()
 
 
@@ -599,6 +598,19 @@ class Tree(View):
 CLASSES = {pyatspi.ROLE_TREE: Tree, pyatspi.ROLE_TABLE: Table, pyatspi.ROLE_SPIN_BUTTON: SpinBox}
 
 
+class Mouse:
+    """The hand on the mouse, by which everything is used unless a test takes another."""
+
+    @staticmethod
+    def bring_in_sight(cell, view):
+        view.scroll_to(cell)
+
+    @staticmethod
+    def click(control, button, count):
+        control.reach()
+        control.program.click(button, count)
+
+
 class Program:
     """The program as a process, and its windows."""
 
@@ -617,6 +629,7 @@ class Program:
         self.known = set()  # the paths of windows that the test knows of
         self.menus = []  # the menus that have been opened, the last one last
         self.last_click = (None, 0.0)
+        self.hand = Mouse()
         pyatspi.Registry.registerEventListener(self.note_menu, "object:state-changed:showing")
 
     # --- Its life

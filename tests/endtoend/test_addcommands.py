@@ -246,6 +246,16 @@ CANCELLED_FIRST = (
 )
 
 
+class Menus(CommandTest):
+    SITE = SITE
+
+    def test_have_these_entries(self):
+        for place, entries in MENUS.items():
+            with self.case(command="the menu", place=place.row):
+                menu = self.topology.row(*place.row).context_menu()
+                self.assertEqual(self.offered(menu), entries | {("Add arbitrary declaration",)} | ADD_PARAMETER)
+
+
 class Adds(CommandTest):
     SITE = SITE
 
@@ -265,12 +275,6 @@ class Adds(CommandTest):
             return []
         self.expect_added(add.place.tree_lines(add.lines))
         return add.place.file_lines(add.lines)
-
-    def test_menus_have_these_entries(self):
-        for place, entries in MENUS.items():
-            with self.case(command="the menu", place=place.row):
-                menu = self.topology.row(*place.row).context_menu()
-                self.assertEqual(self.offered(menu), entries | {("Add arbitrary declaration",)} | ADD_PARAMETER)
 
     def test_commands_add_to_tree_and_file(self):
         lines = []

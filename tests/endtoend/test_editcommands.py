@@ -288,6 +288,19 @@ host plotter.lan {
 )
 
 
+class Menus(CommandTest):
+    SITE = SITE
+
+    def test_have_these_entries(self):
+        read = set(BLOCKS)
+        for line in self.lines:
+            kind = line[-1].split(":")[0]
+            if kind not in read:
+                read.add(kind)
+                with self.case(command="the menu", row=line):
+                    self.assertEqual(self.offered(self.topology.row(*line).context_menu()), CHANGES)
+
+
 class Changes(CommandTest):
     SITE = SITE
 
@@ -329,12 +342,3 @@ class Changes(CommandTest):
         self.assertEqual(len(removed), len(REMOVED))
         self.change(removed, self.remove)
         self.assertTrue(self.topology.row(*SUBNET.row).is_expanded)
-
-    def test_menus_have_these_entries(self):
-        read = set(BLOCKS)
-        for line in self.lines:
-            kind = line[-1].split(":")[0]
-            if kind not in read:
-                read.add(kind)
-                with self.case(command="the menu", row=line):
-                    self.assertEqual(self.offered(self.topology.row(*line).context_menu()), CHANGES)
