@@ -164,7 +164,7 @@
     </message>
     <message>
         <source>Error editing &apos;%1&apos;. The block would be nested too deeply.</source>
-        <translation>Erreur de modification de « %1 ». Le bloc serait trop profondément imbriqué.</translation>
+        <translation>Erreur de modification de «&#xa0;%1&#xa0;». Le bloc serait trop profondément imbriqué.</translation>
     </message>
 </context>
 <context>
