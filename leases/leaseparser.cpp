@@ -44,13 +44,36 @@ std::size_t quoteOrComment(std::string_view line, std::size_t begin)
     return place == line.end() ? npos : static_cast<std::size_t>(place - line.begin());
 }
 
-/// Whether there is anything in a part of a line outside of quotes by which a line is taken for more than nothing.
-bool hasKeyword(std::string_view outside)
+/// What a line is taken for.
+enum class Meaning
 {
-    constexpr std::array keywords{"{"sv,      "}"sv,   "hardware"sv, "client-hostname"sv, "binding state"sv,
-                                  "starts"sv, "ends"sv};
-    return std::any_of(keywords.begin(), keywords.end(),
-                       [outside](std::string_view keyword) { return contains(outside, keyword); });
+    None,
+    BlockStart,
+    Hardware,
+    HostName,
+    State,
+    Start,
+    End,
+    BlockEnd
+};
+
+/// What a line means by those of its parts that are outside of quotes and comments.
+Meaning meaningOf(std::string_view outside)
+{
+    const auto has = [outside](std::string_view keyword) { return contains(outside, keyword); };
+    if (has("{"sv))
+        return Meaning::BlockStart;
+    if (has("hardware"sv))
+        return Meaning::Hardware;
+    if (has("client-hostname"sv))
+        return Meaning::HostName;
+    if (has("binding state"sv) && !has("next"sv) && !has("rewind"sv))
+        return Meaning::State;
+    if (has("starts"sv))
+        return Meaning::Start;
+    if (has("ends"sv))
+        return Meaning::End;
+    return has("}"sv) ? Meaning::BlockEnd : Meaning::None;
 }
 
 /// The parts of a line that are neither quoted nor a comment. The quotes stay, so that what they separate is not
@@ -376,12 +399,12 @@ const char *LeaseParser::afterSetting(const char *begin, const char *end)
     return isPlainValue && isHarmless(line.substr(0, value)) ? line.data() + lineFeed + 1 : nullptr;
 }
 
-/// Whether what comes before a value has no keyword.
+/// Whether a line means nothing by what comes before its value.
 bool LeaseParser::isHarmless(std::string_view beginning)
 {
     if (std::find(m_harmless.begin(), m_harmless.end(), beginning) != m_harmless.end())
         return true;
-    if (hasKeyword(beginning))
+    if (meaningOf(beginning) != Meaning::None)
         return false;
     if (m_harmless.size() == mostHarmless)
         m_harmless.clear();
@@ -391,23 +414,32 @@ bool LeaseParser::isHarmless(std::string_view beginning)
 
 void LeaseParser::readLine(std::string_view line)
 {
-    const std::string outside{outsideOfQuotes(line)};
-    const auto has = [&outside](std::string_view keyword) { return contains(outside, keyword); };
-    if (has("{"sv)) {
+    switch (meaningOf(outsideOfQuotes(line))) {
+    case Meaning::None:
+        break;
+    case Meaning::BlockStart:
         startBlock(word(line, 1));
-    } else if (has("hardware"sv)) {
+        break;
+    case Meaning::Hardware:
         setMac(withoutLast(word(line, 4)));
-    } else if (has("client-hostname"sv)) {
+        break;
+    case Meaning::HostName: {
         const std::optional<std::string_view> quoted{quotedAt(line, wordPlace(line, 3))};
         setHost(quoted ? std::string{*quoted} : withoutEnds(word(line, 3), 1, 2));
-    } else if (has("binding state"sv) && !has("next"sv) && !has("rewind"sv)) {
+        break;
+    }
+    case Meaning::State:
         setState(withoutLast(word(line, 4)));
-    } else if (has("starts"sv)) {
+        break;
+    case Meaning::Start:
         m_values.lease.start = timeOf(line);
-    } else if (has("ends"sv)) {
+        break;
+    case Meaning::End:
         m_values.lease.end = timeOf(line);
-    } else if (has("}"sv)) {
+        break;
+    case Meaning::BlockEnd:
         endBlock();
+        break;
     }
 }
 

@@ -60,20 +60,15 @@ QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const
     if (!model || !isSearchable(start, role, hits, flags))
         return QSortFilterProxyModel::match(start, role, value, hits, flags);
     const QModelIndex first{mapToSource(start)};
-    const LeaseSearch &search{searchFor(value.toString(), flags)};
-    const auto column = static_cast<LeaseColumn>(first.column());
-    QModelIndexList matches;
-    // Where many rows have the text, one of the first has it.
-    const int few{std::min(start.row() + fewRows, rowCount())};
-    for (int row{start.row()}; hits > 0 && row < few; ++row) {
-        const QModelIndex candidate{index(row, start.column())};
-        if (search.contains(mapToSource(candidate).row(), column))
-            matches.append(candidate);
-        if (matches.size() == hits)
-            return matches;
-    }
+    const LeaseNeedle needle{value.toString(),
+                             flags.testFlag(Qt::MatchCaseSensitive) ? Qt::CaseSensitive : Qt::CaseInsensitive};
+    if (!m_lastMatch || !(m_lastMatch->needle() == needle))
+        m_lastMatch = model->search(needle);
+    QModelIndexList matches{firstMatches(start, hits)};
+    if (matches.size() == hits)
+        return matches;
     matches.clear();
-    const LeaseHits found{search.find(column, m_found ? &*m_found : nullptr)};
+    const LeaseHits found{m_lastMatch->find(static_cast<LeaseColumn>(first.column()), m_found ? &*m_found : nullptr)};
     if (found.isEmpty())
         return matches;
     const int rows{model->rowCount()};
@@ -88,17 +83,17 @@ QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const
     return matches;
 }
 
-/// The search for a text that match() was given; the filter's where it is the same, which knows its way already.
-const LeaseSearch &LeaseProxyModel::searchFor(const QString &text, Qt::MatchFlags flags) const
+/// Those matches of m_lastMatch that are in a few rows from `start` on, where one is if many rows have the text.
+QModelIndexList LeaseProxyModel::firstMatches(const QModelIndex &start, int most) const
 {
-    LeaseNeedle needle{text, Qt::CaseSensitive};
-    if (!flags.testFlag(Qt::MatchCaseSensitive) && !needle.isCaseless())
-        needle.sensitivity = Qt::CaseInsensitive;
-    if (m_search && m_search->needle() == needle)
-        return *m_search;
-    if (!m_lastMatch || !(m_lastMatch->needle() == needle))
-        m_lastMatch = leases()->search(needle);
-    return *m_lastMatch;
+    QModelIndexList matches;
+    const int end{std::min(start.row() + fewRows, rowCount())};
+    for (int row{start.row()}; row < end && matches.size() < most; ++row) {
+        const QModelIndex match{index(row, start.column())};
+        if (m_lastMatch->contains(mapToSource(match).row(), static_cast<LeaseColumn>(start.column())))
+            matches.append(match);
+    }
+    return matches;
 }
 
 bool LeaseProxyModel::filterAcceptsRow(int row, const QModelIndex &parent) const

@@ -41,7 +41,7 @@ private:
     const DhcpdLeasesModel *leases() const;
     /// Whether match() can do without the base's search.
     bool isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const;
-    const LeaseSearch &searchFor(const QString &text, Qt::MatchFlags flags) const;
+    QModelIndexList firstMatches(const QModelIndex &start, int most) const;
     void search(const QAbstractItemModel *model);
     void searchAgain();
     void forgetFound();

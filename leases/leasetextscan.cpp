@@ -15,13 +15,8 @@ bool LeaseTextScan::isIn(LeaseTexts::Id id)
     const std::string_view memory{m_texts.memory()};
     const std::string_view text{m_texts.at(id)};
     const auto begin = static_cast<std::size_t>(text.data() - memory.data());
-    if (begin < m_begin) {
-        if (id != m_last) {
-            m_last = id;
-            m_isInLast = m_pattern.isIn(text);
-        }
-        return m_isInLast;
-    }
+    if (begin < m_begin)
+        return m_pattern.isIn(text);
     if (begin > m_match) {
         m_begin = begin;
         m_match = m_pattern.nextMatch(memory, begin);

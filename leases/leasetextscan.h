@@ -7,7 +7,7 @@ class LeaseTextPattern;
 
 /// Applies a pattern to many texts of a column, of which few have the needle: one pass over the memory in which they
 /// lie finds where the next one is, and all before are answered by their place. It is fast if they are asked for in the
-/// order in which they were added, or as one text again and again.
+/// order in which they were added.
 class LeaseTextScan final
 {
 public:
@@ -24,7 +24,4 @@ private:
     // Offsets in the memory of the texts: none that begins between the one and the other has the needle.
     std::size_t m_begin{0};
     std::size_t m_match;
-    // The answer for the last text that lies before m_begin.
-    LeaseTexts::Id m_last{0};
-    bool m_isInLast{false};
 };

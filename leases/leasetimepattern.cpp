@@ -83,14 +83,6 @@ LeaseTimePattern::Fits LeaseTimePattern::timeOfDayFits(LeaseTime time) const
 
 LeaseTimePattern::Fits LeaseTimePattern::dateFits(LeaseTime time) const
 {
-    if (time.dateKey() == m_lastDate)
-        return m_lastDateFits;
-    m_lastDate = time.dateKey();
-    return m_lastDateFits = findDateFits(time);
-}
-
-LeaseTimePattern::Fits LeaseTimePattern::findDateFits(LeaseTime time) const
-{
     const std::size_t year{time.dateKey() >> 16U};
     if (year >= m_years.size())
         m_years.resize(year + 1);

@@ -46,7 +46,6 @@ private:
 
     Fits timeOfDayFits(LeaseTime time) const;
     Fits dateFits(LeaseTime time) const;
-    Fits findDateFits(LeaseTime time) const;
     template<typename FitsSplit>
     Fits findFits(unsigned in, unsigned inOther, const QString &text, const FitsSplit &fitsSplit) const;
 
@@ -58,7 +57,4 @@ private:
     bool m_canBeInTimesOfDay;
     mutable std::vector<Fits> m_timesOfDay;
     mutable std::vector<std::unique_ptr<Year>> m_years;
-    // Most times are of the same date as the one before.
-    mutable quint32 m_lastDate{0};
-    mutable Fits m_lastDateFits{0};
 };
