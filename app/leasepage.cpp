@@ -5,6 +5,7 @@
 #include "app/leasecolumns.h"
 #include "app/leaseviewstate.h"
 #include "app/pathwatch.h"
+#include "app/searchfeedback.h"
 #include "app/windowtext.h"
 #include "common/paths.h"
 #include "dialogs/buttons.h"
@@ -14,13 +15,6 @@
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QMenu>
-
-namespace {
-
-constexpr auto foundStyle = "QLineEdit { color: black; }";
-constexpr auto notFoundStyle = "QLineEdit { color: red; }";
-
-} // namespace
 
 LeasePage::LeasePage(const Ui::FMain &ui, QWidget *window)
     : m_ui{ui}
@@ -58,12 +52,15 @@ void LeasePage::setUpTable()
 void LeasePage::setUpSearch()
 {
     QLineEdit *field{m_ui.searchLease};
+    m_searchFeedback = new SearchFeedback{field, &m_proxy};
     field->addAction(QIcon::fromTheme(QStringLiteral("edit-find")), QLineEdit::LeadingPosition)
         ->setText(WindowText::tr("Search"));
     field->setClearButtonEnabled(true);
-    // Qt leaves its button without a text that could be said.
-    if (auto *clear = field->findChild<QAction *>(QStringLiteral("_q_qlineeditclearaction")))
+    // Qt leaves its button without a text that could be said, and with a picture of the icon as it was at first.
+    if (auto *clear = field->findChild<QAction *>(QStringLiteral("_q_qlineeditclearaction"))) {
         clear->setText(WindowText::tr("Clear the search"));
+        clear->setIcon(QIcon::fromTheme(QStringLiteral("edit-clear"), clear->icon()));
+    }
 
     m_ui.searchPrevLease->setIcon(QIcon::fromTheme(QStringLiteral("previous")));
     m_ui.searchNextLease->setIcon(QIcon::fromTheme(QStringLiteral("next")));
@@ -99,7 +96,7 @@ void LeasePage::search(const QString &text)
 
     const QModelIndexList first{matches(text, 1)};
     const bool isFound{!first.isEmpty()};
-    m_ui.searchLease->setStyleSheet(QLatin1String{isFound || text.isEmpty() ? foundStyle : notFoundStyle});
+    m_searchFeedback->show(isFound || text.isEmpty());
     m_ui.searchPrevLease->setEnabled(isFound);
     m_ui.searchNextLease->setEnabled(isFound);
     if (isFound) {

@@ -14,6 +14,7 @@ class QMenu;
 class QPoint;
 class QString;
 class QWidget;
+class SearchFeedback;
 
 namespace Ui {
 class FMain;
@@ -65,5 +66,6 @@ private:
     LeaseProxyModel m_proxy;
     QMenu *m_menu;                          // the window's
     std::optional<Reservation> m_menuLease; // the one that the open menu is about
+    SearchFeedback *m_searchFeedback{};     // the search field's
     int m_matchPosition{};
 };

@@ -4,10 +4,12 @@
 #include "platform/icontheme.h"
 
 #include <QDirIterator>
+#include <QEvent>
 #include <QFileInfo>
 #include <QGuiApplication>
 #include <QIcon>
 #include <QPalette>
+#include <QPointer>
 
 namespace {
 
@@ -17,11 +19,14 @@ QString &description()
     return text;
 }
 
+const QString lightIcons{QStringLiteral(":/icons/light")};
+const QString darkIcons{QStringLiteral(":/icons/dark")};
+
 // The program asks for the icons that it bundles, and for no others.
 QStringList usedIconNames()
 {
     QStringList names;
-    QDirIterator icons{QStringLiteral(":/icons/hicolor/scalable/actions")};
+    QDirIterator icons{lightIcons + QStringLiteral("/hicolor/scalable/actions")};
     while (icons.hasNext())
         names.append(QFileInfo{icons.next()}.completeBaseName());
     return names;
@@ -29,27 +34,58 @@ QStringList usedIconNames()
 
 // Qt reads one index for each theme, the first that it finds. The system's index of the fallback theme lists hundreds
 // of folders, takes longer to read than all the icons take to draw, and has none that the program needs and ours lacks.
-void useBundledIcons()
+void useBundledIcons(bool darkPalette)
 {
-    const QString bundled{QStringLiteral(":/icons")};
     QStringList paths{QIcon::themeSearchPaths()};
-    paths.removeAll(bundled);
-    paths.prepend(bundled);
+    paths.removeAll(lightIcons);
+    paths.removeAll(darkIcons);
+    paths.prepend(darkPalette ? darkIcons : lightIcons);
     QIcon::setThemeSearchPaths(paths);
     if (QIcon::fallbackThemeName().isEmpty())
         QIcon::setFallbackThemeName(fallbackIconTheme);
 }
 
-void chooseIconTheme()
+void chooseIconTheme(bool darkPalette)
 {
-    const QString named{QIcon::themeName()};
-    if (!named.isEmpty() && named != fallbackIconTheme)
-        return;
-    const bool darkPalette{QGuiApplication::palette().color(QPalette::Window).lightness() < 128};
     const QString chosen{suitableIconTheme(QIcon::themeSearchPaths(), usedIconNames(), darkPalette)};
     // Without a theme name Qt looks nowhere, not even among the bundled icons.
     QIcon::setThemeName(chosen.isEmpty() ? QString{fallbackIconTheme} : chosen);
 }
+
+bool isDarkPalette() { return QGuiApplication::palette().color(QPalette::Window).lightness() < 128; }
+
+/// Keeps the icons legible on the application's palette, whatever that becomes.
+class PaletteIcons final : public QObject
+{
+public:
+    explicit PaletteIcons(QObject *parent)
+        : QObject{parent}
+    {
+        const QString named{QIcon::themeName()};
+        m_choosesTheme = named.isEmpty() || named == fallbackIconTheme;
+        choose();
+        qApp->installEventFilter(this);
+    }
+
+    bool eventFilter(QObject *watched, QEvent *event) override
+    {
+        if (event->type() == QEvent::ApplicationPaletteChange && watched == qApp && isDarkPalette() != m_isDark)
+            choose();
+        return false;
+    }
+
+private:
+    void choose()
+    {
+        m_isDark = isDarkPalette();
+        useBundledIcons(m_isDark);
+        if (m_choosesTheme)
+            chooseIconTheme(m_isDark);
+    }
+
+    bool m_choosesTheme{}; // rather than the desktop
+    bool m_isDark{};
+};
 
 } // namespace
 
@@ -66,8 +102,9 @@ void orvInit(const char *version, const char *descriptionText)
     Q_INIT_RESOURCE(platform);
     QCoreApplication::setApplicationVersion(QString::fromUtf8(version));
     description() = QString::fromUtf8(descriptionText);
-    useBundledIcons();
-    chooseIconTheme();
+    static QPointer<PaletteIcons> icons;
+    delete icons;
+    icons = new PaletteIcons{qApp};
 }
 
 QString orvDescription() { return description(); }

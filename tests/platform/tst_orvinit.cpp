@@ -27,6 +27,7 @@ constexpr std::array iconNames{
     "computer",
     "list-add",
     "list-remove",
+    "edit-clear",
     "edit-find",
     "previous",
     "next",
