@@ -272,7 +272,7 @@ LeaseParser::LeaseParser(LeaseTable &table)
 void LeaseParser::clear()
 {
     m_values = {};
-    m_values.addressText = QString{};
+    m_values.addressText.emplace();
     m_unfinished.clear();
     m_beforeUnfinished.reset();
     m_blockEnded = false;
