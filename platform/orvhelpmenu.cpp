@@ -1,20 +1,20 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "platform/orvhelpmenu.h"
 
+#include "platform/handbookviewer.h"
+#include "platform/helpwindow.h"
 #include "platform/manualpage.h"
 #include "platform/orvinit.h"
 
 #include <QApplication>
-#include <QDialog>
-#include <QDialogButtonBox>
 #include <QMessageBox>
 #include <QTextBrowser>
-#include <QVBoxLayout>
 
 OrvHelpMenu::OrvHelpMenu(QWidget *parent)
     : QMenu{tr("&Help"), parent}
 {
     addCommand(tr("Manual"), &OrvHelpMenu::showManual)->setShortcut(QKeySequence::HelpContents);
+    addCommand(tr("Handbook"), &OrvHelpMenu::showHandbook);
     addSeparator();
     addCommand(tr("About %1").arg(QCoreApplication::applicationName()), &OrvHelpMenu::showAbout);
     addCommand(tr("About Qt"), &OrvHelpMenu::showAboutQt);
@@ -32,22 +32,19 @@ QAction *OrvHelpMenu::addCommand(const QString &text, void (OrvHelpMenu::*comman
 void OrvHelpMenu::showManual()
 {
     if (!m_manual) {
-        m_manual = new QDialog{parentWidget()};
-        m_manual->setAttribute(Qt::WA_DeleteOnClose);
-        m_manual->setWindowTitle(tr("Manual"));
         auto *text = new QTextBrowser;
-        text->setAccessibleName(m_manual->windowTitle());
+        text->setAccessibleName(tr("Manual"));
         text->setHtml(manualPageHtml());
-        auto *buttons = new QDialogButtonBox{QDialogButtonBox::Close};
-        connect(buttons, &QDialogButtonBox::rejected, m_manual, &QDialog::reject);
-        auto *layout = new QVBoxLayout{m_manual};
-        layout->addWidget(text);
-        layout->addWidget(buttons);
-        m_manual->resize(640, 560);
+        m_manual = new HelpWindow{tr("Manual"), text, {640, 560}, parentWidget()};
     }
-    m_manual->show();
-    m_manual->raise();
-    m_manual->activateWindow();
+    m_manual->bringUp();
+}
+
+void OrvHelpMenu::showHandbook()
+{
+    if (!m_handbook)
+        m_handbook = new HelpWindow{tr("Handbook"), new HandbookViewer, {1100, 720}, parentWidget()};
+    m_handbook->bringUp();
 }
 
 void OrvHelpMenu::showAbout()

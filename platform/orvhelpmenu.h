@@ -4,10 +4,10 @@
 #include <QMenu>
 #include <QPointer>
 
-class QDialog;
+class HelpWindow;
 
-/// The Help menu of the main window `parent`: the manual page, and who made the program. It shows nothing while a modal
-/// dialog is open.
+/// The Help menu of the main window `parent`: the manual page, the handbook, and who made the program. It shows nothing
+/// while a modal dialog is open.
 class OrvHelpMenu final : public QMenu
 {
     Q_OBJECT
@@ -19,8 +19,10 @@ public:
 private:
     QAction *addCommand(const QString &text, void (OrvHelpMenu::*command)());
     void showManual();
+    void showHandbook();
     void showAbout();
     void showAboutQt();
 
-    QPointer<QDialog> m_manual;
+    QPointer<HelpWindow> m_manual;
+    QPointer<HelpWindow> m_handbook;
 };

@@ -736,6 +736,25 @@ Möchten Sie fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Nicht gefunden</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Inhalt</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Suchen</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+</context>
+<context>
     <name>HostInputDialog</name>
     <message>
         <source>Dialog</source>
@@ -824,6 +843,10 @@ Möchten Sie fortfahren?</translation>
     <message>
         <source>Configure DHCP server</source>
         <translation>DHCP-Server konfigurieren</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Handbuch</translation>
     </message>
 </context>
 <context>

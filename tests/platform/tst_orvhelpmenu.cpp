@@ -7,9 +7,12 @@
 #include <QAction>
 #include <QDialogButtonBox>
 #include <QDir>
+#include <QLineEdit>
+#include <QListWidget>
 #include <QMainWindow>
 #include <QMenuBar>
 #include <QPushButton>
+#include <QScreen>
 #include <QTest>
 #include <QTextBrowser>
 
@@ -51,7 +54,9 @@ private slots:
     void manualIsInTheLanguageOfTheLocale();
     void everyPageHasAllOfTheEnglishOne_data();
     void everyPageHasAllOfTheEnglishOne();
-    void manualIsOpenedOnce();
+    void handbookShowsItsFirstPage();
+    void windowsAreOpenedOnce_data();
+    void windowsAreOpenedOnce();
     void nothingOpensUnderADialog();
 
 private:
@@ -86,8 +91,8 @@ void OrvHelpMenuTest::entries()
     QStringList texts;
     for (const QAction *action : m_menu->actions())
         texts.append(action->isSeparator() ? QStringLiteral("-") : action->text());
-    QCOMPARE(texts, QStringList({QStringLiteral("Manual"), QStringLiteral("-"), QStringLiteral("About tst_orvhelpmenu"),
-                                 QStringLiteral("About Qt")}));
+    QCOMPARE(texts, QStringList({QStringLiteral("Manual"), QStringLiteral("Handbook"), QStringLiteral("-"),
+                                 QStringLiteral("About tst_orvhelpmenu"), QStringLiteral("About Qt")}));
 }
 
 void OrvHelpMenuTest::aboutTellsNameVersionDescriptionAndLicence()
@@ -191,14 +196,44 @@ void OrvHelpMenuTest::everyPageHasAllOfTheEnglishOne()
     QCOMPARE(missing, QStringList{});
 }
 
-void OrvHelpMenuTest::manualIsOpenedOnce()
+void OrvHelpMenuTest::handbookShowsItsFirstPage()
 {
-    entry(QStringLiteral("Manual"))->trigger();
-    entry(QStringLiteral("Manual"))->trigger();
+    entry(QStringLiteral("Handbook"))->trigger();
+    QCOMPARE(dialogs().size(), 1);
+    QDialog *handbook{dialogs().constFirst()};
+    QVERIFY(handbook->isVisible());
+    QCOMPARE(handbook->windowTitle(), QStringLiteral("Handbook"));
+    const auto *page = handbook->findChild<QTextBrowser *>();
+    QVERIFY(page->toPlainText().startsWith(QStringLiteral("First start\n")));
+    const QSize screen{handbook->screen()->availableSize()};
+    QCOMPARE(handbook->size().boundedTo(screen), handbook->size());
+    QCOMPARE(handbook->focusWidget(), handbook->findChild<QListWidget *>());
+
+    auto *search = handbook->findChild<QLineEdit *>();
+    QTest::keyClicks(search, QStringLiteral("bind9"));
+    QTest::keyClick(search, Qt::Key_Return);
+    QVERIFY(handbook->isVisible());
+    QVERIFY(page->toPlainText().startsWith(QStringLiteral("Dynamic DNS with bind9\n")));
+    QTest::keyClick(search, Qt::Key_Escape);
+    QTRY_VERIFY(dialogs().isEmpty());
+}
+
+void OrvHelpMenuTest::windowsAreOpenedOnce_data()
+{
+    QTest::addColumn<QString>("text");
+    for (const char *text : {"Manual", "Handbook"})
+        QTest::addRow("%s", text) << QString::fromLatin1(text);
+}
+
+void OrvHelpMenuTest::windowsAreOpenedOnce()
+{
+    QFETCH(QString, text);
+    entry(text)->trigger();
+    entry(text)->trigger();
     QCOMPARE(dialogs().size(), 1);
     dialogs().constFirst()->close();
     QTRY_VERIFY(dialogs().isEmpty());
-    entry(QStringLiteral("Manual"))->trigger();
+    entry(text)->trigger();
     QCOMPARE(dialogs().size(), 1);
 }
 
