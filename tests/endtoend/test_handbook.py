@@ -152,7 +152,10 @@ class Restoring(PageTest, ProgramTest):
         self.tree.row("All network", "Default lease time: 2 minutes")
 
 
-@unittest.skipUnless(shutil.which("named"), "named is not there (scripts/fetch-tools)")
+@unittest.skipUnless(
+    shutil.which("named") and shutil.which("named-checkconf"),
+    "bind9 is not there (scripts/fetch-tools, package bind9-utils)",
+)
 class DynamicDns(PageTest, ProgramTest):
     """With the real bind9, whose files and port are those of the private network."""
 
