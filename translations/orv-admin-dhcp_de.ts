@@ -734,6 +734,14 @@ Möchten Sie fortfahren?</translation>
         <source>its key &apos;%1&apos; stands behind this place in the configuration</source>
         <translation>ihr Schlüssel „%1“ steht in der Konfiguration erst nach dieser Stelle</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Gefundene Leases: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Keine Leases gefunden</translation>
+    </message>
 </context>
 <context>
     <name>HandbookViewer</name>

@@ -734,6 +734,33 @@ Tras aplicar estos cambios, la configuración podría ser incorrecta.
         <source>Add parameter</source>
         <translation>Añadir parámetro</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Concesiones encontradas: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>No se encontraron concesiones</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>No encontrado</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Contenido</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Buscar</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Atrás</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -824,6 +851,10 @@ Tras aplicar estos cambios, la configuración podría ser incorrecta.
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Software libre bajo la Licencia Pública General de GNU, versión 3 o posterior. No ofrece ninguna garantía, en la medida en que lo permita la ley.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Manual</translation>
     </message>
 </context>
 <context>

@@ -734,6 +734,33 @@ Voulez-vous continuer&#xa0;?</translation>
         <source>Add parameter</source>
         <translation>Ajouter un paramètre</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Baux trouvés : %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Aucun bail trouvé</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Introuvable</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Sommaire</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Rechercher</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Précédent</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -824,6 +851,10 @@ Voulez-vous continuer&#xa0;?</translation>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Logiciel libre distribué sous la licence publique générale GNU, version 3 ou ultérieure. Il est fourni sans aucune garantie, dans les limites permises par la loi.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Manuel</translation>
     </message>
 </context>
 <context>

@@ -734,6 +734,33 @@ Continuare?</translation>
         <source>Add parameter</source>
         <translation>Aggiungi parametro</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Lease trovati: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Nessun lease trovato</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Non trovato</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Indice</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Cerca</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Indietro</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -824,6 +851,10 @@ Continuare?</translation>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Software libero distribuito secondo la GNU General Public License, versione 3 o successiva. Non è fornita alcuna garanzia, nei limiti consentiti dalla legge.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Manuale</translation>
     </message>
 </context>
 <context>

@@ -734,6 +734,33 @@ Do you want to resume?</source>
         <source>Add parameter</source>
         <translation>パラメーターを追加</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>見つかったリース: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>リースが見つかりません</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>見つかりません</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>目次</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>検索</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>戻る</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -811,7 +838,7 @@ Do you want to resume?</source>
     </message>
     <message>
         <source>Manual</source>
-        <translation>マニュアル</translation>
+        <translation>マニュアルページ</translation>
     </message>
     <message>
         <source>About %1</source>
@@ -824,6 +851,10 @@ Do you want to resume?</source>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>これは GNU 一般公衆利用許諾書 (GNU GPL) バージョン 3 以降のもとで公開されている自由ソフトウェアです。法律で認められる範囲において、いかなる保証もありません。</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>ハンドブック</translation>
     </message>
 </context>
 <context>

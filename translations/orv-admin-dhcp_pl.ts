@@ -734,6 +734,33 @@ Czy kontynuować?</translation>
         <source>Add parameter</source>
         <translation>Dodaj parametr</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Znalezione dzierżawy: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Nie znaleziono dzierżaw</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Nie znaleziono</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Spis treści</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Szukaj</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Wstecz</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -811,7 +838,7 @@ Czy kontynuować?</translation>
     </message>
     <message>
         <source>Manual</source>
-        <translation>Podręcznik</translation>
+        <translation>Strona podręcznika</translation>
     </message>
     <message>
         <source>About %1</source>
@@ -824,6 +851,10 @@ Czy kontynuować?</translation>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Wolne oprogramowanie udostępniane na warunkach Powszechnej Licencji Publicznej GNU (GNU GPL) w wersji 3 lub nowszej. Program nie jest objęty żadną gwarancją w zakresie dozwolonym przez prawo.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Podręcznik</translation>
     </message>
 </context>
 <context>

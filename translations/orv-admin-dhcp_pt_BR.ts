@@ -734,6 +734,33 @@ Deseja continuar?</translation>
         <source>Add parameter</source>
         <translation>Adicionar parâmetro</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Concessões encontradas: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Nenhuma concessão encontrada</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Não encontrado</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Conteúdo</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Pesquisar</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Voltar</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -824,6 +851,10 @@ Deseja continuar?</translation>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Software livre sob a Licença Pública Geral GNU, versão 3 ou posterior. Não há garantia alguma, na medida permitida pela lei.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Manual</translation>
     </message>
 </context>
 <context>

@@ -734,6 +734,33 @@ Do you want to resume?</source>
         <source>Add parameter</source>
         <translation>Добавить параметр</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>Найдено аренд: %1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>Аренды не найдены</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>Не найдено</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>Содержание</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>Поиск</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Назад</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -811,7 +838,7 @@ Do you want to resume?</source>
     </message>
     <message>
         <source>Manual</source>
-        <translation>Руководство</translation>
+        <translation>Страница руководства</translation>
     </message>
     <message>
         <source>About %1</source>
@@ -824,6 +851,10 @@ Do you want to resume?</source>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>Свободное программное обеспечение на условиях Стандартной общественной лицензии GNU (GNU GPL) версии 3 или более поздней. В пределах, допустимых законом, никакие гарантии не предоставляются.</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>Руководство</translation>
     </message>
 </context>
 <context>

@@ -734,6 +734,33 @@ Do you want to resume?</source>
         <source>Add parameter</source>
         <translation>添加参数</translation>
     </message>
+    <message>
+        <source>Leases found: %1</source>
+        <translation>找到的租约：%1</translation>
+    </message>
+    <message>
+        <source>No leases found</source>
+        <translation>未找到租约</translation>
+    </message>
+</context>
+<context>
+    <name>HandbookViewer</name>
+    <message>
+        <source>Not found</source>
+        <translation>未找到</translation>
+    </message>
+    <message>
+        <source>Contents</source>
+        <translation>目录</translation>
+    </message>
+    <message>
+        <source>Search</source>
+        <translation>搜索</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>后退</translation>
+    </message>
 </context>
 <context>
     <name>HostInputDialog</name>
@@ -811,7 +838,7 @@ Do you want to resume?</source>
     </message>
     <message>
         <source>Manual</source>
-        <translation>手册</translation>
+        <translation>手册页</translation>
     </message>
     <message>
         <source>About %1</source>
@@ -824,6 +851,10 @@ Do you want to resume?</source>
     <message>
         <source>Free software under the GNU General Public License, version 3 or later. There is no warranty, to the extent permitted by law.</source>
         <translation>本程序是自由软件，依据 GNU 通用公共许可证（GNU GPL）第 3 版或更新版本发布。在法律许可的范围内，不提供任何担保。</translation>
+    </message>
+    <message>
+        <source>Handbook</source>
+        <translation>手册</translation>
     </message>
 </context>
 <context>
