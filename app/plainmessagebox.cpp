@@ -21,4 +21,7 @@ void PlainMessageBox::setPlainInformativeText(const QString &text)
     if (auto *label = findChild<QLabel *>(QStringLiteral("qt_msgbox_informativelabel")))
         label->setTextFormat(Qt::PlainText);
     setInformativeText(text);
+    // A screen reader has read an open box, and notices what is new of the button that has the keyboard only.
+    if (QWidget * focused{isVisible() ? focusWidget() : nullptr})
+        focused->setAccessibleDescription(text);
 }

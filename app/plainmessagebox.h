@@ -10,6 +10,6 @@ public:
     PlainMessageBox(Icon icon, const QString &title, const QString &text, StandardButtons buttons, QWidget *parent);
     Q_DISABLE_COPY_MOVE(PlainMessageBox)
 
-    /// As setInformativeText(), which would interpret the text.
+    /// As setInformativeText(), which would interpret the text, and which a screen reader does not say in an open box.
     void setPlainInformativeText(const QString &text);
 };

@@ -212,6 +212,7 @@ private slots:
     void search_data();
     void search();
     void searchForAnEnd();
+    void searchSaysHowManyAreFound();
     void clearedSearchKeepsTheFoundLease();
     void clearedSearchShowsEverything();
     void matchesAreScrolledTo();
@@ -323,6 +324,22 @@ void LeaseCommandsTest::searchForAnEnd()
     QCOMPARE(site.addresses(), QStringList{QStringLiteral("10.0.1.9")});
     QCOMPARE(site.table->currentIndex().column(), int{DhcpdLeasesModel::End});
     QVERIFY(site.stepsAreEnabled());
+}
+
+void LeaseCommandsTest::searchSaysHowManyAreFound()
+{
+    const Site site{*m_machine};
+    QCOMPARE(site.field->accessibleDescription(), QString{});
+    site.type(QStringLiteral("10.0.0."));
+    QCOMPARE(site.field->accessibleDescription(), QStringLiteral("Leases found: 4"));
+    site.type(QStringLiteral("11"));
+    QCOMPARE(site.field->accessibleDescription(), QStringLiteral("Leases found: 1"));
+    runOutside(paths::leases(), R"(cat >>"$1")", lease("10.0.0.110", "new"));
+    QTRY_COMPARE(site.field->accessibleDescription(), QStringLiteral("Leases found: 2"));
+    site.type(QStringLiteral("nothing"));
+    QCOMPARE(site.field->accessibleDescription(), QStringLiteral("No leases found"));
+    site.field->clear();
+    QCOMPARE(site.field->accessibleDescription(), QString{});
 }
 
 void LeaseCommandsTest::clearedSearchKeepsTheFoundLease()
