@@ -1,25 +1,24 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "common/textencoding.h"
 
-#include <QTextCodec>
-
 #include <algorithm>
 #include <array>
+#include <cerrno>
+#include <clocale>
 #include <cstdint>
 #include <cstring>
 #include <limits>
 #include <numeric>
+#include <optional>
+#include <string_view>
 
+#include <iconv.h>
 #include <langinfo.h>
 
 namespace {
 
-constexpr int utf8Mib{106};
-constexpr int asciiMib{3};
-constexpr int latin1Mib{4};
-
-// Texts are converted in pieces of this many bytes, so that no UTF-16 copy of a large file stands in memory.
-constexpr int pieceLength{64 * 1024};
+constexpr const char *utf8Charset{"UTF-8"};
+constexpr const char *latin1Charset{"ISO-8859-1"};
 
 using Byte = unsigned char;
 
@@ -88,112 +87,158 @@ bool isUtf8(const QByteArray &text)
     return true;
 }
 
-// The locale's codec, null for UTF-8 and for ASCII, of which UTF-8 is the larger. Null, too, for the few that give the
-// bytes of ASCII another meaning (ICU's Shift_JIS turns control characters around): statements are made of them.
-QTextCodec *localeCodec()
+std::string_view viewOf(const QByteArray &text) { return {text.constData(), static_cast<std::size_t>(text.size())}; }
+
+/// A conversion of texts from one encoding into another by the C library.
+class Converter final
 {
-    QTextCodec *codec{QTextCodec::codecForLocale()};
-    // Debian's ICU takes every locale for a UTF-8 one; the C library knows.
-    if (codec && codec->mibEnum() == utf8Mib)
-        codec = QTextCodec::codecForName(nl_langinfo(CODESET));
-    if (!codec || codec->mibEnum() == utf8Mib || codec->mibEnum() == asciiMib)
-        return nullptr;
-    QByteArray ascii{0x80, '\0'};
+public:
+    Converter(const char *from, const char *to)
+        : m_handle{iconv_open(to, from)}
+    {
+    }
+    ~Converter()
+    {
+        if (isOpen())
+            iconv_close(m_handle);
+    }
+    Q_DISABLE_COPY_MOVE(Converter)
+
+    /// Nothing where the text is not valid, or has a character that the other encoding lacks.
+    std::optional<QByteArray> convert(std::string_view text) const
+    {
+        if (!isOpen())
+            return {};
+        QByteArray converted;
+        converted.reserve(static_cast<int>(text.size()));
+        auto at = const_cast<char *>(text.data()); // iconv() does not write there
+        std::size_t left{text.size()};
+        while (true) {
+            const bool isEnd{left == 0};
+            std::array<char, 4096> piece{};
+            char *end{piece.data()};
+            std::size_t space{piece.size()};
+            const std::size_t failures{iconv(m_handle, isEnd ? nullptr : &at, &left, &end, &space)};
+            const bool isPieceFull{failures == static_cast<std::size_t>(-1) && errno == E2BIG};
+            if (failures != 0 && !isPieceFull)
+                return {};
+            converted.append(piece.data(), static_cast<int>(end - piece.data()));
+            if (isEnd && !isPieceFull)
+                return converted;
+        }
+    }
+
+private:
+    bool isOpen() const { return m_handle != reinterpret_cast<iconv_t>(-1); }
+
+    iconv_t m_handle;
+};
+
+std::optional<QByteArray> toUtf8From(const QByteArray &charset, std::string_view bytes)
+{
+    return Converter{charset.constData(), utf8Charset}.convert(bytes);
+}
+
+std::optional<QByteArray> fromUtf8To(const QByteArray &charset, std::string_view utf8)
+{
+    return Converter{utf8Charset, charset.constData()}.convert(utf8);
+}
+
+// The charset of the environment's locale. The process may have another one: Qt 6 sets it to UTF-8, whatever the
+// environment says.
+QByteArray localeCharset()
+{
+    const locale_t locale{newlocale(LC_CTYPE_MASK, "", nullptr)};
+    if (!locale)
+        return utf8Charset;
+    const QByteArray charset{nl_langinfo_l(CODESET, locale)};
+    freelocale(locale);
+    return charset;
+}
+
+// A few charsets give bytes of ASCII another meaning (Shift_JIS has a currency sign for the backslash); statements are
+// made of them.
+bool holdsAscii(const QByteArray &charset)
+{
+    std::array<char, 0x80> ascii{};
     std::iota(ascii.begin(), ascii.end(), '\0');
-    return codec->toUnicode(ascii) == QLatin1String{ascii.constData(), ascii.size()} ? codec : nullptr;
+    const std::string_view text{ascii.data(), ascii.size()};
+    const std::optional<QByteArray> utf8{toUtf8From(charset, text)};
+    return utf8 && viewOf(*utf8) == text;
 }
 
-// A byte order mark is text like any other: it is neither taken away nor added.
-constexpr QTextCodec::ConversionFlags keepMark{QTextCodec::IgnoreHeader};
-
-QByteArray encoded(QTextCodec *codec, const QString &text)
+bool survivesIn(const QByteArray &charset, const QByteArray &bytes)
 {
-    QTextCodec::ConverterState state{keepMark};
-    return codec->fromUnicode(text.constData(), text.size(), &state);
+    const std::optional<QByteArray> utf8{toUtf8From(charset, viewOf(bytes))};
+    return utf8 && fromUtf8To(charset, viewOf(*utf8)) == bytes;
 }
 
-// Calls `use` with the texts of the pieces of `bytes`.
-template<typename Use>
-void decodePieces(QTextCodec *codec, const QByteArray &bytes, Use use)
+bool continuesCharacter(char byte) { return (static_cast<Byte>(byte) & 0xC0U) == 0x80; }
+
+// Where a text of UTF-8 can be parted, near its middle if possible; its end when it is one character.
+std::size_t middleOf(std::string_view utf8)
 {
-    QTextDecoder decoder{codec, keepMark};
-    for (int at{}; at < bytes.size(); at += pieceLength)
-        use(decoder.toUnicode(bytes.constData() + at, std::min(pieceLength, bytes.size() - at)));
+    std::size_t middle{utf8.size() / 2};
+    while (middle > 0 && continuesCharacter(utf8[middle]))
+        --middle;
+    if (middle > 0)
+        return middle;
+    const auto second = std::find_if_not(utf8.begin() + 1, utf8.end(), continuesCharacter);
+    return static_cast<std::size_t>(second - utf8.begin());
 }
 
-bool survivesIn(QTextCodec *codec, const QByteArray &bytes)
+// Halves what the charset cannot hold until the characters that it lacks stand alone.
+QByteArray encodedWithGaps(const QByteArray &charset, std::string_view utf8)
 {
-    int length{};
-    bool same{true};
-    decodePieces(codec, bytes, [&](const QString &text) {
-        const QByteArray back{same ? encoded(codec, text) : QByteArray{}};
-        same = same && back.size() <= bytes.size() - length &&
-               std::equal(back.cbegin(), back.cend(), bytes.cbegin() + length);
-        length += back.size();
-    });
-    return same && length == bytes.size();
-}
-
-bool isPairAt(const QString &text, int at)
-{
-    return at + 1 < text.size() && text.at(at).isHighSurrogate() && text.at(at + 1).isLowSurrogate();
-}
-
-// Halves what the codec cannot hold until the characters that it lacks stand alone.
-QByteArray encodedWithGaps(QTextCodec *codec, const QString &text)
-{
-    QByteArray bytes{encoded(codec, text)};
-    if (QTextDecoder{codec, keepMark}.toUnicode(bytes) == text)
-        return bytes;
-    if (text.size() == 1 || (text.size() == 2 && isPairAt(text, 0)))
-        return text.toUtf8();
-    const int half{text.size() / 2 + (isPairAt(text, text.size() / 2 - 1) ? 1 : 0)};
-    return encodedWithGaps(codec, text.left(half)) + encodedWithGaps(codec, text.mid(half));
+    const std::optional<QByteArray> bytes{fromUtf8To(charset, utf8)};
+    if (bytes) {
+        const std::optional<QByteArray> back{toUtf8From(charset, viewOf(*bytes))};
+        if (back && viewOf(*back) == utf8)
+            return *bytes;
+    }
+    const std::size_t middle{middleOf(utf8)};
+    if (middle == utf8.size())
+        return {utf8.data(), static_cast<int>(utf8.size())};
+    return encodedWithGaps(charset, utf8.substr(0, middle)) + encodedWithGaps(charset, utf8.substr(middle));
 }
 
 // One byte of a text takes two in a QString, and up to three as UTF-8.
 static_assert(qint64{3} * TextEncoding::longestText < std::numeric_limits<int>::max());
 
-QTextCodec *utf8Codec() { return QTextCodec::codecForMib(utf8Mib); }
-
 } // namespace
 
-TextEncoding::TextEncoding(QTextCodec *codec)
-    : m_codec{codec}
+TextEncoding::TextEncoding(const QByteArray &charset)
+    : m_charset{charset}
 {
 }
 
-TextEncoding TextEncoding::detect(const QByteArray &bytes)
+TextEncoding TextEncoding::detect(const QByteArray &bytes) { return detect(bytes, localeCharset()); }
+
+TextEncoding TextEncoding::detect(const QByteArray &bytes, const QByteArray &charset)
 {
-    QTextCodec *locale{localeCodec()};
-    if (locale && (isAscii(bytes) || survivesIn(locale, bytes)))
-        return TextEncoding{locale};
-    return isUtf8(bytes) ? TextEncoding{} : TextEncoding{QTextCodec::codecForMib(latin1Mib)};
+    if (charset != utf8Charset && holdsAscii(charset) && (isAscii(bytes) || survivesIn(charset, bytes)))
+        return TextEncoding{charset};
+    return isUtf8(bytes) ? TextEncoding{} : TextEncoding{latin1Charset};
 }
 
 QString TextEncoding::decode(const QByteArray &bytes) const
 {
-    return QTextDecoder{m_codec ? m_codec : utf8Codec(), keepMark}.toUnicode(bytes);
+    const QByteArray utf8{toUtf8(bytes)};
+    const QString text{QString::fromUtf8(utf8.constData(), utf8.size())};
+    // QString takes a byte order mark away, which is text like any other.
+    return utf8.startsWith("\xEF\xBB\xBF") ? QChar{QChar::ByteOrderMark} + text : text;
 }
 
-QByteArray TextEncoding::encode(const QString &text) const { return m_codec ? fromUtf8(text.toUtf8()) : text.toUtf8(); }
+QByteArray TextEncoding::encode(const QString &text) const { return fromUtf8(text.toUtf8()); }
 
 QByteArray TextEncoding::toUtf8(const QByteArray &bytes) const
 {
-    if (!m_codec || isAscii(bytes))
+    if (m_charset.isEmpty() || isAscii(bytes))
         return bytes;
-    QByteArray utf8;
-    utf8.reserve(bytes.size());
-    decodePieces(m_codec, bytes, [&](const QString &text) { utf8 += text.toUtf8(); });
-    return utf8;
+    return toUtf8From(m_charset, viewOf(bytes)).value_or(bytes);
 }
 
 QByteArray TextEncoding::fromUtf8(const QByteArray &utf8) const
 {
-    if (!m_codec || isAscii(utf8))
-        return utf8;
-    QByteArray bytes;
-    bytes.reserve(utf8.size());
-    decodePieces(utf8Codec(), utf8, [&](const QString &text) { bytes += encodedWithGaps(m_codec, text); });
-    return bytes;
+    return m_charset.isEmpty() || isAscii(utf8) ? utf8 : encodedWithGaps(m_charset, viewOf(utf8));
 }

@@ -4,8 +4,6 @@
 #include <QByteArray>
 #include <QString>
 
-class QTextCodec;
-
 /// The encoding of one text file.
 ///
 /// A file is read in the locale's encoding where it is valid there, else as UTF-8 where it is valid there, else as
@@ -24,6 +22,9 @@ public:
     /// The encoding in which `bytes` are read; it decodes and encodes them without loss.
     static TextEncoding detect(const QByteArray &bytes);
 
+    /// The same in a locale of another charset.
+    static TextEncoding detect(const QByteArray &bytes, const QByteArray &charset);
+
     QString decode(const QByteArray &bytes) const;
     QByteArray encode(const QString &text) const;
 
@@ -32,7 +33,7 @@ public:
     QByteArray fromUtf8(const QByteArray &utf8) const;
 
 private:
-    explicit TextEncoding(QTextCodec *codec);
+    explicit TextEncoding(const QByteArray &charset);
 
-    QTextCodec *m_codec{}; // null: UTF-8
+    QByteArray m_charset; // as the C library names it; empty: UTF-8
 };
