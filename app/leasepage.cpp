@@ -116,7 +116,7 @@ void LeasePage::step(int step)
 
     const QModelIndexList selected{m_ui.dhcpdLeaseTable->selectionModel()->selectedIndexes()};
     if (selected.size() == 1)
-        m_matchPosition = all.indexOf(selected.first());
+        m_matchPosition = static_cast<int>(all.indexOf(selected.first()));
 }
 
 /// All matches of a text are in one column: the first that has any.

@@ -14,7 +14,7 @@ namespace {
 int secondsOf(const QString &time)
 {
     using Limits = std::numeric_limits<int>;
-    return static_cast<int>(qBound<qint64>(Limits::min(), time.toLongLong(), Limits::max()));
+    return static_cast<int>(qBound(qint64{Limits::min()}, time.toLongLong(), qint64{Limits::max()}));
 }
 
 template<typename Dialog>

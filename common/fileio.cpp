@@ -73,7 +73,7 @@ struct Location
 
 Location split(const QByteArray &path)
 {
-    const int slash{path.lastIndexOf('/')};
+    const QByteArray::size_type slash{path.lastIndexOf('/')};
     return {slash < 0 ? QByteArrayLiteral("./") : path.left(slash + 1), path.mid(slash + 1)};
 }
 
@@ -174,7 +174,7 @@ std::error_code overwrite(int descriptor, const QByteArray &content)
 }
 
 // Takes the room for `size` bytes before anything is overwritten, where the file system can.
-std::error_code reserve(int descriptor, int size, int oldSize)
+std::error_code reserve(int descriptor, off_t size, off_t oldSize)
 {
     if (size <= oldSize || posix::retried([&] { return fallocate(descriptor, FALLOC_FL_KEEP_SIZE, 0, size); }) == 0)
         return {};

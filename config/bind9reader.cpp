@@ -57,7 +57,7 @@ public:
 private:
     QStringList m_openFiles;
     int m_filesLeft{maximumFiles};
-    int m_sizeLeft{maximumTotalSize};
+    QByteArray::size_type m_sizeLeft{maximumTotalSize};
 };
 
 QString FileReader::read(const QString &path)
@@ -75,24 +75,24 @@ QString FileReader::read(const QString &path)
     m_openFiles += canonicalPath;
     const QString text{bind9::withoutComments(TextEncoding::detect(*bytes).decode(*bytes))};
     QString result;
-    int position{};
+    QString::size_type position{};
     for (bind9::Words statement{text}; statement.next();) {
         const QStringList &words{statement.words()};
         const bool isInclude{words.size() == 2 && statement.delimiter() == QLatin1Char{';'} &&
                              words.first().toLower() == QLatin1String{"include"} && words.last().startsWith(quote)};
         if (!isInclude)
             continue;
-        result += text.midRef(position, statement.begin() - position);
+        result += text.mid(position, statement.begin() - position);
         result += read(file.dir().absoluteFilePath(bind9::unescaped(words.last())));
         position = statement.end();
     }
     m_openFiles.removeLast();
-    return result + text.midRef(position);
+    return result + text.mid(position);
 }
 
-int endOfLine(const QString &text, int position)
+QString::size_type endOfLine(const QString &text, QString::size_type position)
 {
-    const int end{text.indexOf(QLatin1Char{'\n'}, position)};
+    const QString::size_type end{text.indexOf(QLatin1Char{'\n'}, position)};
     return end < 0 ? text.size() : end;
 }
 
@@ -134,7 +134,7 @@ QString referenceTo(const QString &definedName, const QString &name)
 
 QStringList keyWithPlainAlgorithm(QStringList words)
 {
-    const int algorithm{words.indexOf(algorithmKeyword, 2) + 1};
+    const QStringList::size_type algorithm{words.indexOf(algorithmKeyword, 2) + 1};
     words[algorithm] = values::unquoted(words.at(algorithm));
     return words;
 }
@@ -310,7 +310,7 @@ QStringList statements(const QString &text)
     QStringList words;
     QString word;
     bool quoted{};
-    for (int i{}; i < text.size(); ++i) {
+    for (QString::size_type i{}; i < text.size(); ++i) {
         if (!quoted && text.at(i) == QLatin1Char{'/'})
             i = endOfLine(text, i);
         if (i == text.size())

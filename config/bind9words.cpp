@@ -6,16 +6,16 @@
 namespace {
 
 // Where the comment that starts at `position` ends; `position` when none does.
-int endOfComment(const QString &text, int position)
+QString::size_type endOfComment(const QString &text, QString::size_type position)
 {
     const auto rest = QStringView{text}.mid(position);
     if (rest.startsWith(QLatin1String{"//"}) || rest.startsWith(QLatin1Char{'#'})) {
-        const int end{text.indexOf(QLatin1Char{'\n'}, position)};
+        const QString::size_type end{text.indexOf(QLatin1Char{'\n'}, position)};
         return end < 0 ? text.size() : end;
     }
     if (!rest.startsWith(QLatin1String{"/*"}))
         return position;
-    const int end{text.indexOf(QLatin1String{"*/"}, position + 2)};
+    const QString::size_type end{text.indexOf(QLatin1String{"*/"}, position + 2)};
     return end < 0 ? text.size() : end + 2;
 }
 
@@ -48,8 +48,8 @@ QString withoutComments(const QString &text)
     QString result;
     result.reserve(text.size());
     QuoteState state;
-    for (int i{}; i < text.size();) {
-        if (const int end{state.isQuoted() ? i : endOfComment(text, i)}; end > i) {
+    for (QString::size_type i{}; i < text.size();) {
+        if (const QString::size_type end{state.isQuoted() ? i : endOfComment(text, i)}; end > i) {
             result += QLatin1Char{' '};
             i = end;
             continue;

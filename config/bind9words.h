@@ -30,13 +30,13 @@ public:
     const QStringList &words() const { return m_words; }
     QChar delimiter() const { return m_text.at(m_position - 1); }
     /// Where the first word begins, and where the text behind the delimiter does.
-    int begin() const { return m_begin; }
-    int end() const { return m_position; }
+    QString::size_type begin() const { return m_begin; }
+    QString::size_type end() const { return m_position; }
 
 private:
     const QString &m_text;
-    int m_position{};
-    int m_begin{};
+    QString::size_type m_position{};
+    QString::size_type m_begin{};
     QStringList m_words;
 };
 

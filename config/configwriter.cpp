@@ -26,7 +26,7 @@ qint64 joinedSize(const WordList &words)
 /// Makes room for so many bytes more and returns where they begin; null, for good, when that is too much.
 char *extend(Text &text, qint64 bytes)
 {
-    const int start{text.size()};
+    const Text::size_type start{text.size()};
     if (text.isNull() || start + bytes > maximumBytes) {
         text = {};
         return nullptr;

@@ -30,7 +30,10 @@ RouteModel::RouteModel(QObject *parent)
 {
 }
 
-int RouteModel::rowCount(const QModelIndex &parent) const { return parent.isValid() ? 0 : m_rows.size(); }
+int RouteModel::rowCount(const QModelIndex &parent) const
+{
+    return parent.isValid() ? 0 : static_cast<int>(m_rows.size());
+}
 
 int RouteModel::columnCount(const QModelIndex &parent) const { return parent.isValid() ? 0 : columns; }
 
@@ -73,7 +76,7 @@ void RouteModel::addRoutes(const QStringList &words)
         Row row;
         for (int column{0}; column < columns && first + column < words.size(); ++column)
             row.insert(column, words.at(first + column));
-        beginInsertRows({}, m_rows.size(), m_rows.size());
+        beginInsertRows({}, rowCount(), rowCount());
         m_rows.append(row);
         endInsertRows();
     }

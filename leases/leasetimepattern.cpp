@@ -21,7 +21,7 @@ LeaseTimePattern::LeaseTimePattern(LeaseNeedle needle, LeaseTimeTexts &texts)
     , m_timesOfDay(secondsOfDay)
 {
     const QString &text{m_needle.text};
-    for (int at{text.indexOf(LeaseTimeTexts::separator)}; at >= 0 && m_splits.size() < mostSplits;
+    for (QString::size_type at{text.indexOf(LeaseTimeTexts::separator)}; at >= 0 && m_splits.size() < mostSplits;
          at = text.indexOf(LeaseTimeTexts::separator, at + 1))
         m_splits.push_back({text.left(at), text.mid(at + 1)});
 }

@@ -97,14 +97,14 @@ bool hasHalf(const QStringList &folders, const QStringList &names)
 }
 
 // The themes that look best beside the bundled icons come first.
-int preference(const QString &theme)
+QStringList::size_type preference(const QString &theme)
 {
     static const QStringList preferred{
         QStringLiteral("breeze"), QStringLiteral("breeze-dark"), QStringLiteral("oxygen"),
         QStringLiteral("mate"),   QStringLiteral("Papirus"),     QStringLiteral("elementary-xfce"),
         QStringLiteral("gnome"),  QStringLiteral("Adwaita"),
     };
-    const int index{preferred.indexOf(theme)};
+    const QStringList::size_type index{preferred.indexOf(theme)};
     return index < 0 ? preferred.size() : index;
 }
 

@@ -19,8 +19,8 @@ const QLatin1String interfacesKey{"INTERFACESv4"};
 QStringList linesOf(const QString &text)
 {
     QStringList lines;
-    for (int begin{0}; begin < text.size(); begin += lines.constLast().size()) {
-        const int end{text.indexOf(QLatin1Char{'\n'}, begin)};
+    for (QString::size_type begin{0}; begin < text.size(); begin += lines.constLast().size()) {
+        const QString::size_type end{text.indexOf(QLatin1Char{'\n'}, begin)};
         lines.append(text.mid(begin, end < 0 ? -1 : end + 1 - begin));
     }
     return lines;

@@ -7,6 +7,7 @@
 #include <QAction>
 #include <QApplication>
 #include <QFileDialog>
+#include <QMenu>
 #include <QMessageBox>
 #include <QTest>
 #include <QTreeView>

@@ -114,7 +114,7 @@ struct Site final
     /// Waits until every notice that is due has come.
     void settle() const
     {
-        int before{0};
+        QSignalSpy::size_type before{0};
         do {
             before = notices.count();
             QTest::qWait(250);
@@ -131,7 +131,7 @@ struct Site final
 /// Changes the file so that there is one notice of it.
 void changeOutside(const Site &site)
 {
-    const int before{site.notices.count()};
+    const QSignalSpy::size_type before{site.notices.count()};
     runOutside(paths::configuration(), R"(echo '# by hand' >>"$1")");
     QTRY_VERIFY(site.notices.count() > before);
     site.settle();

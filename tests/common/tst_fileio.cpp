@@ -766,7 +766,7 @@ void FileIoTest::savesWhereThereIsRoomForOneCopyOnly()
         const QString problem{problemOfSaving(paths::configuration(), QByteArray(size, 'n'), true, before)};
         const QStringList versions{namesIn(paths::backupDirectory())};
         const QString version{paths::backupDirectory() + versions.value(0)};
-        return problem + difference("versions", versions.size(), kept.isEmpty() ? 0 : 1) +
+        return problem + difference("versions", static_cast<int>(versions.size()), kept.isEmpty() ? 0 : 1) +
                difference("kept", versions.isEmpty() ? QByteArray{} : contentOf(version), kept);
     }));
 }

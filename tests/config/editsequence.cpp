@@ -134,7 +134,8 @@ void EditSequence::edit(Choices &choices)
     const bool wasModified{model().isModified()};
     m_changes = m_resets = m_errors = 0;
 
-    edits[static_cast<std::size_t>(m_kind)](model(), indexes.at(choices.below(indexes.size())), choices);
+    edits[static_cast<std::size_t>(m_kind)](model(), indexes.at(choices.below(static_cast<int>(indexes.size()))),
+                                            choices);
 
     QVERIFY(m_changes + m_errors <= 1);
     QVERIFY(m_resets <= m_changes);

@@ -653,8 +653,8 @@ void Bind9ReaderTest::givesTheServerNothingThatItRefuses()
             word += alphabet.at(random.bounded(alphabet.size()));
         return random.bounded(3) == 0 ? values::quoted(word) : word;
     };
-    int keys{};
-    int zones{};
+    QStringList::size_type keys{};
+    QStringList::size_type zones{};
     for (int round{}; round < 40; ++round) {
         QString text;
         for (int i{}; i < 200; ++i) {

@@ -44,8 +44,11 @@ public:
     /// How often each was emitted: error, data, begin and end of removal, begin and end of reset, insertion.
     std::vector<int> counts() const
     {
-        return {error.size(),      dataChanged.size(), beginRemove.size(), endRemove.size(),
-                beginReset.size(), endReset.size(),    inserted.size()};
+        std::vector<int> counts;
+        for (const QSignalSpy *spy :
+             {&error, &dataChanged, &beginRemove, &endRemove, &beginReset, &endReset, &inserted})
+            counts.push_back(static_cast<int>(spy->size()));
+        return counts;
     }
 
     QSignalSpy dataChanged;

@@ -206,7 +206,7 @@ void ParameterEditsTest::addsToEveryDeclaration()
     QFETCH(EditCase::Edit, edit);
     QFETCH(int, added);
     EditedModel edited{text(everyHolder)};
-    const int linesBefore{edited.outline().count(QLatin1Char{'\n'})};
+    const QString::size_type linesBefore{edited.outline().count(QLatin1Char{'\n'})};
     edit(edited.model(), edited.find(target));
     edited.verifyChange(1);
     QCOMPARE(edited.outline().count(QLatin1Char{'\n'}) - linesBefore, added);

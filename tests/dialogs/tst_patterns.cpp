@@ -171,7 +171,7 @@ void PatternsTest::validatesTexts()
     QFETCH(QValidator::State, state);
 
     const QRegularExpressionValidator validator{pattern()};
-    int position{text.size()};
+    auto position = static_cast<int>(text.size());
     QCOMPARE(validator.validate(text, position), state);
 }
 

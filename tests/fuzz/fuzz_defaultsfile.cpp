@@ -28,16 +28,16 @@ std::unique_ptr<Machine> machine;
 // Finds the names by searching, without taking lines apart. Nothing where the last line with the key is not as usual.
 bool findServed(const QString &text, QSet<QString> &served)
 {
-    const int key{text.lastIndexOf(QLatin1String{"INTERFACESv4"})};
+    const QString::size_type key{text.lastIndexOf(QLatin1String{"INTERFACESv4"})};
     if (key < 0)
         return true;
-    const int lineBegin{text.lastIndexOf(QLatin1Char{'\n'}, key) + 1};
-    const int lineEnd{text.indexOf(QLatin1Char{'\n'}, key)};
+    const QString::size_type lineBegin{text.lastIndexOf(QLatin1Char{'\n'}, key) + 1};
+    const QString::size_type lineEnd{text.indexOf(QLatin1Char{'\n'}, key)};
     const QString line{text.mid(lineBegin, lineEnd < 0 ? -1 : lineEnd - lineBegin)};
-    const int begin{line.indexOf(QLatin1String{"=\""}) + 2};
-    const int end{line.indexOf(QLatin1Char{'"'}, begin)};
-    if (begin < 2 || end < 0 || line.leftRef(end).count(QLatin1Char{'='}) != 1 ||
-        line.leftRef(begin).count(QLatin1Char{'"'}) != 1)
+    const QString::size_type begin{line.indexOf(QLatin1String{"=\""}) + 2};
+    const QString::size_type end{line.indexOf(QLatin1Char{'"'}, begin)};
+    if (begin < 2 || end < 0 || line.left(end).count(QLatin1Char{'='}) != 1 ||
+        line.left(begin).count(QLatin1Char{'"'}) != 1)
         return false;
     if (end > begin) {
         for (const QString &name : line.mid(begin, end - begin).split(QLatin1Char{' '}))

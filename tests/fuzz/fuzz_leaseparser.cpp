@@ -20,7 +20,7 @@ extern "C" int LLVMFuzzerInitialize(int * /*argc*/, char *** /*argv*/)
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size)
 {
     const QByteArray text{reinterpret_cast<const char *>(data), static_cast<int>(size)};
-    const int place{text.isEmpty() ? 0 : static_cast<unsigned char>(text[0]) % (text.size() + 1)};
+    const int place{text.isEmpty() ? 0 : static_cast<unsigned char>(text[0]) % static_cast<int>(text.size() + 1)};
     const LeaseRows expected{referenceRows(text)};
     require(parsedRows(text) == expected);
     require(parsedRows(text, {place}) == expected);

@@ -186,7 +186,7 @@ QByteArray oneOf(const std::array<const char *, size> &lines, QRandomGenerator &
 QByteArray changed(QByteArray line, QRandomGenerator &random)
 {
     static const QByteArray bytes{QByteArrayLiteral("{}\"\\# ;\t\r\0\xff\xc3") + QByteArrayLiteral("a0:/.")};
-    const int place{random.bounded(line.size() + 1)};
+    const QByteArray::size_type place{random.bounded(line.size() + 1)};
     const char byte{bytes[random.bounded(bytes.size())]};
     switch (random.bounded(4)) {
     case 0:

@@ -10,7 +10,6 @@
 #include <QHostAddress>
 #include <QLocale>
 #include <QMap>
-#include <QTextCodec>
 
 #include <utility>
 
@@ -22,9 +21,10 @@ QString bytesAsText(const QByteArray &bytes) { return QString::fromLatin1(bytes.
 QString shown(const QString &bytes)
 {
     const QByteArray raw{bytes.toLatin1()};
-    QTextCodec::ConverterState state{QTextCodec::IgnoreHeader};
-    const QString decoded{QTextCodec::codecForName("UTF-8")->toUnicode(raw.constData(), raw.size(), &state)};
-    return state.invalidChars == 0 && state.remainingChars == 0 ? decoded : bytes;
+    // Behind another character, a byte order mark is text.
+    const QByteArray marked{'x' + raw};
+    const QString decoded{QString::fromUtf8(marked.constData(), marked.size())};
+    return decoded.toUtf8() == marked ? decoded.mid(1) : bytes;
 }
 
 QString withoutEnds(const QString &bytes, int first, int last)
@@ -39,7 +39,7 @@ QString withoutEnds(const QString &bytes, int first, int last)
 struct Scanned
 {
     QString outside;
-    QMap<int, int> quotes;
+    QMap<QString::size_type, QString::size_type> quotes;
 };
 
 Scanned scan(const QString &line)
@@ -52,8 +52,8 @@ Scanned scan(const QString &line)
         Comment
     } state{Outside};
     Scanned scanned{line, {}};
-    int opening{-1};
-    for (int i{0}; i < line.size(); ++i) {
+    QString::size_type opening{-1};
+    for (QString::size_type i{0}; i < line.size(); ++i) {
         const QChar c{line[i]};
         switch (state) {
         case Outside:
@@ -116,8 +116,8 @@ LeaseRows referenceRows(const QByteArray &text)
         } else if (has("hardware")) {
             mac = withoutEnds(words.value(4), 0, 1);
         } else if (has("client-hostname")) {
-            const int place{words.size() > 3 ? words.mid(0, 3).join(QLatin1Char{' '}).size() + 1 : -1};
-            const int closing{scanned.quotes.value(place, -1)};
+            const QString::size_type place{words.size() > 3 ? words.mid(0, 3).join(QLatin1Char{' '}).size() + 1 : -1};
+            const QString::size_type closing{scanned.quotes.value(place, -1)};
             host = closing >= 0 ? line.mid(place + 1, closing - place - 1) : withoutEnds(words.value(3), 1, 2);
         } else if (has("binding state") && !has("next") && !has("rewind")) {
             state = withoutEnds(words.value(4), 0, 1);
@@ -166,7 +166,7 @@ LeaseRows parsedRows(const QByteArray &text, const QVector<int> &places)
     LeaseTable table;
     LeaseParser parser{table};
     QVector<int> ends{places};
-    ends.append(text.size());
+    ends.append(static_cast<int>(text.size()));
     int begin{0};
     for (const int end : qAsConst(ends)) {
         parser.feed({text.constData() + begin, static_cast<std::size_t>(end - begin)});

@@ -539,8 +539,8 @@ void DhcpdLeasesModelTest::updateNoticesAnEditOfTheSameLength()
     model.reload(m_path);
     QCOMPARE(model.rowCount(), 200);
 
-    const int block{file.indexOf(leaseBlock(0, lease, lease % 7))};
-    const int mac{file.indexOf("hardware ethernet ", block) + int{sizeof "hardware ethernet"}};
+    const QByteArray::size_type block{file.indexOf(leaseBlock(0, lease, lease % 7))};
+    const QByteArray::size_type mac{file.indexOf("hardware ethernet ", block) + int{sizeof "hardware ethernet"}};
     overwrite(m_path, mac, "ab:cd:ef");
     model.update(m_path);
     QVERIFY(model.index(lease, DhcpdLeasesModel::Mac).data().toString().startsWith(text("ab:cd:ef")));

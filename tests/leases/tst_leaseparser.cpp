@@ -295,7 +295,7 @@ void LeaseParserTest::continuesAfterTheEnd()
     int continued{0};
     for (int i{0}; i < 200; ++i) {
         const QByteArray file{irregularLeaseFile(random)};
-        const int size{random.bounded(file.size() + 1)};
+        const QByteArray::size_type size{random.bounded(file.size() + 1)};
         LeaseTable table;
         LeaseParser parser{table};
         parser.feed({file.constData(), static_cast<std::size_t>(size)});

@@ -140,7 +140,7 @@ QStringList searchTexts(QRandomGenerator &random, const QAbstractItemModel &tabl
     while (texts.size() < count) {
         const int row{random.bounded(table.rowCount())};
         const QString cell{table.index(row, random.bounded(table.columnCount())).data().toString()};
-        const int begin{random.bounded(cell.size() + 1)};
+        const QString::size_type begin{random.bounded(cell.size() + 1)};
         QString text{cell.mid(begin, random.bounded(1, 12))};
         switch (random.bounded(6)) {
         case 0:

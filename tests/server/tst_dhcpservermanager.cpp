@@ -81,10 +81,10 @@ QByteArray answersInTurn(const QByteArray &first, const QByteArray &later)
 }
 
 // How often such a script has been called.
-int turns()
+qint64 turns()
 {
     QFile turns{QStandardPaths::findExecutable(QStringLiteral("systemctl")) + QStringLiteral(".turns")};
-    return turns.open(QIODevice::ReadOnly) ? turns.readAll().size() : 0;
+    return turns.open(QIODevice::ReadOnly) ? turns.size() : 0;
 }
 
 constexpr int longestOutput{64 * 1024};
@@ -806,7 +806,7 @@ void DhcpServerManagerTest::leavesNothingBehindAfterFailures()
             });
     connect(machine->manager.get(), &DhcpServerManager::error, &machine->context,
             [&machine] { machine->systemctl.setInstalled(true); });
-    QVector<int> openAfterRound;
+    QVector<QStringList::size_type> openAfterRound;
     const WarningRecorder warnings;
     for (int round{0}; round < 3; ++round) {
         machine->events.clear();
@@ -814,7 +814,7 @@ void DhcpServerManagerTest::leavesNothingBehindAfterFailures()
         QTRY_COMPARE(machine->events.size(), 4);
         openAfterRound.append(openFiles.entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System).size());
     }
-    QCOMPARE(openAfterRound, QVector<int>(3, openAfterRound.constFirst()));
+    QCOMPARE(openAfterRound, QVector<QStringList::size_type>(3, openAfterRound.constFirst()));
     QCOMPARE(warnings.recorded(), QStringList{}); // such as one about a closed descriptor
 }
 
@@ -986,7 +986,7 @@ void DhcpServerManagerTest::watchesWithoutBus()
     machine.systemctl.setState(FakeSystemctl::Running);
     QTRY_COMPARE_WITH_TIMEOUT(machine.events, QStringList{running}, 30000);
 
-    const int queries{machine.systemctl.verbs().size()};
+    const QStringList::size_type queries{machine.systemctl.verbs().size()};
     QTest::qWait(6000); // a state that is known is not asked for again
     QCOMPARE(machine.systemctl.verbs().size(), queries);
     QCOMPARE(warnings.recorded(), QStringList{});

@@ -101,7 +101,7 @@ void ServiceWatchTest::asksSeldomWhileTheUnitKeepsChanging()
     }
     const qint64 bursts{time.elapsed() / 200 + 1};
     QTest::qWait(500);
-    const int queries{service.systemctl.verbs().size() - 2};
+    const QStringList::size_type queries{service.systemctl.verbs().size() - 2};
     QVERIFY(queries > 1);
     QVERIFY2(queries <= bursts, qPrintable(QString::number(queries)));
 }
@@ -159,7 +159,7 @@ void ServiceWatchTest::repeatsNothingAfterAnOperation()
     QCOMPARE(service.events, (QStringList{stopped, said::updating}));
     service.systemctl.release(QStringLiteral("start"));
     QTRY_COMPARE(service.events.size(), 3);
-    const int queries{service.systemctl.verbs().size()};
+    const QStringList::size_type queries{service.systemctl.verbs().size()};
     m_bus->announce();
     QTRY_COMPARE(service.systemctl.verbs().size(), queries + 1);
     QTest::qWait(500);
