@@ -2,6 +2,10 @@
 #include "server/servicecommand.h"
 
 #include <QProcessEnvironment>
+#include <QStandardPaths>
+
+#include <cerrno>
+#include <system_error>
 
 namespace {
 
@@ -35,7 +39,14 @@ void ServiceCommand::send(const QString &verb)
     m_output.clear();
     m_errors.clear();
     m_printedTooMuch = false;
-    start(QStringLiteral("systemctl"), {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
+    const QString program{QStandardPaths::findExecutable(QStringLiteral("systemctl"))};
+    if (program.isEmpty()) {
+        // Qt 6.4 leaves a descriptor open each time that it starts a program which is not there.
+        setErrorString(QString::fromLocal8Bit(std::generic_category().message(ENOENT).c_str()));
+        emit errorOccurred(FailedToStart);
+        return;
+    }
+    start(program, {verb, QStringLiteral("isc-dhcp-server")}, QIODevice::ReadWrite);
 }
 
 void ServiceCommand::askForStatus()
@@ -48,7 +59,7 @@ QString ServiceCommand::complaint() const { return QString::fromUtf8(m_errors.co
 
 void ServiceCommand::collect(QByteArray &collected, const QByteArray &printed)
 {
-    const int room{longestOutput - collected.size()};
+    const QByteArray::size_type room{longestOutput - collected.size()};
     collected += printed.left(room);
     if (printed.size() <= room || m_printedTooMuch)
         return;
