@@ -105,7 +105,7 @@ struct Site final
     bool stepsAreEnabled() const { return previous->isEnabled() && next->isEnabled(); }
     bool stepsAreDisabled() const { return !previous->isEnabled() && !next->isEnabled(); }
 
-    int rowOf(const char *address) const { return addresses().indexOf(QString::fromLatin1(address)); }
+    int rowOf(const char *address) const { return static_cast<int>(addresses().indexOf(QString::fromLatin1(address))); }
     QPoint centre(const char *address, int column = 0) const
     {
         const QModelIndex index{table->model()->index(rowOf(address), column)};
@@ -689,7 +689,7 @@ void LeaseCommandsTest::rowsAreAsTallAsALine()
     for (int row{0}; row < 4; ++row) {
         QCOMPARE(site.table->rowHeight(row), site.table->rowHeight(0));
         QVERIFY(site.table->rowHeight(row) >= line);
-        QVERIFY(site.table->rowHeight(row) < line + line / 3);
+        QVERIFY(site.table->rowHeight(row) < line + line / 2);
     }
 }
 

@@ -73,7 +73,7 @@ void LeaseTimeTest::takesWhatQtTakes()
     for (int i{0}; i < 100'000; ++i) {
         QString text{QStringLiteral("2024/02/28 11:45:30")};
         for (int change{random.bounded(3)}; change >= 0; --change) {
-            const int place{random.bounded(text.size())};
+            const QString::size_type place{random.bounded(text.size())};
             const QChar character{characters[random.bounded(characters.size())]};
             switch (random.bounded(6)) {
             case 0:
@@ -91,7 +91,9 @@ void LeaseTimeTest::takesWhatQtTakes()
             continue;
         const QDateTime expected{QDateTime::fromString(text, QStringLiteral("yyyy/MM/dd hh:mm:ss"))};
         const LeaseTime time{parsed(words[0].toUtf8(), words[1].toUtf8())};
-        QVERIFY2(time.isValid() == expected.isValid(), qPrintable(text));
+        // Qt 6 reads years before our era as well.
+        const bool isValid{expected.isValid() && expected.date().year() > 0};
+        QVERIFY2(time.isValid() == isValid, qPrintable(text));
         if (time.isValid()) {
             ++valid;
             QCOMPARE(time.date(), expected.date());
