@@ -7,11 +7,12 @@ cd "$(dirname "${BASH_SOURCE[0]}")"
 
 usage() {
     cat <<END
-Usage: ./test.sh [--sanitizers] [-- CTEST-OPTION...]
+Usage: ./test.sh [--qt6] [--sanitizers] [-- CTEST-OPTION...]
 
 Builds the program with its tests and runs them all. What is needed is installed first, on Debian and Ubuntu.
 The exit status is CTest's.
 
+  --qt6               built with Qt 6 instead of Qt 5
   --sanitizers        under AddressSanitizer and UndefinedBehaviorSanitizer
   -- CTEST-OPTION...  passed on to ctest, for example -- -R leases
   -h, --help          this text
@@ -19,8 +20,14 @@ END
 }
 
 preset=debug
+qt=
+groups=(build run screenshot test)
 while [ $# -gt 0 ]; do
     case $1 in
+    --qt6)
+        qt=-qt6
+        groups+=(qt6)
+        ;;
     --sanitizers) preset=sanitizers ;;
     -h | --help)
         usage
@@ -39,14 +46,14 @@ while [ $# -gt 0 ]; do
     shift
 done
 
-require_packages build run screenshot test
+require_packages "${groups[@]}"
 scripts/fetch-tools
-scripts/build "$preset"
+scripts/build "$preset$qt"
 export ORV_TOOLS_DIR=$PWD/build/tools
-results=$PWD/build/$preset/tests.xml
+results=$PWD/build/$preset$qt/tests.xml
 status=0
 rm -f "$results"
-ctest --preset "$preset" --output-junit "$results" "$@" || status=$?
+ctest --preset "$preset$qt" --output-junit "$results" "$@" || status=$?
 
 # CTest names the tests that were skipped but keeps their reasons to itself.
 [ ! -e "$results" ] || python3 - "$results" <<'END'

@@ -2,8 +2,8 @@
 #include "app/configcheck.h"
 
 #include "common/posix.h"
+#include "common/qtversions.h"
 
-#include <QProcess>
 #include <QStandardPaths>
 
 #include <csignal>
@@ -24,11 +24,11 @@ QString findServer()
 }
 
 /// A child process that inherits one open file, and is ended when it is destroyed.
-class CheckProcess final : public QProcess
+class CheckProcess final : public PreparedProcess
 {
 public:
     CheckProcess(FileDescriptor file, QObject *parent)
-        : QProcess{parent}
+        : PreparedProcess{parent}
         , m_file{std::move(file)}
     {
     }
@@ -41,7 +41,7 @@ public:
     Q_DISABLE_COPY_MOVE(CheckProcess)
 
 protected:
-    void setupChildProcess() override
+    void prepareChild() override
     {
         fcntl(m_file.get(), F_SETFD, 0);
         prctl(PR_SET_PDEATHSIG, SIGKILL); // a server that hangs goes with the program, however that ends

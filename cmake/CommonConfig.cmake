@@ -13,6 +13,7 @@ target_compile_definitions(orv_common_config INTERFACE
     QT_NO_CAST_TO_ASCII
     QT_NO_NARROWING_CONVERSIONS_IN_CONNECT
     QT_NO_URL_CAST_FROM_STRING
+    QT_WARN_DEPRECATED_UP_TO=0x060400 # what was deprecated later has no replacement in the oldest
 )
 target_compile_options(orv_common_config INTERFACE
     -Wall -Wextra -Wpedantic -Wcast-qual -Wconversion -Wextra-semi -Wnon-virtual-dtor -Wold-style-cast

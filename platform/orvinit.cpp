@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "platform/orvinit.h"
 
+#include "common/qtversions.h"
 #include "platform/icontheme.h"
 
 #include <QDirIterator>
@@ -91,8 +92,8 @@ private:
 
 void orvSetAttributes()
 {
-    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
-    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    enableHighDpi();
+    QGuiApplication::setHighDpiScaleFactorRoundingPolicy(Qt::HighDpiScaleFactorRoundingPolicy::PassThrough);
     // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
     QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);
 }

@@ -7,6 +7,7 @@ declare -A packages=(
     [build]="cmake g++ ninja-build qtbase5-dev qttools5-dev qttools5-dev-tools"
     [run]="breeze-icon-theme dbus-daemon fonts-dejavu-core iproute2 libqt5svg5 mount procps qttranslations5-l10n socat \
 util-linux xauth"
+    [qt6]="libqt6svg6 qt6-base-dev qt6-l10n-tools qt6-tools-dev qt6-translations-l10n"
     [wayland]="qtwayland5"
     [screenshot]="fonts-wqy-microhei maim xauth xdotool xvfb"
     [package]="dpkg-dev lintian"

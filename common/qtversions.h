@@ -1,0 +1,39 @@
+// SPDX-License-Identifier: GPL-3.0-or-later
+// What Qt 5 and Qt 6 do differently. Nothing else asks for the version.
+#pragma once
+
+#include <QCoreApplication>
+#include <QProcess>
+
+/// A process whose child prepares itself before it becomes the program.
+class PreparedProcess : public QProcess
+{
+public:
+    explicit PreparedProcess(QObject *parent = nullptr)
+        : QProcess{parent}
+    {
+#if QT_VERSION >= QT_VERSION_CHECK(6, 0, 0)
+        setChildProcessModifier([this] { prepareChild(); });
+#endif
+    }
+    Q_DISABLE_COPY_MOVE(PreparedProcess)
+
+protected:
+    /// Called in the child, where only what a signal handler may call is safe.
+    virtual void prepareChild() = 0;
+
+#if QT_VERSION < QT_VERSION_CHECK(6, 0, 0)
+private:
+    void setupChildProcess() final { prepareChild(); }
+#endif
+};
+
+/// Has windows and pictures follow the screen's density, as they always do from Qt 6 on. To be called before there is
+/// an application.
+inline void enableHighDpi()
+{
+#if QT_VERSION < QT_VERSION_CHECK(6, 0, 0)
+    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+#endif
+}
