@@ -18,8 +18,10 @@
 
 #include <QCloseEvent>
 #include <QGuiApplication>
+#include <QScreen>
 #include <QSettings>
 #include <QShortcut>
+#include <QStyle>
 
 namespace {
 
@@ -205,6 +207,15 @@ void FMain::closeEvent(QCloseEvent *event)
             fileio::keepCopy(paths::configuration(), result.unwritten);
     }
     event->setAccepted(answer == QMessageBox::Yes || answer == QMessageBox::No);
+}
+
+void FMain::showEvent(QShowEvent *event)
+{
+    if (!event->spontaneous() && !QSettings{}.contains(QLatin1String{sizeKey})) {
+        const QSize frame{0, style()->pixelMetric(QStyle::PM_TitleBarHeight)}; // about what goes around the window
+        resize(size().boundedTo(screen()->availableSize() - frame));
+    }
+    QMainWindow::showEvent(event);
 }
 
 void FMain::showError(const QString &text, const QString &reason)

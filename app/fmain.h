@@ -85,6 +85,8 @@ public slots:
 
 protected:
     void closeEvent(QCloseEvent *event) override;
+    /// A window without a stored size is never larger than the screen.
+    void showEvent(QShowEvent *event) override;
 
 private:
     /// The tabs of mainTabWidget, by index.

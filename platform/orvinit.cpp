@@ -93,6 +93,7 @@ private:
 void orvSetAttributes()
 {
     enableHighDpi();
+    // A screen of 144 dpi shows everything half as large again, rather than twice as large.
     QGuiApplication::setHighDpiScaleFactorRoundingPolicy(Qt::HighDpiScaleFactorRoundingPolicy::PassThrough);
     // Nothing here draws with OpenGL; without this the first window loads all of it, which takes longer than the rest.
     QCoreApplication::setAttribute(Qt::AA_ForceRasterWidgets);

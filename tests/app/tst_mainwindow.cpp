@@ -240,6 +240,7 @@ private slots:
     void watchesFilesAndTheirDirectories();
 
     void sizeIsTheFormsAtFirst();
+    void firstSizeFitsTheScreen();
     void sizeIsRestored_data();
     void sizeIsRestored();
     void sizeIsStoredAtTheEndOnly();
@@ -932,6 +933,15 @@ void MainWindowTest::sizeIsTheFormsAtFirst()
 {
     const FMain window;
     QCOMPARE(window.size(), QSize(960, 640));
+}
+
+void MainWindowTest::firstSizeFitsTheScreen()
+{
+    const QSize screen{QGuiApplication::primaryScreen()->availableSize()};
+    QVERIFY(screen.width() < 960); // the form's
+    const auto window = m_machine->openWindow();
+    QCOMPARE(window->width(), screen.width());
+    QVERIFY(window->frameGeometry().height() <= screen.height());
 }
 
 void MainWindowTest::sizeIsRestored_data()

@@ -86,6 +86,18 @@ class Display:
         self.root.change_property(name, kind, 8, bus.encode())
         self.connection.sync()
 
+    def set_density(self, dpi):
+        """Tells programs that start from now on how many pixels the display has to the inch."""
+        resources, kind = (self.connection.intern_atom(name) for name in ("RESOURCE_MANAGER", "STRING"))
+        self.root.change_property(resources, kind, 8, f"Xft.dpi:\t{dpi}\n".encode())
+        self.connection.sync()
+
+    def largest_window(self):
+        """Its place; None when there is no window."""
+        windows = self.root.query_tree().children
+        boxes = [self.box_of(window) for window in windows if window.get_attributes().map_state == Xlib.X.IsViewable]
+        return max(boxes, key=lambda box: box[2] * box[3], default=None)
+
     def window_at(self, box):
         """The uppermost window that has just this place."""
         for window in reversed(self.root.query_tree().children):
