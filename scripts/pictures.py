@@ -14,6 +14,7 @@ import xml.etree.ElementTree
 import desktop
 import machine
 import PIL.Image
+import pyatspi
 import Xlib.X
 
 ROOT = pathlib.Path(__file__).resolve().parents[1]
@@ -120,7 +121,7 @@ class Site:
 
     def row(self, *labels):
         """The row below that of the whole network."""
-        tree = self.main.find("tree", self.said("Topology"))
+        tree = self.main.find(pyatspi.ROLE_TREE, self.said("Topology"))
         return tree.row(*(self.said(label) for label in ("All network", *labels)))
 
     def entry(self, row, *entries):
@@ -148,7 +149,7 @@ class Site:
         return not self.program.child_processes()
 
     def tab(self, name):
-        self.main.find("page tab", self.said(name)).click()
+        self.main.find(pyatspi.ROLE_PAGE_TAB, self.said(name)).click()
 
     # --- Photographing
 
@@ -254,9 +255,9 @@ def leases(site):
     site.tab("Leases")
     site.wait(lambda: f'client-hostname "{LAST_GUEST}"' in machine.LEASES.read_text(), f"a lease of {LAST_GUEST}")
     whole = site.photograph(site.main)
-    site.main.find("text", site.said("Search")).enter("10.20.10.")
+    site.main.find(pyatspi.ROLE_TEXT, site.said("Search")).enter("10.20.10.")
     site.picture("leases")
-    site.main.find("table", site.said("Leases")).rows[0].double_click()
+    site.main.find(pyatspi.ROLE_TABLE, site.said("Leases")).rows[0].double_click()
     dialog = site.window("Reserve an IP address")
     site.picture("reservation", dialog)
     site.dismiss(dialog)

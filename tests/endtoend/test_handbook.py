@@ -9,6 +9,8 @@ import subprocess
 import tempfile
 import unittest
 
+import pyatspi
+
 import machine
 from testcase import ProgramTest
 
@@ -265,7 +267,7 @@ class WindowTest(ProgramTest):
         return self.program.window(title)
 
     def assert_shows(self, handbook, title):
-        page = handbook.find("label", title)
+        page = handbook.find(pyatspi.ROLE_LABEL, title)
         self.assertTrue(page.text.startswith(title + "\n"), page.text)
 
 
@@ -273,7 +275,7 @@ class Window(WindowTest):
     def test_leads_through_the_pages(self):
         handbook = self.open("Help", "Handbook")
         self.assert_shows(handbook, "First start")
-        (entry,) = (item for item in handbook.find("list", "Contents").children if item.name == "Interfaces")
+        (entry,) = (item for item in handbook.find(pyatspi.ROLE_LIST, "Contents").children if item.name == "Interfaces")
         entry.click()
         self.assert_shows(handbook, "Interfaces")
         handbook.button("Back").click()
@@ -287,7 +289,7 @@ class Window(WindowTest):
     def test_leaves_the_main_window_in_use(self):
         self.open("Help", "Handbook")
         self.main.press("ctrl+Tab")
-        self.main.find("table", "Leases")
+        self.main.find(pyatspi.ROLE_TABLE, "Leases")
 
 
 class GermanWindow(WindowTest):

@@ -132,6 +132,7 @@ ENTRIES = {
     "Restart DHCP-server",
     "Select interfaces",
     "Manual",
+    "Handbook",
     "About orv-admin-dhcp",
     "About Qt",
 }

@@ -106,7 +106,7 @@ class Start(ProgramTest):
         for name, entries in {
             "File": ["Reload", "Save", None, "Exit"],
             "Server": ["Start DHCP-server", "Restart DHCP-server", None, "Select interfaces"],
-            "Help": ["Manual", None, "About orv-admin-dhcp", "About Qt"],
+            "Help": ["Manual", "Handbook", None, "About orv-admin-dhcp", "About Qt"],
         }.items():
             self.assertEqual(self.main.find(pyatspi.ROLE_MENU_ITEM, name).open_menu().entries, entries)
             self.main.press("Escape")
