@@ -110,7 +110,8 @@ QString description(QString status)
         {QRegularExpression{QStringLiteral("\\n\\n.*"), QRegularExpression::DotMatchesEverythingOption}, {}},
         {QRegularExpression{QStringLiteral("(?<= since |Duration: ).*")}, {}},
         {QRegularExpression{QStringLiteral("(?<=Process: |PID: |├─|└─)[0-9]+")}, {}},
-        {QRegularExpression{QStringLiteral("\\n *(Tasks|Memory|CPU|Invocation|Job): .*")}, {}}, // only where they are counted
+        {QRegularExpression{QStringLiteral("\\n *(Tasks|Memory|CPU|Invocation|Job): .*")},
+         {}}, // only where they are counted
     }};
     for (const auto &[pattern, replacement] : differing)
         status.replace(pattern, replacement);
