@@ -16,8 +16,8 @@
 #include "platform/packagemanager.h"
 #include "ui_fmain.h"
 
+#include <QApplication>
 #include <QCloseEvent>
-#include <QGuiApplication>
 #include <QScreen>
 #include <QSettings>
 #include <QShortcut>
@@ -153,7 +153,11 @@ void FMain::setUpKeys()
         for (const QKeySequence &key : keys) {
             auto *shortcut = new QShortcut{key, widget};
             shortcut->setContext(widget == this ? Qt::WindowShortcut : Qt::WidgetShortcut);
-            connect(shortcut, &QShortcut::activated, this, slot);
+            // An open menu has the keyboard without Qt taking it from the widget below.
+            connect(shortcut, &QShortcut::activated, this, [this, slot = slot] {
+                if (!QApplication::activePopupWidget())
+                    (this->*slot)();
+            });
         }
     }
     connect(new KeyboardMenu{m_ui->topologyTree}, &KeyboardMenu::requested, this, &FMain::openTreeMenu);

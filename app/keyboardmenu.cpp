@@ -2,6 +2,7 @@
 #include "app/keyboardmenu.h"
 
 #include <QAbstractItemView>
+#include <QApplication>
 #include <QContextMenuEvent>
 #include <QShortcut>
 
@@ -27,7 +28,7 @@ bool KeyboardMenu::eventFilter(QObject * /*watched*/, QEvent *event)
 void KeyboardMenu::request()
 {
     const QModelIndex current{m_view->currentIndex()};
-    if (!current.isValid())
+    if (!current.isValid() || QApplication::activePopupWidget())
         return;
     m_view->scrollTo(current);
     const QRect cell{m_view->visualRect(current).intersected(m_view->viewport()->rect())};

@@ -68,9 +68,8 @@ void SearchFeedback::colour()
 void SearchFeedback::describe()
 {
     QString description;
-    if (const int leases{m_found->rowCount()}; !m_field->text().isEmpty()) {
+    if (const int leases{m_found->rowCount()}; !m_field->text().isEmpty())
         description = leases > 0 ? WindowText::tr("Leases found: %1").arg(leases) : WindowText::tr("No leases found");
-    }
     if (description != m_field->accessibleDescription())
         m_field->setAccessibleDescription(description);
 }

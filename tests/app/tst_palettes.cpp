@@ -192,9 +192,9 @@ Places frameTexts(const FMain &window)
     const auto *bar = driver::find<QTabBar>(window);
     for (int tab{0}; tab < bar->count(); ++tab)
         places.emplace_back(bar->tabText(tab), in(window, bar, bar->tabRect(tab).adjusted(6, 6, -6, -4)));
-    for (const QAction *action : window.menuBar()->actions())
-        places.emplace_back(action->text(), in(window, window.menuBar(),
-                                               window.menuBar()->actionGeometry(const_cast<QAction *>(action))));
+    const QMenuBar *menus{window.menuBar()};
+    for (QAction *action : menus->actions())
+        places.emplace_back(action->text(), in(window, menus, menus->actionGeometry(action)));
     const auto *state = driver::find<QLabel>(*window.statusBar());
     places.emplace_back(state->text(), in(window, state, state->rect()));
     return places;

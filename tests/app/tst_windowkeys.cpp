@@ -85,6 +85,7 @@ private slots:
     void menuOfTheLeasesNeedsALease_data() { addMenuKeys(); }
     void menuOfTheLeasesNeedsALease();
     void menuOpensAtTheMouseOtherwise();
+    void keysDoNothingWhileAMenuIsOpen();
     void findGoesToTheSearch_data();
     void findGoesToTheSearch();
     void copyTakesTheLeaseAsARow_data();
@@ -223,6 +224,21 @@ void WindowKeysTest::menuOpensAtTheMouseOtherwise()
         menu->close();
     });
     m_site->window().handleTreeContextMenuRequested(m_site->tree().visualRect(m_site->tree().currentIndex()).center());
+}
+
+void WindowKeysTest::keysDoNothingWhileAMenuIsOpen()
+{
+    m_site->select(text("range"));
+    ModalBoxes boxes;
+    boxes.expectMenu([this](QMenu *menu) {
+        QTest::keyClick(menu, Qt::Key_F2);
+        QTest::keyClick(menu, Qt::Key_F10, Qt::ShiftModifier);
+        QTest::keyClick(menu, Qt::Key_F, Qt::ControlModifier);
+        QCOMPARE(tab(), 0);
+        QVERIFY(menu->isVisible());
+        menu->close();
+    });
+    pressMenuKey();
 }
 
 void WindowKeysTest::findGoesToTheSearch_data()
