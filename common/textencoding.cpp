@@ -129,7 +129,7 @@ public:
     }
 
 private:
-    bool isOpen() const { return m_handle != reinterpret_cast<iconv_t>(-1); }
+    bool isOpen() const { return reinterpret_cast<std::intptr_t>(m_handle) != -1; }
 
     iconv_t m_handle;
 };
@@ -151,7 +151,7 @@ QByteArray localeCharset()
     const locale_t locale{newlocale(LC_CTYPE_MASK, "", nullptr)};
     if (!locale)
         return utf8Charset;
-    const QByteArray charset{nl_langinfo_l(CODESET, locale)};
+    QByteArray charset{nl_langinfo_l(CODESET, locale)};
     freelocale(locale);
     return charset;
 }
