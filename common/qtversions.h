@@ -37,3 +37,13 @@ inline void enableHighDpi()
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
 #endif
 }
+
+/// Has a screen reader find the program through the display, as it does without this up to Qt 5: the superuser has no
+/// session bus, on which later ones ask whether there is one. To be called before there is an application.
+inline void enableScreenReaders()
+{
+#if QT_VERSION >= QT_VERSION_CHECK(6, 0, 0)
+    if (!qEnvironmentVariableIsSet("QT_LINUX_ACCESSIBILITY_ALWAYS_ON"))
+        qputenv("QT_LINUX_ACCESSIBILITY_ALWAYS_ON", "1");
+#endif
+}

@@ -92,6 +92,7 @@ private:
 
 void orvSetAttributes()
 {
+    enableScreenReaders();
     enableHighDpi();
     // A screen of 144 dpi shows everything half as large again, rather than twice as large.
     QGuiApplication::setHighDpiScaleFactorRoundingPolicy(Qt::HighDpiScaleFactorRoundingPolicy::PassThrough);
