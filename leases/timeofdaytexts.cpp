@@ -30,7 +30,9 @@ TimeOfDayTexts::TimeOfDayTexts(const QLocale &locale)
     constexpr int otherNumber{22};
     // A time without a date would be given the name of the local zone.
     const QLocale timeLocale{localeOfTimes(locale)};
-    const QString format{timeLocale.timeFormat(QLocale::LongFormat)};
+    QString format{timeLocale.timeFormat(QLocale::LongFormat)};
+    // Qt 6.5 began to put a narrow space before "AM" and "PM", which nobody can type to find a time.
+    format.replace(QChar{0x202F}, QLatin1Char{' '});
     const QDate anyDay{1970, 1, 1};
     const auto text = [&](int hour, int minute, int second) {
         return timeLocale.toString(QDateTime{anyDay, QTime{hour, minute, second}, Qt::UTC}, format);

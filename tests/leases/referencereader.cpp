@@ -4,6 +4,7 @@
 #include "leases/leaseparser.h"
 #include "leases/leasetable.h"
 #include "leases/leasetimetexts.h"
+#include "tests/leases/longtime.h"
 
 #include <QAbstractItemModel>
 #include <QDateTime>
@@ -90,7 +91,7 @@ QString timeText(const QString &date, const QString &time)
 {
     const QDateTime parsed{QDateTime::fromString(shown(date) + QLatin1Char{' '} + shown(withoutEnds(time, 0, 1)),
                                                  QStringLiteral("yyyy/MM/dd hh:mm:ss"))};
-    return parsed.isValid() ? QLocale{}.toString(parsed.time(), QLocale::LongFormat) + QLatin1Char{' '} +
+    return parsed.isValid() ? longTime(QLocale{}, parsed.time()) + QLatin1Char{' '} +
                                   QLocale{}.toString(parsed.date(), QLocale::NarrowFormat)
                             : QString{};
 }

@@ -3,6 +3,7 @@
 
 #include "leases/leasetimetexts.h"
 #include "leases/timeofdaytexts.h"
+#include "tests/leases/longtime.h"
 
 #include <QDateTime>
 #include <QProcess>
@@ -191,7 +192,7 @@ void LeaseTimeTest::isShownInTheDefaultLocale()
     const QDate date{2026, 1, 2};
     const QTime time{13, 4, 5};
     QCOMPARE(LeaseTimeTexts{}.text(parsed("2026/01/02", "13:04:05")),
-             QLocale{locale}.toString(time, QLocale::LongFormat) + QLatin1Char{' '} +
+             longTime(QLocale{locale}, time) + QLatin1Char{' '} +
                  QLocale{locale}.toString(date, QLocale::NarrowFormat));
 }
 
@@ -256,7 +257,7 @@ void LeaseTimeTest::knowsAllTimesOfDayInAllLocales()
         const TimeOfDayTexts texts{locale};
         for (int second{0}; second < 24 * 60 * 60; second += random.bounded(1, 1000)) {
             const QTime time{QTime::fromMSecsSinceStartOfDay(second * 1000)};
-            QCOMPARE(texts.text(time), locale.toString(time, QLocale::LongFormat));
+            QCOMPARE(texts.text(time), longTime(locale, time));
         }
     }
 }
@@ -270,8 +271,8 @@ void LeaseTimeTest::isShownInTheSystemsLocale()
         const QTime time{hour, 16, 38};
         const LeaseTime leaseTime{
             parsed("2026/01/02", QLocale::c().toString(time, QStringLiteral("hh:mm:ss")).toLatin1())};
-        QCOMPARE(LeaseTimeTexts{}.text(leaseTime), locale.toString(time, QLocale::LongFormat) + QLatin1Char{' '} +
-                                                       locale.toString(QDate{2026, 1, 2}, QLocale::NarrowFormat));
+        QCOMPARE(LeaseTimeTexts{}.text(leaseTime),
+                 longTime(locale, time) + QLatin1Char{' '} + locale.toString(QDate{2026, 1, 2}, QLocale::NarrowFormat));
     }
 }
 
