@@ -19,6 +19,11 @@ python3-xlib"
     [lint]="black clang-format clang-tidy clazy flake8 git shellcheck"
 )
 
+# From Qt 6.7 on the plugins for SVG pictures are in a package of their own.
+if apt-cache show qt6-svg-plugins >/dev/null 2>&1; then
+    packages[qt6]+=" qt6-svg-plugins"
+fi
+
 # as_root COMMAND-LINE: has a shell of the superuser's run it, or prints it for somebody who can and fails.
 as_root() {
     if [ "$(id -u)" -eq 0 ]; then
