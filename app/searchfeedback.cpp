@@ -15,7 +15,7 @@ constexpr auto styleOnDark = "QLineEdit { color: %1; }";
 constexpr auto redOnDark = "#ff8a8a";
 
 constexpr int darkest{128};               // the least lightness of a light palette
-constexpr double placeholderOpacity{0.8}; // Qt's half is too faint to be read easily
+constexpr float placeholderOpacity{0.8F}; // Qt's half is too faint to be read easily
 
 } // namespace
 

@@ -116,7 +116,7 @@ class Help(ProgramTest):
     def test_tells_what_the_toolkit_is(self):
         self.main.choose("Help", "About Qt")
         box = self.program.window("About Qt")
-        self.assertTrue(box.labels[0].startswith("About Qt\nThis program uses Qt version 5."), box.labels)
+        self.assertRegex(box.labels[0], r"\AAbout Qt\nThis program uses Qt version [56]\.")
         box.button("OK").click()
         box.wait_closed()
 

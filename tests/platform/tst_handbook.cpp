@@ -259,9 +259,9 @@ void HandbookTest::contentsLeadToThePages()
     QFETCH(QString, language);
     QFETCH(QString, name);
     open(language);
-    const int row{filesOf(language, QStringLiteral("*.md")).indexOf(name)};
+    const QStringList::size_type row{filesOf(language, QStringLiteral("*.md")).indexOf(name)};
     auto *contents = find<QListWidget>();
-    for (int i{0}; i < row; ++i)
+    for (QStringList::size_type i{0}; i < row; ++i)
         QTest::keyClick(contents, Qt::Key_Down);
     QCOMPARE(pageName(), name);
     const QString title{contents->currentItem()->text()};
