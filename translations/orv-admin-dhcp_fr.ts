@@ -736,7 +736,7 @@ Voulez-vous continuer&#xa0;?</translation>
     </message>
     <message>
         <source>Leases found: %1</source>
-        <translation>Baux trouvés : %1</translation>
+        <translation>Baux trouvés&#xa0;: %1</translation>
     </message>
     <message>
         <source>No leases found</source>
