@@ -49,7 +49,7 @@ bool SearchFeedback::eventFilter(QObject * /*watched*/, QEvent *event)
 void SearchFeedback::colour()
 {
     const QPalette surroundings{m_field->parentWidget()->palette()};
-    const QColor text{surroundings.color(QPalette::Text)};
+    const QColor &text{surroundings.color(QPalette::Text)};
     const bool isDark{surroundings.color(QPalette::Base).lightness() < darkest};
     const bool isFound{m_colour == Colour::Found};
     const QString onLight{QLatin1String{isFound ? foundStyle : notFoundStyle}};

@@ -165,7 +165,8 @@ void PathWatchTest::noticesASlowReceiverLessOften()
     });
     writeTestFile(path("lib/dhcp/leases"), "2");
     QTRY_VERIFY(pauses.size() >= 2);
-    QVERIFY2(pauses.first() >= 600, qPrintable(QString::number(pauses.first())));
+    QVERIFY2(pauses.first() >= 550, // three times as long; timers may be a little early
+             qPrintable(QString::number(pauses.first())));
     QVERIFY2(pauses.at(1) < pauses.first(), qPrintable(QString::number(pauses.at(1))));
     m_watch->pause();
 }
