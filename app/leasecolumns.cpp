@@ -28,6 +28,8 @@ QStyleOptionViewItem optionsFor(const QTableView &table)
 LeaseColumns::LeaseColumns(QTableView *table)
     : QObject{table}
     , m_table{table}
+    , m_header{table->horizontalHeader()->viewport()}
+    , m_rows{table->viewport()}
 {
     m_widening.setSingleShot(true);
     m_widening.setInterval(0);
@@ -50,19 +52,16 @@ LeaseColumns::LeaseColumns(QTableView *table)
 
 bool LeaseColumns::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched == m_table->horizontalHeader()->viewport()) {
-        if (event->type() == QEvent::Enter)
-            letUserResize();
-        return false;
-    }
-    if (event->type() == QEvent::Resize) {
+    if (watched == m_header && event->type() == QEvent::Enter) {
+        letUserResize();
+    } else if (watched == m_rows && event->type() == QEvent::Resize) {
         measureVisibleRows();
         m_widening.start();
+    } else if (watched == m_rows && event->type() == QEvent::ToolTip) {
+        showCutText(static_cast<const QHelpEvent &>(*event));
+        return true;
     }
-    if (event->type() != QEvent::ToolTip)
-        return false;
-    showCutText(static_cast<const QHelpEvent &>(*event));
-    return true;
+    return false;
 }
 
 void LeaseColumns::measureVisibleRows()

@@ -31,6 +31,9 @@ private:
     void showCutText(const QHelpEvent &event) const;
 
     QTableView *m_table;
+    // Told apart without the table, which is none any more when its parts see their last events.
+    const QObject *m_header;
+    const QObject *m_rows;
     QTimer m_widening; // once for all that happens before the next turn of the event loop
     std::set<int> m_setByUser;
     bool m_isWidening{};
