@@ -102,8 +102,9 @@ double luminance(QRgb colour)
 
 double contrast(QRgb one, QRgb other)
 {
-    const auto [dark, light] = std::minmax(luminance(one), luminance(other));
-    return (light + 0.05) / (dark + 0.05);
+    const double first{luminance(one)};
+    const double second{luminance(other)};
+    return (std::max(first, second) + 0.05) / (std::min(first, second) + 0.05);
 }
 
 /// How often each colour occurs, the most frequent first: what is behind everything else.
