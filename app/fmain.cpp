@@ -146,9 +146,6 @@ void FMain::setUpKeys()
         {QKeySequence::keyBindings(QKeySequence::Copy), m_ui->dhcpdLeaseTable, &FMain::copyLease},
         {QKeySequence::keyBindings(QKeySequence::Find), this, &FMain::goToLeaseSearch},
     };
-    for (QAbstractItemView *view :
-         std::initializer_list<QAbstractItemView *>{m_ui->topologyTree, m_ui->dhcpdLeaseTable})
-        new SpokenFocus{view};
     for (const auto &[keys, widget, slot] : shortcuts) {
         for (const QKeySequence &key : keys) {
             auto *shortcut = new QShortcut{key, widget};
@@ -162,6 +159,8 @@ void FMain::setUpKeys()
     }
     connect(new KeyboardMenu{m_ui->topologyTree}, &KeyboardMenu::requested, this, &FMain::openTreeMenu);
     connect(new KeyboardMenu{m_ui->dhcpdLeaseTable}, &KeyboardMenu::requested, m_leases.get(), &LeasePage::openMenu);
+    new SpokenFocus{m_ui->topologyTree};
+    new SpokenFocus{m_ui->dhcpdLeaseTable};
 }
 
 void FMain::goToLeaseSearch()
