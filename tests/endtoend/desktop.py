@@ -21,7 +21,7 @@ import Xlib.display
 import Xlib.error
 import Xlib.ext.xtest
 import Xlib.protocol.event
-from gi.repository import Gio, GLib
+from gi.repository import Atspi, Gio, GLib
 
 MAIN_TITLE = "Configure DHCP server"
 PATIENCE = 90  # seconds until what never comes fails the test
@@ -44,6 +44,14 @@ def xdotool(*arguments):
     """Its output; a failure is an exception."""
     command = ["xdotool", *map(str, arguments)]
     return subprocess.run(command, check=True, stdin=subprocess.DEVNULL, capture_output=True, text=True).stdout
+
+
+def wait_for_answers(seconds=PATIENCE):
+    """For how long an answer is waited for; what does not come in time is read as nothing, without a word."""
+    Atspi.set_timeout(seconds * 1000, -1)  # a program that has just started gets no more
+
+
+wait_for_answers()
 
 
 def accessibility_bus():
@@ -310,8 +318,10 @@ class Control:
     def press_aloud(self):
         """What a screen reader does, which heeds neither the mouse nor what is in front."""
         # That it was done is said only when the windows are closed that it opens.
+        wait_for_answers(1)
         with contextlib.suppress(GLib.Error):
             self.accessible.queryAction().doAction(self.actions.index(PRESS))
+        wait_for_answers()
         # A button is released a moment later.
         self.program.wait(lambda: not self.has("pressed"), lambda: f"{self} released", alone=False)
 

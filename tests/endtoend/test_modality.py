@@ -171,13 +171,12 @@ class Modality(ProgramTest):
 
     def assert_alone(self, window):
         """Nothing comes of any command while the window is open."""
-        open_windows = self.program.windows()
+        open_windows = [other.title for other in self.program.windows()]
 
         def assert_nothing_opened(command):
             with self.case(over=window.title, command=command):
-                self.assertEqual(
-                    [other.title for other in self.program.windows()], [other.title for other in open_windows]
-                )
+                self.assertTrue(self.program.is_running)
+                self.assertEqual([other.title for other in self.program.windows()], open_windows)
 
         entries = self.global_menu.entries()
         self.assertEqual(set(entries), ENTRIES)
