@@ -12,7 +12,7 @@
 
 namespace {
 
-constexpr int fewestMeasuredRows{50}; // also while the table has no size
+constexpr int rowsMeasuredUnseen{50}; // while the table has no size
 
 QStyleOptionViewItem optionsFor(const QTableView &table)
 {
@@ -66,8 +66,8 @@ bool LeaseColumns::eventFilter(QObject *watched, QEvent *event)
 
 void LeaseColumns::measureVisibleRows()
 {
-    const int visible{m_table->viewport()->height() / m_table->verticalHeader()->defaultSectionSize() + 1};
-    m_table->horizontalHeader()->setResizeContentsPrecision(std::max(fewestMeasuredRows, visible));
+    const int visible{m_table->viewport()->height() / m_table->verticalHeader()->defaultSectionSize()};
+    m_table->horizontalHeader()->setResizeContentsPrecision(visible > 0 ? visible + 1 : rowsMeasuredUnseen);
 }
 
 // Columns that the header keeps to their contents cannot be dragged, so that it leaves them alone from the moment at

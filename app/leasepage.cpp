@@ -2,6 +2,7 @@
 #include "app/leasepage.h"
 
 #include "app/busycursor.h"
+#include "app/gridcelldelegate.h"
 #include "app/leasecolumns.h"
 #include "app/leaseviewstate.h"
 #include "app/pathwatch.h"
@@ -46,6 +47,7 @@ void LeasePage::setUpTable()
     table->setContextMenuPolicy(Qt::CustomContextMenu);
     table->verticalHeader()->setDefaultSectionSize(table->verticalHeader()->minimumSectionSize());
     table->setModel(&m_proxy);
+    new GridCellDelegate{table};
     new LeaseColumns{table};
 }
 

@@ -4,6 +4,8 @@
 
 #include <QCoreApplication>
 #include <QProcess>
+#include <QRegularExpression>
+#include <QSortFilterProxyModel>
 
 /// A process whose child prepares itself before it becomes the program.
 class PreparedProcess : public QProcess
@@ -46,4 +48,14 @@ inline void enableScreenReaders()
     if (!qEnvironmentVariableIsSet("QT_LINUX_ACCESSIBILITY_ALWAYS_ON"))
         qputenv("QT_LINUX_ACCESSIBILITY_ALWAYS_ON", "1");
 #endif
+}
+
+/// Whether the model's own filter accepts every row.
+inline bool hasEmptyFilter(const QSortFilterProxyModel &model)
+{
+#if QT_VERSION < QT_VERSION_CHECK(6, 0, 0)
+    if (!model.filterRegExp().isEmpty())
+        return false;
+#endif
+    return model.filterRegularExpression().pattern().isEmpty();
 }

@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leaseproxymodel.h"
 
+#include "common/qtversions.h"
 #include "leases/dhcpdleasesmodel.h"
 #include "leases/leaseneedle.h"
 #include "leases/leasesearch.h"
+
+#include <QScopedValueRollback>
 
 #include <algorithm>
 
@@ -50,6 +53,7 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
     searchAgain();
     // Upon the reset the base asks about all rows anew. Its own ways to have that done would move rows one by one, or
     // ask twice where a row is current.
+    const QScopedValueRollback spares{m_sparesBase, hasEmptyFilter(*this)};
     endResetModel();
 }
 
@@ -99,7 +103,7 @@ QModelIndexList LeaseProxyModel::firstMatches(const QModelIndex &start, int most
 bool LeaseProxyModel::filterAcceptsRow(int row, const QModelIndex &parent) const
 {
     const bool isFound{!m_search || (m_found ? m_found->contains(row) : m_search->contains(row))};
-    return isFound && QSortFilterProxyModel::filterAcceptsRow(row, parent);
+    return isFound && (m_sparesBase || QSortFilterProxyModel::filterAcceptsRow(row, parent));
 }
 
 const DhcpdLeasesModel *LeaseProxyModel::leases() const

@@ -47,6 +47,7 @@ private:
     void forgetFound();
 
     QString m_text;
+    bool m_sparesBase{}; // during a reset, in which the base's filter is empty and need not be asked about each row
     std::unique_ptr<LeaseSearch> m_search; // null when no text is set
     // Until the leases change: what m_search found, and the search of the last match().
     std::optional<LeaseHits> m_found;
