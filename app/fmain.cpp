@@ -84,7 +84,11 @@ void FMain::setUpActions()
         if (row.slot)
             connect(action, &QAction::triggered, this, row.slot);
     }
-    connect(m_ui->aExit, &QAction::triggered, this, &FMain::close);
+    // Qt 6 takes a second close during the first one's question for its answer.
+    connect(m_ui->aExit, &QAction::triggered, this, [this] {
+        if (mayStartCommand())
+            close();
+    });
 }
 
 void FMain::setUpService()
