@@ -12,7 +12,8 @@ KeyboardMenu::KeyboardMenu(QAbstractItemView *view)
 {
     view->installEventFilter(this);
     // Qt knows the menu key only.
-    const auto *shortcut = new QShortcut{Qt::SHIFT + Qt::Key_F10, view, nullptr, nullptr, Qt::WidgetShortcut};
+    const QKeySequence key{QStringLiteral("Shift+F10")};
+    const auto *shortcut = new QShortcut{key, view, nullptr, nullptr, Qt::WidgetShortcut};
     connect(shortcut, &QShortcut::activated, this, &KeyboardMenu::request);
 }
 

@@ -82,7 +82,7 @@ QString FileReader::read(const QString &path)
                              words.first().toLower() == QLatin1String{"include"} && words.last().startsWith(quote)};
         if (!isInclude)
             continue;
-        result += text.mid(position, statement.begin() - position);
+        result.append(text.constData() + position, statement.begin() - position);
         result += read(file.dir().absoluteFilePath(bind9::unescaped(words.last())));
         position = statement.end();
     }
