@@ -6,7 +6,7 @@
 
 namespace {
 
-constexpr int lineWidth{1};
+constexpr int lineWidth{1}; // what a line takes, of which it fills one pixel of the screen, however dense that is
 
 QColor lineColour(const QStyleOptionViewItem &option)
 {
@@ -31,10 +31,11 @@ void GridCellDelegate::paint(QPainter *painter, const QStyleOptionViewItem &opti
     QStyledItemDelegate::paint(painter, cell, index);
 
     const QColor colour{lineColour(option)};
-    const QRect &all{option.rect};
-    const int side{isMirrored ? all.left() : cell.rect.right() + 1};
-    painter->fillRect(all.left(), cell.rect.bottom() + 1, all.width(), lineWidth, colour);
-    painter->fillRect(side, all.top(), lineWidth, all.height(), colour);
+    const qreal pixel{1 / painter->device()->devicePixelRatioF()};
+    const QRectF all{option.rect};
+    const qreal side{isMirrored ? all.left() : all.right() - pixel};
+    painter->fillRect(QRectF{all.left(), all.bottom() - pixel, all.width(), pixel}, colour);
+    painter->fillRect(QRectF{side, all.top(), pixel, all.height()}, colour);
 }
 
 QSize GridCellDelegate::sizeHint(const QStyleOptionViewItem &option, const QModelIndex &index) const

@@ -20,7 +20,8 @@ QString plainText(QString line)
 QString pagePath()
 {
     const QString folder{QStringLiteral(":/man/")};
-    for (QString language : QLocale{}.uiLanguages()) {
+    const QStringList languages{QLocale{}.uiLanguages()};
+    for (QString language : languages) {
         language.replace(QLatin1Char{'-'}, QLatin1Char{'_'});
         for (; !language.isEmpty(); language.truncate(language.lastIndexOf(QLatin1Char{'_'}))) {
             if (QFile::exists(folder + language))
