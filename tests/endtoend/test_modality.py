@@ -313,6 +313,36 @@ class Modality(ProgramTest):
         dialog.button("Cancel").click()
         dialog.wait_closed()
 
+    def test_has_no_keys_of_the_window_in_an_open_menu(self):
+        def topology(*submenu):
+            menu = self.tree.row(*HOST).context_menu()
+            for entry in submenu:
+                menu.submenu(entry)
+            return menu
+
+        def leases():
+            self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
+            return self.main.find(pyatspi.ROLE_TABLE, "Leases").row(MAC).context_menu()
+
+        keys = "F5", "ctrl+s", "ctrl+r", "F1", "F2", "shift+F10", "ctrl+f", "ctrl+c"
+        for opened, entry, title in [
+            (topology, "Edit", "Edit host"),
+            (lambda: topology("Add parameter"), "Edit", "Edit host"),
+            (leases, "Reserve an IP address", "Reserve an IP address"),
+        ]:
+            for key in keys:
+                with self.case(key=key, title=title):
+                    menu = opened()
+                    self.program.keys(key)
+                    menu.choose(entry)
+                    dialog = self.program.window(title)
+                    dialog.button("Cancel").click()
+                    dialog.wait_closed()
+        self.assertEqual(self.server_state, "DHCP-server is stopped")
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Topology").click()
+        self.main.press("F5")  # without a menu
+        self.reload_question().answer("No")
+
     def test_lets_the_menu_of_a_lease_be_used_after_a_reload(self):
         self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
         menu = self.main.find(pyatspi.ROLE_TABLE, "Leases").row(MAC).context_menu()
