@@ -11,7 +11,7 @@ util-linux xauth"
     [wayland]="qtwayland5"
     [screenshot]="fonts-wqy-microhei maim xauth xdotool xvfb"
     [package]="dpkg-dev lintian"
-    [pictures]="blackbox librsvg2-bin python3-pil"
+    [pictures]="blackbox librsvg2-bin locales python3-pil"
     [test]="appstream at-spi2-core bind9-utils debootstrap desktop-file-utils dpkg man-db python3 python3-pyatspi \
 python3-xlib"
     [bench]="libbenchmark-dev python3"

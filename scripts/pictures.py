@@ -19,6 +19,7 @@ import Xlib.X
 
 ROOT = pathlib.Path(__file__).resolve().parents[1]
 DOCS = ROOT / "docs"
+LOCALES = {"en": "C.UTF-8", "de": "de_DE.UTF-8"}  # whose dates are shown
 SIZE = 820, 540  # of the main window; the handbook's window shows pictures of it whole
 COLOURS = 255  # of a picture; one more is left for what is transparent
 LAST_GUEST = "raspberrypi"  # of the clients that are searched for the last one to come
@@ -104,7 +105,7 @@ class Site:
     def __init__(self, language):
         self.said = Language(language)
         self.folder = DOCS / "handbook" / language
-        self.program = desktop.Program(environment={"LANGUAGE": language})
+        self.program = desktop.Program(environment={"LANGUAGE": language, "LC_ALL": LOCALES[language]})
         self.program.display = Display()
         self.main = self.window(desktop.MAIN_TITLE)
         display = self.program.display
