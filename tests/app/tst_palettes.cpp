@@ -229,6 +229,15 @@ Places buttonIcons(const QWidget &window)
     return places;
 }
 
+/// Has every button look as it does under the mouse, pressed or not.
+void touchButtons(const QWidget &window, bool arePressed)
+{
+    for (auto *button : window.findChildren<QToolButton *>()) {
+        button->setAttribute(Qt::WA_UnderMouse);
+        button->setDown(arePressed);
+    }
+}
+
 } // namespace
 
 Q_DECLARE_METATYPE(Scheme)
@@ -247,6 +256,10 @@ private slots:
     void searchIsLegible();
     void buttonsAreLegible_data() { addSchemes(); }
     void buttonsAreLegible();
+    void buttonsInUseAreLegible_data() { addSchemes(); }
+    void buttonsInUseAreLegible();
+    void selectedTextsAreLegible_data() { addSchemes(); }
+    void selectedTextsAreLegible();
     void bundledIconsAreLegible_data() { addSchemes(); }
     void bundledIconsAreLegible();
     void installedIconsAreLegible_data() { addSchemes(); }
@@ -355,6 +368,57 @@ void PalettesTest::buttonsAreLegible()
     const Places searching{buttonIcons(m_site->window())};
     QVERIFY(searching.size() >= 5);
     QTRY_COMPARE(tooFaint(picture(), searching, textContrast), QString{});
+}
+
+void PalettesTest::buttonsInUseAreLegible()
+{
+    QFETCH(Scheme, scheme);
+    use(scheme);
+    open();
+    const FMain &window{m_site->window()};
+    m_site->select({});
+    for (const int tab : {0, 1}) {
+        clickTab(window, tab);
+        if (tab == 1)
+            search(text("pc"));
+        for (const bool arePressed : {false, true}) {
+            touchButtons(window, arePressed);
+            QVERIFY(buttonIcons(window).size() >= 5);
+            QTRY_COMPARE(tooFaint(picture(), buttonIcons(window), textContrast), QString{});
+        }
+        touchButtons(window, false);
+    }
+}
+
+// They have the desktop's colours, as legible as those are.
+void PalettesTest::selectedTextsAreLegible()
+{
+    QFETCH(Scheme, scheme);
+    use(scheme);
+    open();
+    const FMain &window{m_site->window()};
+    const QRgb highlight{QColor{QLatin1String{scheme.highlight}}.rgb()};
+    const double pair{contrast(QColor{QLatin1String{scheme.highlightedText}}.rgb(), highlight)};
+    const double least{std::min(0.95 * pair, leastContrast)}; // the strokes of a short text may all be a little blurred
+    // Around the current cell, the first, is the style's frame.
+    const auto compareCell = [&](const QAbstractItemView &view, const QModelIndex &cell) {
+        const QRect place{view.visualRect(cell) & view.viewport()->rect()};
+        const QImage seen{picture().copy(in(window, view.viewport(), place))};
+        QCOMPARE(coloursOf(seen).front().second, highlight);
+        QVERIFY2(textContrast(seen) >= least, qPrintable(described(cell.data().toString(), textContrast(seen))));
+    };
+    for (const char *statement : {"default-lease-time", "shared-network", "subnet", "option", "host", "hardware"}) {
+        m_site->select(text(statement));
+        compareCell(m_site->tree(), m_site->tree().currentIndex().siblingAtColumn(1));
+    }
+
+    clickTab(window, 1);
+    const auto *table = driver::find<QTableView>(window, text("dhcpdLeaseTable"));
+    QTRY_VERIFY(table->columnWidth(0) > 20);
+    const QModelIndex lease{table->model()->index(0, 0)};
+    QTest::mouseClick(table->viewport(), Qt::LeftButton, {}, table->visualRect(lease).center());
+    for (int column{1}; column < table->model()->columnCount(); ++column)
+        compareCell(*table, lease.siblingAtColumn(column));
 }
 
 void PalettesTest::bundledIconsAreLegible()
