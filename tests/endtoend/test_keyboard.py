@@ -3,6 +3,8 @@
 
 import pyatspi
 
+import commandtest
+import desktop
 import machine
 import test_addcommands
 import test_editcommands
@@ -11,6 +13,7 @@ from keyboard import Keyboard
 from testcase import ProgramTest
 
 ASIDE = (1279, 1023)  # where the mouse lies
+STOPS = (*desktop.FIELDS, pyatspi.ROLE_CHECK_BOX, pyatspi.ROLE_PUSH_BUTTON)  # where Tab leads to, beside views
 
 
 def accept(window):
@@ -59,6 +62,13 @@ class Menus(WithoutMouse, ProgramTest):
                 self.program.keys("Escape")
                 self.wait(lambda: not menu.is_showing, f"{menu} closed")
 
+    def many_leases(self):
+        machine.LEASES.write_text(
+            "".join(test_leases.lease(f"192.0.2.{i}", "00:00:5e:00:53:01", "some") for i in range(100))
+        )
+        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
+        return self.main.find(pyatspi.ROLE_TABLE, "Leases")
+
     def test_of_the_topology_open_there(self):
         tree = self.tree
         for label in ("Default lease time: 2 minutes", "Shared network: wireless"):
@@ -67,15 +77,100 @@ class Menus(WithoutMouse, ProgramTest):
             self.assert_opens_at_current_row(tree, row)
 
     def test_of_the_leases_open_there(self):
-        machine.LEASES.write_text(
-            "".join(test_leases.lease(f"192.0.2.{i}", "00:00:5e:00:53:01", "some") for i in range(100))
-        )
-        self.main.find(pyatspi.ROLE_PAGE_TAB, "Leases").click()
-        table = self.main.find(pyatspi.ROLE_TABLE, "Leases")
+        table = self.many_leases()
         for address in ("192.0.2.3", "192.0.2.99"):
             row = table.row(address)
             row.click()
             self.assert_opens_at_current_row(table, row)
+
+    def test_brings_a_row_into_sight(self):
+        table = self.many_leases()
+        row = table.row("192.0.2.3")
+        row.click()
+        cell, display = row.cells[0], self.program.display
+        display.move_mouse(*table.box.middle)
+
+        def out_of_sight():
+            display.click(5)
+            return cell.box[1] + cell.box[3] < table.box[1]
+
+        self.wait(out_of_sight, f"{cell} out of sight of {table}")
+        display.move_mouse(*ASIDE)
+        self.assert_opens_at_current_row(table, row)
+
+
+class Rows(WithoutMouse, ProgramTest):
+    def test_are_edited_by_each_of_the_keys(self):
+        self.tree.row("All network", "Shared network: wireless").click()
+        for key in ("F2", "Return", "KP_Enter"):
+            with self.case(key=key):
+                self.main.press(key)
+                dialog = self.program.window("Edit shared network")
+                dialog.press("Escape")
+                dialog.wait_closed()
+
+
+class Order(WithoutMouse, ProgramTest):
+    """Tab goes through a dialog as it is read: from line to line, and from left to right."""
+
+    def way(self, dialog):
+        """What has the keyboard at first and after each Tab, until that is the first one again."""
+        dialog.take_keyboard()
+        way = []
+
+        def current():
+            here = [control for control in dialog.below() if control.role in STOPS and control.has("focused")]
+            return here if len(here) == 1 and not (way and here[0].path == way[-1].path) else None
+
+        while True:
+            (control,) = self.wait(current, f"the keyboard elsewhere than at the end of {way}")
+            if way and control.path == way[0].path:
+                return way
+            way.append(control)
+            self.program.keys("Tab")
+
+    def test_is_that_of_reading(self):
+        for entries in [
+            ("Add shared network",),
+            ("Add subnet",),
+            ("Add host",),
+            ("Add parameter", "Add max lease time"),
+        ]:
+            with self.case(entries=entries):
+                self.tree.row("All network").context_menu().choose(*entries)
+                dialog = self.program.window(entries[-1])
+                way = self.way(dialog)
+                stops = [control for control in dialog.below() if control.role in STOPS and control.is_enabled]
+                self.assertEqual({control.path for control in way}, {control.path for control in stops}, (way, stops))
+                for before, after in zip(way, way[1:]):
+                    (left, top, width, height), (x, y, _, _) = before.box, after.box
+                    self.assertTrue(y >= top + height or (y > top - height and x >= left + width), way)
+                dialog.press("Escape")
+                dialog.wait_closed()
+
+
+class Lists(WithoutMouse, ProgramTest):
+    def test_have_the_keyboard_when_the_last_address_is_removed(self):
+        self.tree.row("All network").context_menu().choose("Add parameter", "Add option", "Add DNS servers")
+        dialog = self.program.window("Add DNS servers")
+        view = dialog.find(pyatspi.ROLE_LIST)
+        commandtest.addresses("192.0.2.1")(dialog)
+        commandtest.without_first(pyatspi.ROLE_LIST)(dialog)
+        self.wait(lambda: self.program.hand.has_keyboard(view), f"{view} with the keyboard")
+        dialog.press("Escape")
+        dialog.wait_closed()
+
+    def test_of_routes_have_the_keyboard_in_the_new_row(self):
+        self.tree.row("All network").context_menu().choose("Add static route")
+        dialog = self.program.window("Add static route")
+        table = dialog.find(pyatspi.ROLE_TABLE, "Static routes")
+        for rows in (1, 2):
+            dialog.button("Add").click()
+            self.wait(lambda n=rows: len(table.cell_rows()) == n, f"{rows} rows in {table}")
+        self.program.hand.tab_to(table)
+        self.wait(lambda: table.cell_rows()[-1][0].has("focused"), f"the keyboard in the last row of {table}")
+        dialog.press("Escape")
+        dialog.wait_closed()
 
 
 class Leases(WithoutMouse, ProgramTest):
@@ -103,6 +198,13 @@ class Leases(WithoutMouse, ProgramTest):
         self.program.keys("ctrl+a", "ctrl+v")
         cells = "192.0.2.3 00:00:5e:00:53:03 phone-boris active 07:08:09 UTC 20 Nov 2026 04:05:06 UTC 3 Feb 2036"
         self.wait(lambda: search.text.split() == cells.split(), f"{cells}, not {search.text}")
+
+        # What is searched for next takes the place of that.
+        self.program.hand.tab_to(table)
+        self.program.keys("ctrl+f")
+        self.wait(lambda: search.has("focused"), "the keyboard in the search again")
+        self.program.type("printer")
+        self.wait(lambda: search.text == "printer", f"the other text alone, not {search.text}")
         self.program.keys("ctrl+a", "Delete")
         self.wait(lambda: len(table.rows) == 3, "all leases")
 
