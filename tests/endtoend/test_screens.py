@@ -7,6 +7,7 @@ from testcase import DesktopTest
 
 WIDTH, HEIGHT = 960, 640  # of the window on a screen of 96 dpi
 SCREEN_WIDTH, SCREEN_HEIGHT = 1280, 1024
+TOOLS = 80, 60, 400, 50  # part of the tool bar on a screen of 192 dpi
 
 
 class Window(DesktopTest):
@@ -72,3 +73,18 @@ class LaterSize(Window):
         self.assert_kept(96, (600, 480))
         self.close()
         self.assertEqual(self.open(192), (1200, 960))
+
+
+class Icons(Window):
+    def test_are_drawn_as_finely_as_the_screen_shows(self):
+        self.open(192)
+        x, y, *_ = self.display.largest_window()
+        left, top, width, height = TOOLS
+        place = desktop.Box((x + left, y + top, width, height))
+
+        def are_fine():
+            # What is merely enlarged has no line of one pixel.
+            pixels = self.display.pixels(place)
+            return any(one != two != three for one, two, three in zip(pixels, pixels[1:], pixels[2:]))
+
+        self.program.wait(are_fine, lambda: "fine icons in the tool bar")
