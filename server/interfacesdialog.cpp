@@ -21,6 +21,7 @@ InterfacesDialog::InterfacesDialog(const QMap<QString, bool> &interfaces, QWidge
     fillGroupBox(interfaces);
     auto *layout = new QVBoxLayout{this};
     layout->addWidget(m_groupBox);
+    m_buttonBox->setCenterButtons(true);
     layout->addWidget(m_buttonBox);
     scrollWhenTooTall();
 
