@@ -10,6 +10,7 @@
 #include <QListWidget>
 #include <QLocale>
 #include <QPushButton>
+#include <QScrollBar>
 #include <QShortcut>
 #include <QSplitter>
 #include <QTextBlock>
@@ -82,6 +83,11 @@ HandbookViewer::HandbookViewer(QWidget *parent)
     layOut();
 
     connect(m_page, &QTextBrowser::sourceChanged, this, &HandbookViewer::settlePage);
+    // With some fonts a slanted word at the end of a line reaches into the margin: nothing to scroll for.
+    const auto *bar = m_page->horizontalScrollBar();
+    connect(bar, &QScrollBar::rangeChanged, m_page, [this](int, int maximum) {
+        m_page->setHorizontalScrollBarPolicy(maximum <= pageMargin ? Qt::ScrollBarAlwaysOff : Qt::ScrollBarAsNeeded);
+    });
     connect(m_contents, &QListWidget::currentRowChanged, this, &HandbookViewer::showPage);
     connect(m_search, &QLineEdit::returnPressed, this, &HandbookViewer::findNext);
     connect(m_search, &QLineEdit::textChanged, m_notFound, &QWidget::hide);
