@@ -7,6 +7,8 @@
 #include <QEvent>
 #include <QLineEdit>
 
+#include <utility>
+
 namespace {
 
 constexpr auto foundStyle = "QLineEdit { color: black; }";
@@ -34,8 +36,10 @@ SearchFeedback::SearchFeedback(QLineEdit *field, const QAbstractItemModel *found
 
 void SearchFeedback::show(bool hasMatches)
 {
-    m_colour = hasMatches ? Colour::Found : Colour::NotFound;
-    colour();
+    // Setting a style has all of the page painted anew.
+    const Colour shown{hasMatches ? Colour::Found : Colour::NotFound};
+    if (std::exchange(m_colour, shown) != shown)
+        colour();
     describe();
 }
 

@@ -53,7 +53,7 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
     searchAgain();
     // Upon the reset the base asks about all rows anew. Its own ways to have that done would move rows one by one, or
     // ask twice where a row is current.
-    const QScopedValueRollback spares{m_sparesBase, hasEmptyFilter(*this)};
+    const QScopedValueRollback shows{m_showsAll, !m_search && hasEmptyFilter(*this)};
     endResetModel();
 }
 
@@ -102,8 +102,13 @@ QModelIndexList LeaseProxyModel::firstMatches(const QModelIndex &start, int most
 
 bool LeaseProxyModel::filterAcceptsRow(int row, const QModelIndex &parent) const
 {
+    return m_showsAll || isAccepted(row, parent);
+}
+
+bool LeaseProxyModel::isAccepted(int row, const QModelIndex &parent) const
+{
     const bool isFound{!m_search || (m_found ? m_found->contains(row) : m_search->contains(row))};
-    return isFound && (m_sparesBase || QSortFilterProxyModel::filterAcceptsRow(row, parent));
+    return isFound && QSortFilterProxyModel::filterAcceptsRow(row, parent);
 }
 
 const DhcpdLeasesModel *LeaseProxyModel::leases() const

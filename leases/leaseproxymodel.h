@@ -41,13 +41,16 @@ private:
     const DhcpdLeasesModel *leases() const;
     /// Whether match() can do without the base's search.
     bool isSearchable(const QModelIndex &start, int role, int hits, Qt::MatchFlags flags) const;
+    /// What filterAcceptsRow() does where it is not known at once, kept out of what is called a million times.
+    Q_NEVER_INLINE bool isAccepted(int row, const QModelIndex &parent) const;
     QModelIndexList firstMatches(const QModelIndex &start, int most) const;
     void search(const QAbstractItemModel *model);
     void searchAgain();
     void forgetFound();
 
     QString m_text;
-    bool m_sparesBase{}; // during a reset, in which the base's filter is empty and need not be asked about each row
+    // During a reset after which no filter hides a row.
+    bool m_showsAll{};
     std::unique_ptr<LeaseSearch> m_search; // null when no text is set
     // Until the leases change: what m_search found, and the search of the last match().
     std::optional<LeaseHits> m_found;
