@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/configreader.h"
 
+#include "common/vectorregisters.h"
+
 #include <algorithm>
 #include <array>
 #include <optional>
@@ -197,6 +199,7 @@ Reader::Reader(std::string_view text, DhcpdConfigDeclaration &top)
 
 bool Reader::read()
 {
+    clearVectorRegisters();
     bool quoted{};
     bool isQuotedToServer{};
     std::size_t wordStart{};

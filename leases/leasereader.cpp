@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "leases/leasereader.h"
 
+#include "common/vectorregisters.h"
 #include "leases/leasetable.h"
 
 #include <algorithm>
@@ -55,6 +56,7 @@ bool LeaseReader::readOn(const LeaseFile &file)
     if (m_position == 0)
         m_table.reserveForFile(file.size());
     std::vector<char> piece(pieceSize);
+    clearVectorRegisters();
     while (m_position < file.size()) {
         const std::optional<std::size_t> got{file.read(m_position, piece.data(), piece.size())};
         if (!got)
