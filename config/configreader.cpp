@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/configreader.h"
 
-#include "common/vectorregisters.h"
-
 #include <algorithm>
 #include <array>
 #include <optional>
@@ -199,7 +197,6 @@ Reader::Reader(std::string_view text, DhcpdConfigDeclaration &top)
 
 bool Reader::read()
 {
-    clearVectorRegisters();
     bool quoted{};
     bool isQuotedToServer{};
     std::size_t wordStart{};

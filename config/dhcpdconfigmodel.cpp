@@ -2,6 +2,7 @@
 #include "config/dhcpdconfigmodel.h"
 
 #include "common/fileio.h"
+#include "common/vectorregisters.h"
 #include "config/configreader.h"
 #include "config/configwriter.h"
 
@@ -172,6 +173,7 @@ void DhcpdConfigModel::reportUnwritten(const QString &confFile, const QString &r
 
 bool DhcpdConfigModel::parseUtf8(const QByteArray &text)
 {
+    clearVectorRegisters();
     auto allNetwork =
         readConfiguration({text.constData(), static_cast<std::size_t>(text.size())}, *m_topNode, &m_losses);
     if (!allNetwork)
