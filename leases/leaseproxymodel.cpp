@@ -6,8 +6,6 @@
 #include "leases/leaseneedle.h"
 #include "leases/leasesearch.h"
 
-#include <QScopedValueRollback>
-
 #include <algorithm>
 
 namespace {
@@ -53,8 +51,9 @@ void LeaseProxyModel::setFilterFixedString(const QString &text)
     searchAgain();
     // Upon the reset the base asks about all rows anew. Its own ways to have that done would move rows one by one, or
     // ask twice where a row is current.
-    const QScopedValueRollback shows{m_showsAll, !m_search && hasEmptyFilter(*this)};
+    m_showsAll = !m_search && hasEmptyFilter(*this);
     endResetModel();
+    m_showsAll = false;
 }
 
 QModelIndexList LeaseProxyModel::match(const QModelIndex &start, int role, const QVariant &value, int hits,
