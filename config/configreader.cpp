@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/configreader.h"
 
+#include "config/bracelesskeywords.h"
+
 #include <algorithm>
 #include <array>
 #include <optional>
@@ -33,28 +35,13 @@ constexpr std::array<Kind, 256> kinds{[] {
 
 Kind kindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
 
-// Keywords that make a declaration of a statement without a block.
-constexpr std::string_view declarationKeywords[]{"range", "subclass", "fixed-address"};
-
-// Whether a word with that first byte may be one of them: most words are told apart by it. Beyond ASCII there are case
-// variants of ASCII letters.
-constexpr std::array<bool, 256> firstBytes{[] {
-    std::array<bool, 256> table{};
-    for (const std::string_view keyword : declarationKeywords) {
-        constexpr std::size_t caseDistance{'a' - 'A'};
-        const std::size_t first{static_cast<unsigned char>(keyword.front())};
-        table[first] = table[first - caseDistance] = true;
-    }
-    for (std::size_t byte{0x80}; byte < table.size(); ++byte)
-        table[byte] = true;
-    return table;
-}()};
-
-bool isDeclarationKeyword(std::string_view word)
+/// The place from `place` on where something else than an ordinary byte stands; the end of the text or behind it when
+/// there is none.
+std::size_t nextSpecial(std::string_view text, std::size_t place)
 {
-    return firstBytes[static_cast<unsigned char>(word.front())] &&
-           std::any_of(std::begin(declarationKeywords), std::end(declarationKeywords),
-                       [word](std::string_view keyword) { return equalsIgnoringCase(word, keyword); });
+    while (place < text.size() && kindOf(text[place]) == Kind::Ordinary)
+        ++place;
+    return place;
 }
 
 /// Follows the quoted texts as the server sees them, where the reader sees words, and notes what it changes in them.
@@ -172,16 +159,15 @@ private:
 
     void endWord(std::size_t begin, std::size_t end);
     bool endStatement(Kind delimiter);
-    WordList takeWords();
+    const WordList::Buffer &completeWords();
     void clearWords();
     void closeBlock();
 
     std::string_view m_text;
     LossWatcher m_losses;
     std::unique_ptr<DhcpdConfigDeclaration> m_allNetwork;
-    DhcpdConfigDeclaration *m_current; // the block that is open
-    WordList::Buffer m_words;          // of the statement that is being read
-    int m_wordCount{};
+    DhcpdConfigDeclaration *m_current;          // the block that is open
+    WordList::Buffer m_words;                   // of the statement that is being read
     bool m_hasDeclarationKeyword{};             // whether one of those words makes it a declaration
     std::optional<StrayKeyword> m_strayKeyword; // where that is not the first one
 };
@@ -200,10 +186,8 @@ bool Reader::read()
     bool quoted{};
     bool isQuotedToServer{};
     std::size_t wordStart{};
-    for (std::size_t i{}; i < m_text.size(); ++i) {
+    for (std::size_t i{nextSpecial(m_text, 0)}; i < m_text.size(); i = nextSpecial(m_text, i + 1)) {
         const Kind kind{kindOf(m_text[i])};
-        if (kind == Kind::Ordinary)
-            continue;
         if (kind == Kind::Quote) {
             quoted = !quoted;
             isQuotedToServer = m_losses.seeQuote(i);
@@ -233,10 +217,9 @@ void Reader::endWord(std::size_t begin, std::size_t end)
         return;
     const std::string_view word{m_text.substr(begin, end - begin)};
     m_words.add(word);
-    ++m_wordCount;
-    if (!m_hasDeclarationKeyword && isDeclarationKeyword(word)) {
+    if (!m_hasDeclarationKeyword && isBracelessKeyword(word)) {
         m_hasDeclarationKeyword = true;
-        if (m_wordCount > 1)
+        if (m_words.count() > 1)
             m_strayKeyword = StrayKeyword{begin, m_losses.isQuoted()};
     }
 }
@@ -245,36 +228,34 @@ bool Reader::endStatement(Kind delimiter)
 {
     const bool isDeclaration{m_hasDeclarationKeyword || delimiter == Kind::OpeningBrace};
     if (delimiter == Kind::ClosingBrace) {
-        clearWords(); // they make no statement before a closing brace, deliberately
-        closeBlock();
-    } else if (m_wordCount == 0) {
+        closeBlock(); // what words stand before it make no statement, deliberately
+    } else if (m_words.count() == 0) {
         return true;
     } else if (isDeclaration) {
         if (m_strayKeyword && delimiter == Kind::Semicolon)
             m_losses.seeStrayKeyword(m_strayKeyword->place, m_strayKeyword->isQuoted);
-        auto *declaration = m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(takeWords(), m_current));
+        auto *declaration =
+            m_current->addDeclaration(std::make_unique<DhcpdConfigDeclaration>(completeWords(), m_current));
         if (delimiter == Kind::OpeningBrace) {
             declaration->setBraced();
             m_current = declaration;
         }
     } else {
-        m_current->addParam(std::make_unique<DhcpdConfigParam>(takeWords(), m_current));
+        m_current->addParam(std::make_unique<DhcpdConfigParam>(completeWords(), m_current));
     }
+    clearWords();
     return m_current->depth() < maximumBlockDepth;
 }
 
-WordList Reader::takeWords()
+const WordList::Buffer &Reader::completeWords()
 {
-    m_words.addEmpty(std::max(0, 2 - m_wordCount)); // a statement has two words at least
-    WordList words{m_words};
-    clearWords();
-    return words;
+    m_words.addEmpty(std::max(0, 2 - m_words.count())); // a statement has two words at least
+    return m_words;
 }
 
 void Reader::clearWords()
 {
     m_words.clear();
-    m_wordCount = 0;
     if (m_hasDeclarationKeyword)
         m_strayKeyword.reset();
     m_hasDeclarationKeyword = false;

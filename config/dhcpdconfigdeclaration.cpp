@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: GPL-3.0-or-later
 #include "config/dhcpdconfigdeclaration.h"
 
+#include "config/bracelesskeywords.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -12,12 +14,12 @@ constexpr std::size_t firstCapacity{3};
 } // namespace
 
 DhcpdConfigDeclaration::DhcpdConfigDeclaration(const QStringList &words, DhcpdConfigDeclaration *parent)
-    : DhcpdConfigDeclaration{WordList{WordList::Buffer{words}}, parent}
+    : DhcpdConfigStatement{WordList::Buffer{words}, parent}
 {
 }
 
-DhcpdConfigDeclaration::DhcpdConfigDeclaration(WordList words, DhcpdConfigDeclaration *parent)
-    : DhcpdConfigStatement{std::move(words), parent}
+DhcpdConfigDeclaration::DhcpdConfigDeclaration(const WordList::Buffer &words, DhcpdConfigDeclaration *parent)
+    : DhcpdConfigStatement{words, parent}
 {
 }
 
@@ -55,7 +57,7 @@ DhcpdConfigDeclaration *DhcpdConfigDeclaration::addDeclaration(const QStringList
 
 bool DhcpdConfigDeclaration::isOneLine() const
 {
-    return (isRange() || isSubclass() || isFixedAddress()) && !(isBraced() && childCount() > 0);
+    return isBracelessKeyword(words().at(0)) && !(isBraced() && childCount() > 0);
 }
 
 void DhcpdConfigDeclaration::removeChild(DhcpdConfigStatement *statement)

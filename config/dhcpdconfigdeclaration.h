@@ -18,7 +18,7 @@ public:
     using Declarations = std::vector<std::unique_ptr<DhcpdConfigDeclaration>>;
 
     DhcpdConfigDeclaration(const QStringList &words, DhcpdConfigDeclaration *parent);
-    DhcpdConfigDeclaration(WordList words, DhcpdConfigDeclaration *parent);
+    DhcpdConfigDeclaration(const WordList::Buffer &words, DhcpdConfigDeclaration *parent);
 
     const Parameters &parameters() const;
     const Declarations &declarations() const;

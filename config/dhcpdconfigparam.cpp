@@ -3,8 +3,6 @@
 
 #include "config/parameterkind.h"
 
-#include <utility>
-
 namespace {
 
 // Without digit separators: lupdate takes them for quotes and misses the texts between them.
@@ -34,12 +32,12 @@ QString timeText(qint64 seconds)
 } // namespace
 
 DhcpdConfigParam::DhcpdConfigParam(const QStringList &words, DhcpdConfigDeclaration *parent)
-    : DhcpdConfigParam{WordList{WordList::Buffer{words}}, parent}
+    : DhcpdConfigStatement{WordList::Buffer{words}, parent}
 {
 }
 
-DhcpdConfigParam::DhcpdConfigParam(WordList words, DhcpdConfigDeclaration *parent)
-    : DhcpdConfigStatement{std::move(words), parent}
+DhcpdConfigParam::DhcpdConfigParam(const WordList::Buffer &words, DhcpdConfigDeclaration *parent)
+    : DhcpdConfigStatement{words, parent}
 {
 }
 

@@ -8,7 +8,7 @@ class DhcpdConfigParam final : public DhcpdConfigStatement
 {
 public:
     DhcpdConfigParam(const QStringList &words, DhcpdConfigDeclaration *parent);
-    DhcpdConfigParam(WordList words, DhcpdConfigDeclaration *parent);
+    DhcpdConfigParam(const WordList::Buffer &words, DhcpdConfigDeclaration *parent);
 
     void removeChild(DhcpdConfigStatement *statement) override;
     bool removeChildren(int row, int count) override;

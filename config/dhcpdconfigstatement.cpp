@@ -14,8 +14,8 @@ constexpr int indentUnit{4};
 
 } // namespace
 
-DhcpdConfigStatement::DhcpdConfigStatement(WordList words, DhcpdConfigDeclaration *parent)
-    : m_words{std::move(words)}
+DhcpdConfigStatement::DhcpdConfigStatement(const WordList::Buffer &words, DhcpdConfigDeclaration *parent)
+    : m_words{words}
 {
     setParent(parent);
 }
@@ -45,7 +45,7 @@ bool DhcpdConfigStatement::setWord(int index, const QString &text)
 {
     if (index < 0 || index >= wordCount())
         return false;
-    m_words.replace(index, 1, WordList::Buffer{{text}});
+    m_words.replace(index, 1, WordList::Buffer{QStringList{text}});
     return true;
 }
 

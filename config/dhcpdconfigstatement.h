@@ -97,7 +97,7 @@ public:
 
 protected:
     /// Does not put the statement among the parent's children: addParam() and addDeclaration() do.
-    DhcpdConfigStatement(WordList words, DhcpdConfigDeclaration *parent);
+    DhcpdConfigStatement(const WordList::Buffer &words, DhcpdConfigDeclaration *parent);
 
     /// The words from `position` on, or the last one when they are fewer, joined by single spaces.
     QString joinedWordsFrom(int position) const;

@@ -2,7 +2,7 @@
 #include "config/wordlist.h"
 
 #include <algorithm>
-#include <cstring>
+#include <utility>
 
 namespace {
 
@@ -17,26 +17,22 @@ char asciiLower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A
 WordList::Buffer::Buffer(const QStringList &words)
 {
     for (const QString &word : words) {
-        const QByteArray utf8{word.toUtf8()};
+        const QByteArray &utf8{m_texts.emplace_back(word.toUtf8())};
         add({utf8.constData(), static_cast<std::size_t>(utf8.size())});
     }
 }
 
-void WordList::Buffer::add(std::string_view word)
+WordList::WordList(std::string_view head, const Buffer &words, std::string_view tail)
 {
-    if (word.size() < longWordMark) {
-        m_encoded.push_back(static_cast<char>(word.size()));
-    } else {
-        const auto size = static_cast<Size>(word.size());
-        m_encoded.push_back(static_cast<char>(longWordMark));
-        m_encoded.append(reinterpret_cast<const char *>(&size), sizeof size);
-    }
-    m_encoded.append(word);
+    std::size_t size{head.size() + static_cast<std::size_t>(words.m_emptyCount) + tail.size()};
+    for (const std::string_view word : words.m_words)
+        size += word.size() + 1 + (word.size() < longWordMark ? 0 : sizeof(Size));
+    char *to{std::copy(head.begin(), head.end(), allocate(size))};
+    for (const std::string_view word : words.m_words)
+        to = std::copy(word.begin(), word.end(), putLength(to, word.size()));
+    to = std::fill_n(to, words.m_emptyCount, '\0');
+    std::copy(tail.begin(), tail.end(), to);
 }
-
-void WordList::Buffer::addEmpty(int count) { m_encoded.append(static_cast<std::size_t>(count), '\0'); }
-
-WordList::WordList(const Buffer &words) { replace(0, 0, words); }
 
 int WordList::count() const
 {
@@ -46,14 +42,6 @@ int WordList::count() const
     return count;
 }
 
-std::string_view WordList::at(int index) const
-{
-    if (index < 0)
-        return {};
-    const auto it = iteratorAt(index);
-    return it == end() ? std::string_view{} : *it;
-}
-
 void WordList::replace(int position, int count, const Buffer &words)
 {
     const auto first = iteratorAt(position);
@@ -61,26 +49,33 @@ void WordList::replace(int position, int count, const Buffer &words)
     for (; count > 0; --count)
         ++afterwards;
 
-    const std::string_view head{begin().m_at, static_cast<std::size_t>(first.m_at - begin().m_at)};
-    const std::string_view tail{afterwards.m_at, static_cast<std::size_t>(end().m_at - afterwards.m_at)};
-    const auto size = static_cast<Size>(head.size() + words.m_encoded.size() + tail.size());
-    // Not make_unique(), which would fill the block with zeros first.
-    std::unique_ptr<char[]> block{size > 0 ? new char[sizeof size + size] : nullptr};
-    if (block) {
-        char *to{block.get()};
-        for (const std::string_view part : {std::string_view{reinterpret_cast<const char *>(&size), sizeof size}, head,
-                                            std::string_view{words.m_encoded}, tail})
-            to = std::copy(part.begin(), part.end(), to);
-    }
-    m_block = std::move(block);
+    WordList list{{data(), static_cast<std::size_t>(first.m_at - data())},
+                  words,
+                  {afterwards.m_at, static_cast<std::size_t>(end().m_at - afterwards.m_at)}};
+    std::swap(m_bytes, list.m_bytes);
 }
 
-WordList::Iterator WordList::iteratorAt(int index) const
+char *WordList::putLength(char *to, std::size_t length)
 {
-    auto it = begin();
-    for (const auto last = end(); index > 0 && it != last; --index)
-        ++it;
-    return it;
+    if (length < longWordMark) {
+        *to = static_cast<char>(length);
+        return to + 1;
+    }
+    *to = static_cast<char>(longWordMark);
+    return putValue(to + 1, static_cast<Size>(length));
+}
+
+/// Room for words that take `size` bytes.
+char *WordList::allocate(std::size_t size)
+{
+    if (size <= nearCapacity) {
+        m_bytes.back() = static_cast<char>(size);
+        return m_bytes.data();
+    }
+    m_bytes.back() = static_cast<char>(blockMark);
+    char *block{new char[size]};
+    putValue(putValue(m_bytes.data(), block), static_cast<Size>(size));
+    return block;
 }
 
 QString decodedWord(std::string_view utf8)

@@ -156,7 +156,7 @@ void DhcpdConfigStatementTest::keepsAnyWord_data()
     QTest::addRow("beyond ASCII") << QStringLiteral("Zürich");
     QTest::addRow("beyond the basic plane") << QString::fromUtf8("\xF0\x9F\x98\x80");
     QTest::addRow("byte order marks") << QString{3, QChar{QChar::ByteOrderMark}} + QStringLiteral("x");
-    for (const int size : {253, 254, 255, 256, 257, 65535, 65536, 1000000})
+    for (const int size : {34, 35, 36, 37, 253, 254, 255, 256, 257, 65535, 65536, 1000000})
         QTest::addRow("%d characters", size) << QString{size, QLatin1Char{'x'}};
 }
 
@@ -169,6 +169,8 @@ void DhcpdConfigStatementTest::keepsAnyWord()
     QVERIFY(param.setWord(1, QStringLiteral("other")));
     QVERIFY(param.setWord(0, word));
     QCOMPARE(nodeOf(param).words, (QStringList{word, QStringLiteral("other"), QStringLiteral("last")}));
+    QVERIFY(param.setWord(0, QStringLiteral("short")));
+    QCOMPARE(nodeOf(param).words, split("short|other|last"));
 }
 
 void DhcpdConfigStatementTest::joinsWords_data()
