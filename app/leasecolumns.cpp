@@ -80,9 +80,11 @@ void LeaseColumns::noteResized(int column)
         m_setByUser.insert(column);
 }
 
-// Never makes a column narrower: while the user scrolls, the columns would dance.
+// Never makes a column narrower, nor the rows' numbers: while the user scrolls or searches, the columns would dance.
 void LeaseColumns::widen()
 {
+    QHeaderView &numbers{*m_table->verticalHeader()};
+    numbers.setMinimumWidth(std::max(numbers.minimumWidth(), numbers.width()));
     const QScopedValueRollback widening{m_isWidening, true};
     QHeaderView &header{*m_table->horizontalHeader()};
     const auto &rows = static_cast<const QAbstractItemView &>(*m_table);

@@ -95,6 +95,7 @@ void LeasePage::search(const QString &text)
     const auto viewState = text.isEmpty() ? std::make_optional<LeaseViewState>(table) : std::nullopt;
     // The filter respects letter case, the search among the rows that it left does not, deliberately.
     m_proxy.setFilterFixedString(text);
+    table.doItemsLayout(); // at once: scroll bars that come or go would have all painted twice
 
     const QModelIndexList first{matches(text, 1)};
     const bool isFound{!first.isEmpty()};

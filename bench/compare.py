@@ -57,6 +57,7 @@ KEYS = (
     Key("none, short", "zz", "zzz"),
     Key("none, rare", "qq", "qqq"),
     Key("cleared", "host-10", ""),
+    Key("cleared after none", "hostx", ""),
 )
 
 

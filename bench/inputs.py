@@ -49,7 +49,7 @@ def plain_block(number, start):
         "  binding state active;\n  next binding state free;\n  rewind binding state free;\n"
         f"  hardware ethernet 02:00:00:{low};\n"
         f'  uid "\\001\\002\\000\\000\\{number >> 16 & 7:03o}\\001\\{number & 63:03o}";\n'
-        f'  client-hostname "host-{number:07}";\n}}\n'
+        f'  client-hostname "host-{number % 100:02}{number // 100:05}";\n}}\n'
     )
 
 
@@ -91,7 +91,7 @@ class Client:
     kinds = (
         ("3c:52:82", "MSFT 5.0", "DESKTOP-"),
         ("f8:b1:56", "MSFT 5.0", "laptop-"),
-        ("00:50:56", "dhcpcd-9.4.1:Linux-5.10.0", "node-"),
+        ("00:50:56", "dhcpcd-9.4.1:Linux-5.10.0", "host-"),
         ("be:7a:13", "android-dhcp-14", ""),
         ("d0:67:e5", "PXEClient:Arch:00007:UNDI:003016", "lab-"),
         ("00:1b:a9", "Hewlett-Packard LaserJet", "NPI"),

@@ -41,11 +41,11 @@ QByteArray lease(const QByteArray &address, const QByteArray &name, const QByteA
 
 const QByteArray longName{"a-name-that-is-quite-a-lot-longer-than-the-names-of-all-others"};
 
-// Of the addresses from 10.0.0.0 to 10.0.0.199 and from 10.0.1.0 to 10.0.1.199.
-QByteArray manyLeases()
+// Of the addresses from 10.0.0.0 to 10.0.0.199, from 10.0.1.0 to 10.0.1.199 and so on.
+QByteArray manyLeases(int count = 400)
 {
     QByteArray leases;
-    for (int i{0}; i < 400; ++i)
+    for (int i{0}; i < count; ++i)
         leases += lease("10.0." + QByteArray::number(i / 200) + '.' + QByteArray::number(i % 200), "some");
     return leases;
 }
@@ -243,6 +243,7 @@ private slots:
     void leaseThatIsOnlyCurrentIsNotSelected_data();
     void leaseThatIsOnlyCurrentIsNotSelected();
     void columnsShowWhatIsScrolledTo();
+    void searchMovesNoColumn();
     void columnsShowWhatArrives_data();
     void columnsShowWhatArrives();
     void columnsAreTheUsersToDrag();
@@ -763,6 +764,25 @@ void LeaseCommandsTest::columnsShowWhatIsScrolledTo()
     site.table->verticalScrollBar()->setValue(0);
     QCoreApplication::processEvents();
     QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::HostName), wide);
+}
+
+void LeaseCommandsTest::searchMovesNoColumn()
+{
+    writeTestFile(paths::leases(), manyLeases(10'000) + lease("10.0.99.1", "only"));
+    const Site site{*m_machine};
+    const auto left = [&site] {
+        site.window->grab(); // has it laid out
+        return site.table->viewport()->mapTo(site.window.get(), QPoint{}).x();
+    };
+    const int before{left()};
+    QCoreApplication::processEvents();
+    for (const char *text : {"o", "nl", "y", "?"}) {
+        site.type(QString::fromLatin1(text));
+        QCOMPARE(left(), before);
+    }
+    QCOMPARE(site.table->model()->rowCount(), 0);
+    site.field->clear();
+    QCOMPARE(left(), before);
 }
 
 void LeaseCommandsTest::columnsShowWhatArrives_data() { addReloads(); }
