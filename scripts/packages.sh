@@ -41,9 +41,9 @@ missing_packages() {
     local group package
     for group; do
         for package in ${packages[$group]}; do
-            # A line for each architecture that it is known of.
+            # A line for each architecture that it is known of. What has only triggers left to run is installed.
             dpkg-query --show --showformat='${db:Status-Status}\n' "$package" 2>/dev/null |
-                grep --quiet --line-regexp installed || echo "$package"
+                grep --quiet --extended-regexp --line-regexp 'installed|triggers-(awaited|pending)' || echo "$package"
         done
     done
 }
