@@ -10,9 +10,12 @@
 #include <QLabel>
 #include <QMessageBox>
 
+#include <utility>
+
 namespace {
 
 constexpr int stateIndent{5};
+constexpr int settlingMilliseconds{5000};
 
 } // namespace
 
@@ -26,6 +29,11 @@ ServiceControls::ServiceControls(const Ui::FMain &ui, QWidget *window)
     m_stateLabel->setIndent(stateIndent);
     m_stateLabel->setText(m_manager->serverStateText());
     ui.statusBar->addWidget(m_stateLabel);
+    m_settling.setSingleShot(true);
+    m_settling.setInterval(settlingMilliseconds);
+    // Queued, so that a box opens between two operations, and not for an answer that has "failed" before "running".
+    connect(m_manager.get(), &DhcpServerManager::serverStateChanged, this, &ServiceControls::watchStart,
+            Qt::QueuedConnection);
     connect(ui.actionRestart, &QAction::triggered, this, [this] {
         if (mayStartCommand())
             m_manager->restartServer();
@@ -63,6 +71,18 @@ void ServiceControls::showState(DhcpServerManager::ServerStates state)
         m_ui.actionStartStopServer->setEnabled(false);
         break;
     }
+}
+
+// A unit whose start is done as soon as the server's process is there, as Ubuntu's, starts with success also a server
+// that then refuses its configuration.
+void ServiceControls::watchStart(DhcpServerManager::ServerStates state)
+{
+    if (std::exchange(m_lastState, state) == DhcpServerManager::Updating)
+        m_settling.start();
+    if (!m_settling.isActive() || !m_manager->hasStartedServerDied())
+        return;
+    m_settling.stop();
+    emit error(QObject::tr("Operation with DHCP-server failed\n%1").arg(m_manager->serverStateText()));
 }
 
 void ServiceControls::chooseInterfaces()

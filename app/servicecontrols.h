@@ -4,6 +4,7 @@
 #include "server/dhcpservermanager.h"
 
 #include <QObject>
+#include <QTimer>
 
 #include <memory>
 
@@ -31,10 +32,18 @@ public:
     void showState(DhcpServerManager::ServerStates state);
     void chooseInterfaces();
 
+signals:
+    /// The server has died soon after a start that the service manager called a success.
+    void error(const QString &message);
+
 private:
+    void watchStart(DhcpServerManager::ServerStates state);
+
     const Ui::FMain &m_ui;
     QWidget *m_window;
     QLabel *m_stateLabel; // the status bar's
     std::unique_ptr<DhcpServerManager> m_manager;
     std::unique_ptr<ServiceWatch> m_watch;
+    DhcpServerManager::ServerStates m_lastState{DhcpServerManager::Updating};
+    QTimer m_settling; // runs for a while after an operation
 };

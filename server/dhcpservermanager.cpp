@@ -53,6 +53,8 @@ QString DhcpServerManager::stateText(ServerStates state)
 
 bool DhcpServerManager::isServerRunning() const { return m_state == Running; }
 
+bool DhcpServerManager::hasStartedServerDied() const { return m_wasStarted && m_state == Stopped && m_serverHasDied; }
+
 void DhcpServerManager::runServer()
 {
     operate(QStringLiteral("start"), Running, [this] { emit information(QObject::tr("DHCP-server already running")); });
@@ -84,7 +86,7 @@ void DhcpServerManager::checkRunning()
     }
     const ServiceStatus status{query.output()};
     if (status.stopped) {
-        m_serverHasDied = status.exited;
+        noteStop(status);
         setState(Stopped);
     }
     // Deliberately no "else": of a text that has both, running is what counts.
@@ -109,7 +111,7 @@ void DhcpServerManager::handleFollowingFinished(int /*exitCode*/, QProcess::Exit
     if (wasAnswered(*m_following)) {
         const ServiceStatus status{m_following->output()};
         if (status.stopped && !status.running)
-            m_serverHasDied = status.exited;
+            noteStop(status);
         if (status.running && m_state != Running)
             setState(Running);
         else if (status.stopped && !status.running && m_state != Stopped)
@@ -137,6 +139,12 @@ void DhcpServerManager::handleProcessFinished(int exitCode, QProcess::ExitStatus
     checkRunning();
 }
 
+void DhcpServerManager::noteStop(const ServiceStatus &status)
+{
+    m_serverHasDied = status.died;
+    m_unitIsActive = status.exited;
+}
+
 void DhcpServerManager::setState(ServerStates state)
 {
     m_state = state;
@@ -150,13 +158,15 @@ void DhcpServerManager::operate(const QString &verb, ServerStates exceptIn, cons
         report(QObject::tr("Some operation with DHCP-server already executes"));
         return;
     }
+    m_wasStarted = false;
     checkRunning();
     if (m_state == exceptIn) {
         instead();
         return;
     }
     // To a service that is active although its server has died, "start" does nothing.
-    const bool needsRestart{m_state == Stopped && m_serverHasDied};
+    const bool needsRestart{m_state == Stopped && m_unitIsActive};
+    m_wasStarted = verb != QLatin1String{"stop"};
     setState(Updating);
     m_process->send(needsRestart ? QStringLiteral("restart") : verb);
 }
@@ -172,6 +182,7 @@ void DhcpServerManager::handleProcessError(QProcess::ProcessError processError)
 
 void DhcpServerManager::reportFailedOperation(const QString &detail)
 {
+    m_wasStarted = false;
     report(QObject::tr("Operation with DHCP-server failed\n%1").arg(detail));
 }
 

@@ -14,6 +14,7 @@
 #include <memory>
 
 class ServiceCommand;
+struct ServiceStatus;
 
 /// The DHCP server as a service of this machine: its state, starting and stopping it, and the interfaces it serves.
 ///
@@ -46,6 +47,9 @@ public:
     static QString stateText(ServerStates state);
     bool isServerRunning() const;
     ServerStates state() const { return m_state; }
+    /// Whether the server has ended by itself although the service manager called the last operation, a start or
+    /// restart, a success.
+    bool hasStartedServerDied() const;
 
     /// While an error() is reported: the system's reason for it; empty where there is none.
     const QString &errorReason() const { return m_errorReason; }
@@ -95,6 +99,7 @@ public slots:
     void writeDHCPServerConfig(const QString &path = paths::serverDefaults());
 
 private:
+    void noteStop(const ServiceStatus &status);
     void setState(ServerStates state);
     void operate(const QString &verb, ServerStates exceptIn, const std::function<void()> &instead);
     void handleProcessError(QProcess::ProcessError processError);
@@ -108,7 +113,9 @@ private:
     std::unique_ptr<ServiceCommand> m_following; // the query of followState()
     bool m_followAgain{};                        // the service may have changed since that query began
     ServerStates m_state{Updating};
-    bool m_serverHasDied{}; // the service counts as stopped, but for the service manager it is active
+    bool m_serverHasDied{}; // the service is stopped, which nobody asked for
+    bool m_unitIsActive{};  // the service counts as stopped, but for the service manager it is active
+    bool m_wasStarted{};    // by the last operation, as far as it is known to have worked
     QString m_errorReason;
     QString m_filePath;      // of the defaults file read last
     QStringList m_fileLines; // with their terminators

@@ -5,6 +5,7 @@
 #include "tests/support/fakeservicemanager.h"
 
 #include <QAction>
+#include <QCoreApplication>
 #include <QLabel>
 #include <QStatusBar>
 #include <QTest>
@@ -29,10 +30,24 @@ QAction *startOrStop(const FMain &window)
     return window.findChild<QAction *>(QStringLiteral("actionStartStopServer"));
 }
 
+QAction *restart(const FMain &window) { return window.findChild<QAction *>(QStringLiteral("actionRestart")); }
+
+FakeSystemctl::Reply successWith(FakeSystemctl::State state) { return {{}, {}, 0, state, 0}; }
+
+const FakeSystemctl::Reply hasExited{"Active: active (exited)\n", {}, 0, {}, 0};
+
 const QString isRunning{QStringLiteral("DHCP-server is running")};
 const QString isStopped{QStringLiteral("DHCP-server is stopped")};
 
+ModalBoxes::Box failureBox(const QString &detail)
+{
+    return errorBox(QStringLiteral("Operation with DHCP-server failed\n") + detail);
+}
+
 } // namespace
+
+Q_DECLARE_METATYPE(FakeSystemctl::State)
+Q_DECLARE_METATYPE(FakeSystemctl::Reply)
 
 class ServiceStateTest final : public QObject
 {
@@ -44,8 +59,16 @@ private slots:
 
     void followsWhatOthersDo();
     void becomesUsableWhenServiceHasStarted();
+    void tellsOfServerThatDiesInItsStart();
+    void tellsOfServerThatDiesSoonAfterItsStart_data();
+    void tellsOfServerThatDiesSoonAfterItsStart();
+    void tellsOfFailedStartOnce();
+    void doesNotTakeStopForDeath();
+    void doesNotBlameStartForLaterDeath();
 
 private:
+    std::unique_ptr<FMain> openWindow(const TestMachine &machine) const;
+
     std::unique_ptr<FakeServiceManager> m_bus;
 };
 
@@ -55,15 +78,23 @@ void ServiceStateTest::initTestCase()
     QVERIFY2(m_bus->isRunning(), "dbus-daemon is not installed");
 }
 
+// A window that is told of changes.
+std::unique_ptr<FMain> ServiceStateTest::openWindow(const TestMachine &machine) const
+{
+    const int subscribers{m_bus->subscribers()};
+    auto window = machine.openWindow();
+    [&] { QTRY_COMPARE(m_bus->subscribers(), subscribers + 1); }();
+    return window;
+}
+
 void ServiceStateTest::followsWhatOthersDo()
 {
     TestMachine machine{FakeSystemctl::Running};
-    const auto window = machine.openWindow();
-    QTRY_COMPARE(m_bus->subscribers(), 1);
+    const auto window = openWindow(machine);
     QCOMPARE(shownState(*window), isRunning);
 
     // The server is killed.
-    machine.systemctl().setReply(QStringLiteral("status"), {"Active: active (exited)\n", {}, 0, {}, 0});
+    machine.systemctl().setReply(QStringLiteral("status"), hasExited);
     m_bus->announce();
     QTRY_COMPARE(shownState(*window), isStopped);
     QCOMPARE(startOrStop(*window)->text(), QStringLiteral("Start DHCP-server"));
@@ -88,6 +119,97 @@ void ServiceStateTest::becomesUsableWhenServiceHasStarted()
     machine.systemctl().setState(FakeSystemctl::Running);
     QTRY_COMPARE_WITH_TIMEOUT(shownState(*window), isRunning, 30000);
     QVERIFY(startOrStop(*window)->isEnabled());
+}
+
+void ServiceStateTest::tellsOfServerThatDiesInItsStart()
+{
+    TestMachine machine;
+    machine.systemctl().setReply(QStringLiteral("start"), successWith(FakeSystemctl::Failed));
+    const auto window = openWindow(machine);
+    ModalBoxes boxes;
+    for (QAction *action : {startOrStop(*window), restart(*window)}) {
+        boxes.expectBox(failureBox(isStopped), QMessageBox::Ok);
+        action->trigger();
+        boxes.verify();
+        QCOMPARE(shownState(*window), isStopped);
+        QCOMPARE(startOrStop(*window)->text(), QStringLiteral("Start DHCP-server"));
+    }
+}
+
+void ServiceStateTest::tellsOfServerThatDiesSoonAfterItsStart_data()
+{
+    QTest::addColumn<FakeSystemctl::State>("state");
+    QTest::addColumn<FakeSystemctl::Reply>("death");
+    const FakeSystemctl::Reply hasFailed{FakeSystemctl::statusReply(FakeSystemctl::Failed)};
+    QTest::addRow("start of a unit") << FakeSystemctl::Stopped << hasFailed;
+    QTest::addRow("start by an init script") << FakeSystemctl::Stopped << hasExited;
+    QTest::addRow("restart of a unit") << FakeSystemctl::Running << hasFailed;
+    QTest::addRow("restart by an init script") << FakeSystemctl::Running << hasExited;
+}
+
+void ServiceStateTest::tellsOfServerThatDiesSoonAfterItsStart()
+{
+    QFETCH(const FakeSystemctl::State, state);
+    QFETCH(const FakeSystemctl::Reply, death);
+    TestMachine machine{state};
+    const auto window = openWindow(machine);
+    ModalBoxes boxes;
+    (state == FakeSystemctl::Running ? restart(*window) : startOrStop(*window))->trigger();
+    QTRY_COMPARE(shownState(*window), isRunning);
+
+    machine.systemctl().setReply(QStringLiteral("status"), death);
+    boxes.expectBox(failureBox(isStopped), QMessageBox::Ok);
+    m_bus->announce();
+    boxes.verify();
+    QCOMPARE(shownState(*window), isStopped);
+}
+
+void ServiceStateTest::tellsOfFailedStartOnce()
+{
+    TestMachine machine;
+    machine.systemctl().setReply(QStringLiteral("start"), {{}, "Job failed.\n", 1, FakeSystemctl::Failed, 0});
+    const auto window = openWindow(machine);
+    ModalBoxes boxes;
+    boxes.expectBox(failureBox(QStringLiteral("Job failed.\n")), QMessageBox::Ok);
+    startOrStop(*window)->trigger();
+    boxes.verify();
+    QTRY_COMPARE(shownState(*window), isStopped);
+    QCoreApplication::processEvents();
+}
+
+void ServiceStateTest::doesNotTakeStopForDeath()
+{
+    TestMachine machine;
+    const auto window = openWindow(machine);
+    ModalBoxes boxes;
+    startOrStop(*window)->trigger();
+    QTRY_COMPARE(shownState(*window), isRunning);
+    machine.systemctl().setState(FakeSystemctl::Stopped); // by somebody else
+    m_bus->announce();
+    QTRY_COMPARE(shownState(*window), isStopped);
+    QCoreApplication::processEvents();
+
+    // A server that ends badly when it is told to end.
+    startOrStop(*window)->trigger();
+    QTRY_COMPARE(shownState(*window), isRunning);
+    machine.systemctl().setReply(QStringLiteral("stop"), successWith(FakeSystemctl::Failed));
+    startOrStop(*window)->trigger();
+    QTRY_COMPARE(shownState(*window), isStopped);
+    QCoreApplication::processEvents();
+}
+
+void ServiceStateTest::doesNotBlameStartForLaterDeath()
+{
+    TestMachine machine;
+    const auto window = openWindow(machine);
+    ModalBoxes boxes;
+    startOrStop(*window)->trigger();
+    QTRY_COMPARE(shownState(*window), isRunning);
+    QTest::qWait(6000); // longer than a death is looked for
+    machine.systemctl().setState(FakeSystemctl::Failed);
+    m_bus->announce();
+    QTRY_COMPARE(shownState(*window), isStopped);
+    QCoreApplication::processEvents();
 }
 
 QTEST_MAIN(ServiceStateTest)

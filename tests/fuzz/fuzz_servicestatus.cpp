@@ -15,14 +15,19 @@ struct Phrase
 };
 
 constexpr Phrase phrases[]{
-    {"Active: active (running)", &ServiceStatus::running}, {"Active: inactive (dead)", &ServiceStatus::stopped},
-    {"Active: failed", &ServiceStatus::stopped},           {"Active: active (exited)", &ServiceStatus::stopped},
+    {"Active: active (running)", &ServiceStatus::running},
+    {"Active: inactive (dead)", &ServiceStatus::stopped},
+    {"Active: failed", &ServiceStatus::stopped},
+    {"Active: active (exited)", &ServiceStatus::stopped},
     {"Active: active (exited)", &ServiceStatus::exited},
+    {"Active: active (exited)", &ServiceStatus::died},
+    {"Active: failed", &ServiceStatus::died},
 };
 
 bool areAlike(const ServiceStatus &first, const ServiceStatus &second)
 {
-    return first.running == second.running && first.stopped == second.stopped && first.exited == second.exited;
+    return first.running == second.running && first.stopped == second.stopped && first.exited == second.exited &&
+           first.died == second.died;
 }
 
 // The text with colours switched on and off in front of each word and null bytes behind it.
