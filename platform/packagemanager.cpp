@@ -34,13 +34,16 @@ QStringList PackageManager::getInstalledPackagesVersions(const QString &package)
     }
     if (query.exitStatus() != QProcess::NormalExit || query.exitCode() != 0)
         return {};
-    // A removed package whose configuration files were left is still in the database.
-    const QString installed{QStringLiteral("installed ")};
+    // A removed package whose configuration files were left is still in the database. One with triggers left to run is
+    // there whole.
+    static const QRegularExpression installed{
+        QStringLiteral("\\A(?:installed|triggers-awaited|triggers-pending) (.*)\\z")};
     const QStringList packages{QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char{'\n'})};
     QStringList versions;
     for (const QString &line : packages) {
-        if (line.startsWith(installed))
-            versions.append(line.mid(installed.size()));
+        const QRegularExpressionMatch match{installed.match(line)};
+        if (match.hasMatch())
+            versions.append(match.captured(1));
     }
     return versions;
 }

@@ -65,6 +65,8 @@ void PackageManagerTest::versionsOfInstalledPackages_data()
     QTest::addRow("removed, configuration left") << QStringLiteral("removed") << QStringList{};
     QTest::addRow("for one architecture, removed for another")
         << QStringLiteral("libmixed") << QStringList{QStringLiteral("3.0")};
+    QTest::addRow("with triggers to run") << QStringLiteral("triggered") << QStringList{QStringLiteral("4.0")};
+    QTest::addRow("waiting for triggers") << QStringLiteral("waiting") << QStringList{QStringLiteral("5.0")};
     QTest::addRow("half installed") << QStringLiteral("broken") << QStringList{};
     QTest::addRow("known by name only") << QStringLiteral("wanted") << QStringList{};
     QTest::addRow("unknown") << QStringLiteral("nonexistent") << QStringList{};
@@ -80,27 +82,31 @@ void PackageManagerTest::versionsOfInstalledPackages()
 {
     if (QStandardPaths::findExecutable(QStringLiteral("dpkg-query")).isEmpty())
         QSKIP("no dpkg-query on this machine");
-    const auto entry = [](const char *name, const char *status, const char *architecture, const char *version) {
+    const auto entry = [](const char *name, const char *status, const char *architecture, const char *version,
+                          const QByteArray &more = {}) {
         return QByteArrayLiteral("Package: ") + name + "\nStatus: " + status +
                "\nMaintainer: nobody <nobody@localhost>\nArchitecture: " + architecture +
                "\nMulti-Arch: same\nVersion: " + version + "\nDescription: of a test\n" +
                (QByteArray{status}.endsWith("config-files") ? QByteArrayLiteral("Config-Version: ") + version + "\n"
                                                             : QByteArray{}) +
-               "\n";
+               more + "\n";
     };
     write(QStringLiteral("arch"), "amd64\narm64\ni386\n");
     QVERIFY(QDir{m_folder->path()}.mkpath(QStringLiteral("updates")));
     QVERIFY(QDir{m_folder->path()}.mkpath(QStringLiteral("info")));
-    write(QStringLiteral("status"), entry("bind9", "install ok installed", "amd64", "1:9.18.28-1~deb12u2") +
-                                        entry("bind9-host", "install ok installed", "amd64", "9") +
-                                        entry("held", "hold ok installed", "amd64", "2.0") +
-                                        entry("libtwo", "install ok installed", "amd64", "1.5-1") +
-                                        entry("libtwo", "install ok installed", "i386", "1.5-1+b1") +
-                                        entry("removed", "deinstall ok config-files", "amd64", "1.0") +
-                                        entry("libmixed", "install ok installed", "amd64", "3.0") +
-                                        entry("libmixed", "deinstall ok config-files", "i386", "2.9") +
-                                        entry("broken", "install reinstreq half-installed", "amd64", "1.0") +
-                                        "Package: wanted\nStatus: install ok not-installed\nArchitecture: amd64\n\n");
+    write(QStringLiteral("status"),
+          entry("bind9", "install ok installed", "amd64", "1:9.18.28-1~deb12u2") +
+              entry("bind9-host", "install ok installed", "amd64", "9") +
+              entry("held", "hold ok installed", "amd64", "2.0") +
+              entry("libtwo", "install ok installed", "amd64", "1.5-1") +
+              entry("libtwo", "install ok installed", "i386", "1.5-1+b1") +
+              entry("removed", "deinstall ok config-files", "amd64", "1.0") +
+              entry("libmixed", "install ok installed", "amd64", "3.0") +
+              entry("libmixed", "deinstall ok config-files", "i386", "2.9") +
+              entry("triggered", "install ok triggers-pending", "amd64", "4.0", "Triggers-Pending: ldconfig\n") +
+              entry("waiting", "install ok triggers-awaited", "amd64", "5.0", "Triggers-Awaited: triggered\n") +
+              entry("broken", "install reinstreq half-installed", "amd64", "1.0") +
+              "Package: wanted\nStatus: install ok not-installed\nArchitecture: amd64\n\n");
     qputenv("DPKG_ADMINDIR", QFile::encodeName(m_folder->path()));
 
     QFETCH(const QString, package);
