@@ -32,9 +32,11 @@ QString ip(const QString &command)
 {
     QProcess process;
     process.start(QStringLiteral("ip"), command.split(QLatin1Char{' '}));
-    if (process.waitForFinished(-1) && process.exitCode() == 0)
+    const bool hasRun{process.waitForFinished(-1)};
+    if (hasRun && process.exitCode() == 0)
         return {};
-    return QStringLiteral("ip %1: %2").arg(command, QString::fromLocal8Bit(process.readAllStandardError()));
+    const QString reason{hasRun ? QString::fromLocal8Bit(process.readAllStandardError()) : process.errorString()};
+    return QStringLiteral("ip %1: %2").arg(command, reason);
 }
 
 } // namespace
