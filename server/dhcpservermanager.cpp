@@ -53,7 +53,7 @@ QString DhcpServerManager::stateText(ServerStates state)
 
 bool DhcpServerManager::isServerRunning() const { return m_state == Running; }
 
-bool DhcpServerManager::hasStartedServerDied() const { return m_wasStarted && m_state == Stopped && m_serverHasDied; }
+bool DhcpServerManager::hasStartedServerDied() const { return m_wasStarted && m_state == Stopped && m_unitHasFailed; }
 
 void DhcpServerManager::runServer()
 {
@@ -141,7 +141,7 @@ void DhcpServerManager::handleProcessFinished(int exitCode, QProcess::ExitStatus
 
 void DhcpServerManager::noteStop(const ServiceStatus &status)
 {
-    m_serverHasDied = status.died;
+    m_unitHasFailed = status.failed;
     m_unitIsActive = status.exited;
 }
 

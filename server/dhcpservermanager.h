@@ -47,8 +47,8 @@ public:
     static QString stateText(ServerStates state);
     bool isServerRunning() const;
     ServerStates state() const { return m_state; }
-    /// Whether the server has ended by itself although the service manager called the last operation, a start or
-    /// restart, a success.
+    /// Whether the server has died although the service manager called the last operation, a start or restart, a
+    /// success. An init script tells itself of a server that does not come up.
     bool hasStartedServerDied() const;
 
     /// While an error() is reported: the system's reason for it; empty where there is none.
@@ -113,7 +113,7 @@ private:
     std::unique_ptr<ServiceCommand> m_following; // the query of followState()
     bool m_followAgain{};                        // the service may have changed since that query began
     ServerStates m_state{Updating};
-    bool m_serverHasDied{}; // the service is stopped, which nobody asked for
+    bool m_unitHasFailed{}; // the service is stopped, which nobody asked for
     bool m_unitIsActive{};  // the service counts as stopped, but for the service manager it is active
     bool m_wasStarted{};    // by the last operation, as far as it is known to have worked
     QString m_errorReason;

@@ -23,7 +23,7 @@ ServiceStatus::ServiceStatus(const QByteArray &printed)
 {
     const QString text{plainText(printed)};
     exited = text.contains(QLatin1String{"Active: active (exited)"});
-    died = exited || text.contains(QLatin1String{"Active: failed"});
-    stopped = died || text.contains(QLatin1String{"Active: inactive (dead)"});
+    failed = text.contains(QLatin1String{"Active: failed"});
+    stopped = exited || failed || text.contains(QLatin1String{"Active: inactive (dead)"});
     running = text.contains(QLatin1String{"Active: active (running)"});
 }

@@ -11,5 +11,5 @@ struct ServiceStatus
     bool stopped{};
     bool running{};
     bool exited{}; ///< the init script has done its work, but no server is left; it counts as stopped
-    bool died{};   ///< stopped, and nobody asked for that: failed or exited
+    bool failed{}; ///< the server has died, or its unit could not be started
 };

@@ -15,19 +15,15 @@ struct Phrase
 };
 
 constexpr Phrase phrases[]{
-    {"Active: active (running)", &ServiceStatus::running},
-    {"Active: inactive (dead)", &ServiceStatus::stopped},
-    {"Active: failed", &ServiceStatus::stopped},
-    {"Active: active (exited)", &ServiceStatus::stopped},
-    {"Active: active (exited)", &ServiceStatus::exited},
-    {"Active: active (exited)", &ServiceStatus::died},
-    {"Active: failed", &ServiceStatus::died},
+    {"Active: active (running)", &ServiceStatus::running}, {"Active: inactive (dead)", &ServiceStatus::stopped},
+    {"Active: failed", &ServiceStatus::stopped},           {"Active: active (exited)", &ServiceStatus::stopped},
+    {"Active: active (exited)", &ServiceStatus::exited},   {"Active: failed", &ServiceStatus::failed},
 };
 
 bool areAlike(const ServiceStatus &first, const ServiceStatus &second)
 {
     return first.running == second.running && first.stopped == second.stopped && first.exited == second.exited &&
-           first.died == second.died;
+           first.failed == second.failed;
 }
 
 // The text with colours switched on and off in front of each word and null bytes behind it.
