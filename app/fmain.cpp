@@ -97,7 +97,6 @@ void FMain::setUpService()
     DhcpServerManager *manager{&m_service->manager()};
     connect(manager, &DhcpServerManager::error, this,
             [this, manager](const QString &message) { showError(message, manager->errorReason()); });
-    connect(m_service.get(), &ServiceControls::error, this, [this](const QString &message) { showError(message); });
     connect(manager, &DhcpServerManager::information, this, &FMain::showInformation);
     connect(manager, &DhcpServerManager::serverStateChanged, this, &FMain::handleServerStateChanged);
     manager->checkRunning();

@@ -79,10 +79,8 @@ void ServiceControls::watchStart(DhcpServerManager::ServerStates state)
 {
     if (std::exchange(m_lastState, state) == DhcpServerManager::Updating)
         m_settling.start();
-    if (!m_settling.isActive() || !m_manager->hasStartedServerDied())
-        return;
-    m_settling.stop();
-    emit error(QObject::tr("Operation with DHCP-server failed\n%1").arg(m_manager->serverStateText()));
+    if (m_settling.isActive())
+        m_manager->reportDeath();
 }
 
 void ServiceControls::chooseInterfaces()

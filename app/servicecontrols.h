@@ -32,10 +32,6 @@ public:
     void showState(DhcpServerManager::ServerStates state);
     void chooseInterfaces();
 
-signals:
-    /// The server has died soon after a start that the service manager called a success.
-    void error(const QString &message);
-
 private:
     void watchStart(DhcpServerManager::ServerStates state);
 

@@ -53,8 +53,6 @@ QString DhcpServerManager::stateText(ServerStates state)
 
 bool DhcpServerManager::isServerRunning() const { return m_state == Running; }
 
-bool DhcpServerManager::hasStartedServerDied() const { return m_wasStarted && m_state == Stopped && m_unitHasFailed; }
-
 void DhcpServerManager::runServer()
 {
     operate(QStringLiteral("start"), Running, [this] { emit information(QObject::tr("DHCP-server already running")); });
@@ -184,6 +182,12 @@ void DhcpServerManager::reportFailedOperation(const QString &detail)
 {
     m_wasStarted = false;
     report(QObject::tr("Operation with DHCP-server failed\n%1").arg(detail));
+}
+
+void DhcpServerManager::reportDeath()
+{
+    if (m_wasStarted && m_state == Stopped && m_unitHasFailed)
+        reportFailedOperation(serverStateText());
 }
 
 void DhcpServerManager::report(const QString &message, const QString &reason)

@@ -47,9 +47,9 @@ public:
     static QString stateText(ServerStates state);
     bool isServerRunning() const;
     ServerStates state() const { return m_state; }
-    /// Whether the server has died although the service manager called the last operation, a start or restart, a
-    /// success. An init script tells itself of a server that does not come up.
-    bool hasStartedServerDied() const;
+    /// Reports the last operation as failed if it was a start or restart that the service manager called a success, and
+    /// the server has died since. An init script tells itself of a server that does not come up.
+    void reportDeath();
 
     /// While an error() is reported: the system's reason for it; empty where there is none.
     const QString &errorReason() const { return m_errorReason; }
