@@ -11,7 +11,7 @@ class QTableView;
 
 /// The widths of the lease table's columns: what is visible is shown whole, whether it was scrolled to or has arrived
 /// by itself. A column that the user made wider or narrower stays so until its border is double-clicked; a text that is
-/// cut off then has a tool tip.
+/// cut off then has a tool tip. The rows' numbers keep the widest room that they have needed.
 class LeaseColumns final : public QObject
 {
     Q_OBJECT

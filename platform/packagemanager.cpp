@@ -36,14 +36,14 @@ QStringList PackageManager::getInstalledPackagesVersions(const QString &package)
         return {};
     // A removed package whose configuration files were left is still in the database. One with triggers left to run is
     // there whole.
-    static const QRegularExpression installed{
-        QStringLiteral("\\A(?:installed|triggers-awaited|triggers-pending) (.*)\\z")};
+    const QStringList installed{QStringLiteral("installed"), QStringLiteral("triggers-awaited"),
+                                QStringLiteral("triggers-pending")};
     const QStringList packages{QString::fromLatin1(query.readAllStandardOutput()).split(QLatin1Char{'\n'})};
     QStringList versions;
     for (const QString &line : packages) {
-        const QRegularExpressionMatch match{installed.match(line)};
-        if (match.hasMatch())
-            versions.append(match.captured(1));
+        const auto statusEnd = line.indexOf(QLatin1Char{' '});
+        if (installed.contains(line.left(statusEnd)))
+            versions.append(line.mid(statusEnd + 1));
     }
     return versions;
 }

@@ -65,6 +65,7 @@ private slots:
 
 private:
     std::unique_ptr<FMain> openWindow(const TestMachine &machine) const;
+    void change(TestMachine &machine, const FMain &window, FakeSystemctl::State state) const;
 
     std::unique_ptr<FakeServiceManager> m_bus;
 };
@@ -84,6 +85,15 @@ std::unique_ptr<FMain> ServiceStateTest::openWindow(const TestMachine &machine) 
     return window;
 }
 
+// Somebody else changes the service, which the window shows then, with all that it does about it.
+void ServiceStateTest::change(TestMachine &machine, const FMain &window, FakeSystemctl::State state) const
+{
+    machine.systemctl().setState(state);
+    m_bus->announce();
+    QTRY_COMPARE(shownState(window), state == FakeSystemctl::Running ? isRunning : isStopped);
+    QCoreApplication::processEvents();
+}
+
 void ServiceStateTest::followsWhatOthersDo()
 {
     TestMachine machine{FakeSystemctl::Running};
@@ -99,12 +109,8 @@ void ServiceStateTest::followsWhatOthersDo()
     QTRY_COMPARE(shownState(*window), isRunning);
     QVERIFY(machine.systemctl().verbs().contains(QStringLiteral("restart")));
 
-    machine.systemctl().setState(FakeSystemctl::Stopped);
-    m_bus->announce();
-    QTRY_COMPARE(shownState(*window), isStopped);
-    machine.systemctl().setState(FakeSystemctl::Running);
-    m_bus->announce();
-    QTRY_COMPARE(shownState(*window), isRunning);
+    change(machine, *window, FakeSystemctl::Stopped);
+    change(machine, *window, FakeSystemctl::Running);
     QCOMPARE(startOrStop(*window)->text(), QStringLiteral("Stop DHCP-server"));
 }
 
@@ -176,10 +182,7 @@ void ServiceStateTest::doesNotTakeStopForDeath()
     ModalBoxes boxes;
     startOrStop(*window)->trigger();
     QTRY_COMPARE(shownState(*window), isRunning);
-    machine.systemctl().setState(FakeSystemctl::Stopped); // by somebody else
-    m_bus->announce();
-    QTRY_COMPARE(shownState(*window), isStopped);
-    QCoreApplication::processEvents();
+    change(machine, *window, FakeSystemctl::Stopped);
 
     // A server that ends badly when it is told to end.
     startOrStop(*window)->trigger();
@@ -198,10 +201,7 @@ void ServiceStateTest::doesNotBlameStartForLaterDeath()
     startOrStop(*window)->trigger();
     QTRY_COMPARE(shownState(*window), isRunning);
     QTest::qWait(6000); // longer than a death is looked for
-    machine.systemctl().setState(FakeSystemctl::Failed);
-    m_bus->announce();
-    QTRY_COMPARE(shownState(*window), isStopped);
-    QCoreApplication::processEvents();
+    change(machine, *window, FakeSystemctl::Failed);
 }
 
 QTEST_MAIN(ServiceStateTest)
