@@ -80,7 +80,8 @@ void LeaseColumns::noteResized(int column)
         m_setByUser.insert(column);
 }
 
-// Never makes a column narrower, nor the rows' numbers: while the user scrolls or searches, the columns would dance.
+// Never makes a column narrower: while the user scrolls, the columns would dance. Nor the rows' numbers: when a search
+// finds nothing, there are none.
 void LeaseColumns::widen()
 {
     QHeaderView &numbers{*m_table->verticalHeader()};

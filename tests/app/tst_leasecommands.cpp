@@ -243,7 +243,7 @@ private slots:
     void leaseThatIsOnlyCurrentIsNotSelected_data();
     void leaseThatIsOnlyCurrentIsNotSelected();
     void columnsShowWhatIsScrolledTo();
-    void searchMovesNoColumn();
+    void searchKeepsTheRoomOfTheNumbers();
     void columnsShowWhatArrives_data();
     void columnsShowWhatArrives();
     void columnsAreTheUsersToDrag();
@@ -766,7 +766,7 @@ void LeaseCommandsTest::columnsShowWhatIsScrolledTo()
     QCOMPARE(site.table->columnWidth(DhcpdLeasesModel::HostName), wide);
 }
 
-void LeaseCommandsTest::searchMovesNoColumn()
+void LeaseCommandsTest::searchKeepsTheRoomOfTheNumbers()
 {
     writeTestFile(paths::leases(), manyLeases(10'000) + lease("10.0.99.1", "only"));
     const Site site{*m_machine};
